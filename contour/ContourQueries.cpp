@@ -1,0 +1,54 @@
+#include "gmkernel/GmArc.h"
+#include "gmkernel/GmContour.h"
+#include "gmkernel/GmLine.h"
+#include "gmkernel/GmRect.h"
+#include "gmkernel/GmStretch.h"
+
+namespace {
+
+bool SameElement(GmCurve const& a, GmCurve const& b) {
+    if (a.GetType() != b.GetType()) return false;
+    if (a.IsStretch()) {
+        return static_cast<GmStretch const&>(a) == static_cast<GmStretch const&>(b);
+    }
+    return a.IsArc() && static_cast<GmArc const&>(a) == static_cast<GmArc const&>(b);
+}
+
+}  // namespace
+
+GmRect GmContour::BoundingRect() const {
+    GmRect box;
+    for (int i = 0; i < ElementCount(); ++i) {
+        box = box.Or(GetElement(i)->BoundingRect());
+    }
+    return box;
+}
+
+bool GmContour::Element(GmPoint const& p, double eps) const {
+    for (int i = 0; i < ElementCount(); ++i) {
+        if (GetElement(i)->Element(p, eps)) return true;
+    }
+    return false;
+}
+
+bool GmContour::Element(GmPoint const& p) const {
+    return Element(p, m_scdPrec);
+}
+
+GmLine GmContour::Tangent(GmPoint const& p) const {
+    GmCurve const* const element = GetElement(LastPointElem(p));
+    return element ? element->Tangent(p) : GmLine();
+}
+
+GmCurve* GmContour::GetParallel(double) const {
+    return nullptr;
+}
+
+bool GmContour::operator==(GmContour const& other) const {
+    if (this == &other) return true;
+    if (ElementCount() != other.ElementCount()) return false;
+    for (int i = 0; i < ElementCount(); ++i) {
+        if (!SameElement(*GetElement(i), *other.GetElement(i))) return false;
+    }
+    return true;
+}

@@ -1,0 +1,43 @@
+#include "contour/offset/PieceBox.h"
+
+#include "gmkernel/GmArc.h"
+#include "gmkernel/GmRect.h"
+
+namespace gmkernel_detail {
+
+namespace {
+
+/// Twice the membership tolerance of arcs, in length units.
+constexpr double REACH_MARGIN = 0.02;
+
+/// Does the arc's membership test accept points all around the circle? Arcs whose ends are equal
+/// within the point tolerance count as full circles there, whatever their sweep.
+bool reachesAround(GmArc const& arc) {
+    const bool hasSense = arc.Dir() == GmBase::eRotCW || arc.Dir() == GmBase::eRotCCW;
+    return !hasSense || arc.SP() == arc.EP();
+}
+
+/// The point of the circle at a stored angle. Angles next to an axis are stored as the axis, so
+/// that on large circles this point differs from the end point.
+GmPoint atAngle(GmArc const& arc, double degrees) {
+    return GmPoint(arc.M() + arc.R() * GmVec(GmDir(GmAngle(degrees, false))));
+}
+
+GmRect arcReach(GmArc const& arc) {
+    GmRect box = arc.BoundingRect();
+    if (reachesAround(arc)) box = box.Or(arc.GmCircle::BoundingRect());
+    box.Include(atAngle(arc, arc.SAngDeg()));
+    box.Include(atAngle(arc, arc.EAngDeg()));
+    return box;
+}
+
+}  // namespace
+
+PieceBox reachOf(GmCurve const& piece) {
+    const GmRect box =
+        piece.IsArc() ? arcReach(static_cast<GmArc const&>(piece)) : piece.BoundingRect();
+    return {box.Left() - REACH_MARGIN, box.Right() + REACH_MARGIN, box.Bottom() - REACH_MARGIN,
+            box.Top() + REACH_MARGIN};
+}
+
+}  // namespace gmkernel_detail

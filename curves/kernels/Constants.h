@@ -1,0 +1,7 @@
+#pragma once
+
+namespace gmkernel_detail {
+
+constexpr double PI = 3.14159265358979323846;
+
+}  // namespace gmkernel_detail

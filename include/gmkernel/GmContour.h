@@ -1,0 +1,279 @@
+/// @file
+/// The contour: a chain of segments and arcs.
+#pragma once
+
+#include <boost/operators.hpp>
+#include <string>
+
+#include "gmkernel/GmContElement.h"
+#include "gmkernel/GmCurve.h"
+#include "gmkernel/GmPoint.h"
+#include "gmkernel/KxArray.h"
+#include "gmkernel/export.h"
+
+class GmContourArray;
+
+/// A chain of segments and arcs in which every element starts where the previous one ends.
+///
+/// Every joint is continuous within m_scdPrec per coordinate; the contour is closed when the last
+/// element ends where the first one starts. It is built element by element with AddElement().
+/// Elements are meant to be GmStretch and GmArc objects; other curves are appended when they pass
+/// the same tests, but only segments and arcs are copied by GetNewElement(), offset or compared.
+///
+/// A contour answers SP(), EP(), TangSP(), TangEP() and Length() with the defaults of GmCurve (an
+/// undefined point or direction, 0), and Trim() and Concat() do nothing: ask the first or the last
+/// element.
+///
+/// Sub-contours are the results that operations such as offsetting leave in the contour. Each such
+/// operation replaces the whole list; walk it with GetSubContour(0), GetSubContour(1), ... until it
+/// answers null.
+///
+/// Ownership: the contour owns its elements, their records and its sub-contours. Pointers that it
+/// hands out stay owned by it and die with the element or sub-contour; GetNewElement() and Clone()
+/// hand out new objects that the caller owns. Element indices run from 0 to ElementCount()-1; an
+/// index outside answers null or changes nothing.
+///
+/// Unless said otherwise a query costs time linear in the number of elements, and it writes the
+/// solution lists of the elements: one contour must not be used from two threads at once.
+class GMKERNEL_EXPORT GmContour : public GmCurve,
+                                  private boost::equality_comparable<GmContour, GmContour> {
+public:
+    /// An empty open contour without sub-contours, created.
+    GmContour();
+    /// Copies creation flag, tag and solution list, and clones the elements as if each was appended
+    /// without validation: the copies have identifier 0, are not marked as inserted and are
+    /// indexed by position; the closed flag is what the appending gives. Sub-contours and the last
+    /// insert point are not copied. Of a chain that is broken (by RemoveElement(), or through the
+    /// element pointers) the elements that do not join are left out.
+    GmContour(GmContour const& source);
+    /// Deletes the elements and the sub-contours.
+    ~GmContour() override;
+    /// Makes this contour an independent copy: the elements as in the copy constructor, with
+    /// creation flag, solution list, last insert point and closed flag of the source. Earlier
+    /// elements and sub-contours are deleted, the type tag stays. Nothing when assigned to itself;
+    /// the source may be one of this contour's own sub-contours.
+    GmContour& operator=(GmContour const& source);
+
+    /// A new heap copy made by the copy constructor; the caller owns it.
+    GmContour* Clone() const override;
+    /// The union of the elements' bounding rectangles; undefined without elements.
+    GmRect BoundingRect() const override;
+    /// Reverses the chain: the elements in reverse order, each running the other way. Records keep
+    /// their identifier, index and mark; the closed flag stays. Inverting twice restores the chain.
+    void Invert() override;
+    /// Does some element contain the point within `eps` (length units)?
+    bool Element(GmPoint const& p, double eps) const override;
+    /// Element(p, m_scdPrec).
+    bool Element(GmPoint const& p) const override;
+    /// The smallest distance of an element from the point; 1e30 without elements.
+    double Dist(GmPoint const& p) const override;
+    /// The point of the contour nearest to `p`; of equally near elements the first one answers.
+    /// Without elements, and when no distance is a finite number, undefined.
+    /// @param d receives the distance, the largest double where there is none
+    /// @param p the point
+    /// @param bPreferSP as for the elements: leaves their end points out of the search
+    GmPoint MinDist(double& d, GmPoint const& p, bool bPreferSP) const override;
+    /// The point of the contour nearest to the curve `c`, which may be a contour: the nearest of
+    /// all pairs of elements, the first of equal ones. Undefined when there is none or `c` is null.
+    /// Cost: elements times elements of `c`. Crossings are not looked for.
+    /// @param d receives the distance, the largest double where there is none
+    /// @param c the other curve
+    /// @param bPreferSP not used, end points always take part
+    GmPoint MinDist(double& d, GmCurve const* c, bool bPreferSP) const override;
+    /// Not provided for contours: an undefined point.
+    GmPoint MinDist(GmPoint const& p, bool bPreferSP) const override;
+    /// True when the point lies strictly inside the closed chain, by the parity of the crossings
+    /// with a segment from the point through the middle of the first element. False on the contour,
+    /// outside the bounding rectangle and without elements. The segment reaches only as far beyond
+    /// that middle as the point lies before it, so the answer is meant for shapes which it leaves.
+    /// Replaces the solution list.
+    bool In(GmPoint const& p) override;
+    /// True when the point is neither on the contour nor In(), true without elements.
+    bool Out(GmPoint const& p) override;
+    /// Not provided for contours: an undefined point.
+    GmPoint NP(GmPoint const& p) const override;
+    /// The tangent line of the last element that contains the point, see LastPointElem(); an
+    /// undefined line for a point off the contour.
+    GmLine Tangent(GmPoint const& p) const override;
+    /// Not provided for contours, null: see Offsetting().
+    GmCurve* GetParallel(double d) const override;
+    /// Moves every element; sub-contours, solution list and last insert point stay.
+    void Translation(GmVec const& v) override;
+    /// Transforms every element; sub-contours, solution list and last insert point stay.
+    void Transform(GmMatrix const& m) override;
+    /// An empty string.
+    std::string GetTraceString() const override;
+
+    using GmCurve::Intersection;
+    /// Intersects this contour with another one; the points replace this contour's solution list.
+    /// Cost: elements times elements. A null contour gives no points.
+    /// @param other the other contour, may be this one
+    /// @param bAtEnds false: only points that are no end of either element involved count;
+    ///        true: points at ends count too, each joint once
+    /// @return the number of points
+    virtual int Intersection(GmContour const* other, bool bAtEnds) const;
+    /// Intersects this contour with any curve and leaves the points in the solution list, in the
+    /// order of the elements; a crossing at a joint is listed once. A null curve gives no points.
+    /// @throw std::runtime_error "Function not found" for a curve that cannot be intersected (a
+    ///        helix or a rectangle); the list is empty then
+    void IntersectionWithCurve(GmCurve const* c) const;
+
+    /// True for the same contour, and for chains of equal count whose elements are pairwise of the
+    /// same kind and equal by GmStretch's or GmArc's operator==. Closed flag, identifiers,
+    /// sub-contours and solution lists are not compared.
+    bool operator==(GmContour const& other) const;
+
+    /// Number of elements. Constant cost.
+    long ElementCount() const;
+    /// The curve of an element, owned by the contour; null for an index outside. Changing its ends
+    /// can break the chain.
+    GmCurve* GetElement(int index);
+    GmCurve const* GetElement(int index) const;
+    /// The record of an element, owned by the contour; null for an index outside.
+    GmContElement* GetContElement(int index);
+    GmContElement const* GetContElement(int index) const;
+    /// A new copy of an element that the caller owns; null for an index outside and for an element
+    /// that is neither a segment nor an arc.
+    GmCurve* GetNewElement(int index) const;
+    /// A sub-contour, owned by this contour; null for an index outside.
+    GmContour* GetSubContour(int index);
+    GmContour const* GetSubContour(int index) const;
+    /// The sub-contour whose bounding rectangle encloses those of all others; null when there is
+    /// none. Sub-contours without elements are passed over.
+    GmContour* GetMaxSubContour();
+    /// The sub-contour whose start is nearest to the point, the first of equally near ones; null
+    /// without sub-contours. Sub-contours without elements are passed over.
+    GmContour* GetNearSubContour(GmPoint const& p);
+    /// Does the chain end where it starts? Set by appending, re-evaluated by inserting; removing
+    /// elements leaves it as it was.
+    bool IsClosed() const;
+    /// Not provided: false for every contour.
+    bool Convex() const;
+    bool Concave() const;
+    /// The point at which the contour was last split, undefined when it never was.
+    GmPoint GetLastInsertPoint();
+
+    /// Appends a clone of the curve; the caller keeps its own.
+    ///
+    /// The curve must start at the end of the chain (any curve fits an empty contour). When it
+    /// ends at the start of the chain the contour becomes closed; a first element never closes it.
+    ///
+    /// With validation a closed contour refuses the curve, and the curve may meet the chain only
+    /// at its own start and, when it closes the contour, at its end. The validation costs an
+    /// intersection with every element and replaces the solution list, also on refusal. The
+    /// closed flag outlives removed elements: such a contour still refuses.
+    /// @param c the curve; null is refused
+    /// @param bValidate with the tests against the whole contour
+    /// @param id identifier stored with the element
+    /// @return false when the curve is refused and nothing was appended
+    /// @throw std::runtime_error "Function not found" with validation, for a curve that cannot be
+    ///        intersected
+    bool AddElement(GmCurve const* c, bool bValidate, long id);
+    bool AddElement(GmCurve const& c, bool bValidate, long id);
+    /// The same with a record from the heap, which is taken over with its curve and keeps its
+    /// fields. On false, and when an exception leaves, the caller still owns both.
+    bool AddElement(GmContElement* element, bool bValidate);
+    /// Deletes an element. The neighbours are not joined and the closed flag stays.
+    void RemoveElement(int index);
+    /// Deletes the elements marked as inserted from the end of the chain, back to the first one
+    /// that is not; element 0 always stays.
+    void RemoveInsertedElementsAtBack();
+    /// A copy that is inverted; like every copy it has the identifiers 0.
+    GmContour Inverted() const;
+    /// Appends a segment with identifier 0 from the end of the chain to its start unless they meet
+    /// already. Validation may refuse the segment; the contour then stays open. Nothing happens
+    /// without elements.
+    void Close(bool bValidate);
+
+    /// The point of the contour nearest to `p`; among points equally near to it (within 1e-4) one
+    /// that is clearly nearer to `q` (by 1e-4 in squared distance). End points of elements are left
+    /// out of the search, see GmCurve::MinDist(). Undefined without elements.
+    /// @param d receives the distance, -1 without elements
+    /// @param p the point
+    /// @param q the point that breaks ties
+    /// @param bPreferSP not used
+    GmPoint MinDist(double& d, GmPoint const& p, GmPoint const& q, bool bPreferSP);
+    /// The element start nearest to the point; a later one counts only when nearer by more than
+    /// 1e-4. The end of an open chain is no candidate. Undefined without elements.
+    GmPoint NearPoint(GmPoint const& p);
+    /// The index of the element whose start NearPoint() answers; -1 without elements.
+    int NearPointElem(GmPoint const& p);
+    /// The index of the element whose start is nearest to `p`, compared in squared distances: of
+    /// starts equally near within 1e-4 the last one, except that one nearer to `q` by 1e-4 or more
+    /// than the choice so far is passed over. -1 without elements.
+    int NearPointElem(GmPoint const& p, GmPoint const& q);
+    /// The element end farthest from the point, or the start of the chain; a later one counts only
+    /// when farther by more than 1e-4. Undefined without elements.
+    GmPoint FarPoint(GmPoint const& p);
+    /// The highest index of an element that contains the point with the element's own default
+    /// tolerance (0.01 for arcs); -1 for a point off the contour.
+    int LastPointElem(GmPoint const& p) const;
+    /// The sense of rotation: the sign of the area of the polygon over the joints and some points
+    /// of each arc, closed if the chain is open, summed as seen from the point `r`. An area of
+    /// exactly 0 is tried once more from the start of the chain; still 0, or no elements, is
+    /// eRotNone.
+    eRotDir Dir(GmPoint const& r);
+
+    /// Computes the contours at the constant distance `d` beside the contour, positive to the
+    /// right of the direction of travel, and stores them as sub-contours in place of earlier ones.
+    ///
+    /// Corners that open away from the offset side are rounded by arcs of radius |d|; what would
+    /// come closer than |d| to the contour is cut away, so that one contour may yield several
+    /// results or none. A distance below m_scdPrec in magnitude stores a copy. The elements of this
+    /// contour are not changed. Cost: the number of elements times the number of pieces in the
+    /// span, twice.
+    /// @param d the distance in length units
+    /// @param nSpan how many of the most recent elements a piece is cut by and tested against
+    /// @param bKeepOpen keeps open results of a closed contour that is offset to its inside;
+    ///        otherwise such results are dropped and the span counts as unbounded
+    /// @return the number of sub-contours
+    int Offsetting(double d, int nSpan, bool bKeepOpen);
+    /// Offsetting(d, 1000000, false); the bools are not used.
+    int ParallelContours(double d, bool, bool, bool);
+    /// Offsets element by element and trims neighbours to their crossing, without any test for
+    /// distance; elements that vanish are left out, and the joint of last and first element is not
+    /// trimmed. The result replaces the sub-contours, also when there is none.
+    /// @return 1, or 0 with no sub-contour when neighbours do not cross
+    int SimpleOffsetting(double d);
+
+protected:
+    /// Empties the contour: elements, sub-contours, last insert point, closed flag.
+    void InitAll();
+    /// Deletes all elements; the closed flag stays.
+    void RemoveAllElements();
+    /// Deletes all sub-contours.
+    void RemoveAllSubConts();
+    /// The tests of AddElement(). Sets the closed flag when the curve passes and closes the
+    /// contour; with validation and elements it replaces the solution list.
+    bool AppendElementValid(GmCurve const* c, bool bValidate);
+    /// A new record that owns the curve; the caller owns the record.
+    static GmContElement* CreateContElement(GmCurve* c, long id, long index, bool bInserted);
+    /// Inserts a clone of the curve before the element `index`, marked as inserted, and sets the
+    /// closed flag by whether the chain now ends where it starts. The joints at the new element are
+    /// not tested. With validation the tests of AppendElementValid() must pass first. False for an
+    /// index outside 0..ElementCount() and for null.
+    bool InsertElem(int index, GmCurve const* c, bool bValidate, long id);
+    /// Appends a clone of the curve without validation unless its ends coincide; false when nothing
+    /// was appended. Identifier 0, or the one given.
+    bool AddRealElem(GmCurve* c);
+    bool AddRealElem(GmCurve* c, long id);
+    /// Is the chain continuous and, when the closed flag is set, closed? True without elements.
+    bool CheckContour();
+    /// The middle point of an element; undefined for an index outside and for an element that is
+    /// neither a segment nor an arc.
+    GmPoint GetHP(int index);
+
+    KxArray<GmContElement*, GmContElement*>* m_pElements;  ///< the chain; owned with its records
+    bool m_bClosed;                                        ///< see IsClosed()
+    GmContourArray* m_pSubConts;                           ///< the sub-contours; owned with them
+    GmPoint m_LastInsertPoint;                             ///< see GetLastInsertPoint()
+
+private:
+    GmContour* GetSubContour_private(int index) const;
+    /// Replaces the sub-contours by one copy of this chain that keeps the identifiers.
+    void CopyContourToSubContour();
+};
+
+/// Hook for diagnostics of a contour's elements; does nothing.
+GMKERNEL_EXPORT void GmTraceContourElements(GmContour const* contour, std::string const& title,
+                                            std::string const& text);

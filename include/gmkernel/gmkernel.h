@@ -1,0 +1,21 @@
+/// @file
+/// The whole public interface of gmkernel in one include.
+#pragma once
+
+#include "gmkernel/GmAngle.h"
+#include "gmkernel/GmArc.h"
+#include "gmkernel/GmBase.h"
+#include "gmkernel/GmBeam.h"
+#include "gmkernel/GmCircle.h"
+#include "gmkernel/GmContElement.h"
+#include "gmkernel/GmContour.h"
+#include "gmkernel/GmCurve.h"
+#include "gmkernel/GmDir.h"
+#include "gmkernel/GmLine.h"
+#include "gmkernel/GmMatrix.h"
+#include "gmkernel/GmPoint.h"
+#include "gmkernel/GmRect.h"
+#include "gmkernel/GmStretch.h"
+#include "gmkernel/GmVec.h"
+#include "gmkernel/KxArray.h"
+#include "gmkernel/export.h"

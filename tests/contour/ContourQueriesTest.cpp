@@ -1,0 +1,227 @@
+#include <gtest/gtest.h>
+#include <rapidcheck.h>
+
+#include <algorithm>
+#include <cmath>
+#include <limits>
+
+#include "gmkernel/GmArc.h"
+#include "gmkernel/GmContour.h"
+#include "gmkernel/GmLine.h"
+#include "gmkernel/GmRect.h"
+#include "gmkernel/GmStretch.h"
+#include "support/Contours.h"
+
+namespace {
+
+constexpr double kLargest = std::numeric_limits<double>::max();
+
+GmPoint RandomPoint() {
+    return GmPoint(*rc::gen::inRange(-200, 200) * 0.1, *rc::gen::inRange(-200, 200) * 0.1);
+}
+
+double NearestSample(GmContour const& contour, GmPoint const& p) {
+    double nearest = kLargest;
+    for (GmPoint const& sample : shapes::Samples(contour, 60)) {
+        nearest = std::min(nearest, sample.Dist(p));
+    }
+    return nearest;
+}
+
+}  // namespace
+
+TEST(ContourQueries, AnEmptyContourAnswersTheDefaults) {
+    GmContour empty;
+    const GmPoint p(1, 2);
+    double d = 0;
+    EXPECT_EQ(empty.Dist(p), 1e30);
+    EXPECT_FALSE(empty.MinDist(d, p, false).CreationOK());
+    EXPECT_EQ(d, kLargest);
+    EXPECT_FALSE(empty.MinDist(d, &empty, false).CreationOK());
+    EXPECT_EQ(d, kLargest);
+    EXPECT_FALSE(empty.MinDist(d, p, p, false).CreationOK());
+    EXPECT_EQ(d, -1.0);
+    EXPECT_FALSE(empty.NearPoint(p).CreationOK() || empty.FarPoint(p).CreationOK());
+    EXPECT_EQ(empty.NearPointElem(p), -1);
+    EXPECT_EQ(empty.NearPointElem(p, p), -1);
+    EXPECT_EQ(empty.LastPointElem(p), -1);
+    EXPECT_FALSE(empty.Element(p) || empty.In(p));
+    EXPECT_TRUE(empty.Out(p));
+    EXPECT_EQ(empty.Dir(p), GmBase::eRotNone);
+    EXPECT_FALSE(empty.BoundingRect().CreationOK() || empty.Tangent(p).CreationOK());
+}
+
+TEST(ContourQueries, MinDistIsTheDistanceOfAPointOfTheContour) {
+    rc::check([](unsigned seed) {
+        const GmPoint p = RandomPoint();
+        const double scaleOfSampling = 0.05;  // a sample lies within this of every point of a star
+        for (auto const& variant : shapes::Variants(shapes::RandomStar(seed, true))) {
+            const GmPoint mapped = variant.Map(p);
+            double d = 0;
+            const GmPoint foot = variant.contour.MinDist(d, mapped, false);
+            RC_ASSERT(std::fabs(d - foot.Dist(mapped)) < 1e-9 * (1 + d));
+            RC_ASSERT(variant.contour.Element(foot, 0.001));
+            const double sampled = NearestSample(variant.contour, mapped);
+            RC_ASSERT(d <= sampled + 1e-9);
+            const double reach = scaleOfSampling * variant.scale;
+            RC_ASSERT(sampled * sampled <= d * d + 2 * d * reach + 4 * reach * reach);
+        }
+    });
+}
+
+TEST(ContourQueries, DistOfASquare) {
+    const GmContour square = shapes::Square(10);
+    EXPECT_DOUBLE_EQ(square.Dist(GmPoint(5, -3)), 3);
+    double d = 0;
+    EXPECT_EQ(square.MinDist(d, GmPoint(5, -3), false), GmPoint(5, 0));
+    EXPECT_DOUBLE_EQ(d, 3);
+    EXPECT_EQ(square.MinDist(d, GmPoint(5, 5), false), GmPoint(5, 0)) << "the first of equal ones";
+    EXPECT_FALSE(square.MinDist(GmPoint(5, -3), false).CreationOK());
+    EXPECT_FALSE(square.NP(GmPoint(5, -3)).CreationOK());
+}
+
+TEST(ContourQueries, MinDistPrefersThePointNearerToASecondOne) {
+    GmContour square = shapes::Square(10);
+    double d = 0;
+    EXPECT_EQ(square.MinDist(d, GmPoint(5, 5), GmPoint(5, 20), false), GmPoint(5, 10));
+    EXPECT_DOUBLE_EQ(d, 5);
+    EXPECT_EQ(square.MinDist(d, GmPoint(5, 5), GmPoint(20, 5), false), GmPoint(10, 5));
+    EXPECT_EQ(square.MinDist(d, GmPoint(5, 5), GmPoint(5, 5), false), GmPoint(5, 0));
+    EXPECT_EQ(square.MinDist(d, GmPoint(5, 4.9), GmPoint(5, 20), false), GmPoint(5, 0));
+}
+
+TEST(ContourQueries, MinDistToACurveIsTheSameFromBothContours) {
+    const GmContour square = shapes::Square(10);
+    const GmStretch segment(GmPoint(12, 5), GmPoint(20, 5));
+    double d = 0;
+    EXPECT_EQ(square.MinDist(d, &segment, true), GmPoint(10, 5));
+    EXPECT_DOUBLE_EQ(d, 2);
+    rc::check([](unsigned seedA, unsigned seedB) {
+        const GmContour a = shapes::RandomStar(seedA, true);
+        GmContour b = shapes::RandomStar(seedB, true);
+        b.Translation(GmVec(25, 3, 0));
+        double ab = 0;
+        double ba = 0;
+        const GmPoint onA = a.MinDist(ab, &b, false);
+        const GmPoint onB = b.MinDist(ba, &a, false);
+        RC_ASSERT(std::fabs(ab - ba) < 1e-9);
+        RC_ASSERT(std::fabs(b.Dist(onA) - ab) < 1e-6 && std::fabs(a.Dist(onB) - ab) < 1e-6);
+    });
+}
+
+TEST(ContourQueries, NearestAndFarthestVertices) {
+    GmContour square = shapes::Square(10);
+    EXPECT_EQ(square.NearPoint(GmPoint(9.99995, 0)), GmPoint(10, 0));
+    EXPECT_EQ(square.NearPointElem(GmPoint(5, 0)), 0) << "the first of equally near starts";
+    EXPECT_EQ(square.NearPointElem(GmPoint(5.0001, 0)), 1);
+    GmContour open = shapes::Polyline({GmPoint(0, 0), GmPoint(10, 0), GmPoint(10, 10)});
+    EXPECT_EQ(open.NearPoint(GmPoint(10, 11)), GmPoint(10, 0)) << "the last end is no candidate";
+    EXPECT_EQ(open.FarPoint(GmPoint(0, 0)), GmPoint(10, 10));
+    EXPECT_EQ(open.FarPoint(GmPoint(10, 10)), GmPoint(0, 0));
+}
+
+TEST(ContourQueries, ATieBetweenStartsGoesToTheLaterUnlessItIsNearerToTheSecondPoint) {
+    GmContour square = shapes::Square(10);
+    const GmPoint middle(5, 5);
+    EXPECT_EQ(square.NearPointElem(middle, middle), 3);
+    EXPECT_EQ(square.NearPointElem(middle, GmPoint(-1, 11)), 2);
+    EXPECT_EQ(square.NearPointElem(middle, GmPoint(11, 11)), 0);
+    EXPECT_EQ(square.NearPointElem(GmPoint(9, 9), GmPoint(0, 0)), 2);
+}
+
+TEST(ContourQueries, AJointBelongsToTheLaterElement) {
+    const GmContour square = shapes::Square(10);
+    EXPECT_EQ(square.LastPointElem(GmPoint(10, 0)), 1);
+    EXPECT_EQ(square.LastPointElem(GmPoint(0, 0)), 3);
+    EXPECT_EQ(square.LastPointElem(GmPoint(5, 1)), -1);
+    EXPECT_TRUE(square.Element(GmPoint(5, 0.00009)));
+    EXPECT_FALSE(square.Element(GmPoint(5, 0.0002)));
+    EXPECT_TRUE(square.Element(GmPoint(5, 0.4), 0.5));
+    EXPECT_EQ(square.Tangent(GmPoint(10, 0)).Dir(), GmDir(0, 1, 0));
+    const GmContour slot = shapes::Slot(10, 2);
+    EXPECT_EQ(slot.LastPointElem(GmPoint(12.005, 2)), 1) << "arcs have their own tolerance";
+    EXPECT_EQ(slot.Tangent(GmPoint(12, 2)).Dir(), GmDir(0, 1, 0));
+}
+
+TEST(ContourQueries, InAndOutOfASquare) {
+    GmContour square = shapes::Square(10);
+    EXPECT_TRUE(square.In(GmPoint(5, 5)) && !square.Out(GmPoint(5, 5)));
+    EXPECT_TRUE(!square.In(GmPoint(20, 5)) && square.Out(GmPoint(20, 5)));
+    EXPECT_FALSE(square.In(GmPoint(10, 5)) || square.Out(GmPoint(10, 5)));
+}
+
+TEST(ContourQueries, TheMiddleOfAStarIsInAndPointsFarAwayAreOut) {
+    rc::check([](unsigned seed, bool bWithArcs) {
+        for (auto variant : shapes::Variants(shapes::RandomStar(seed, bWithArcs))) {
+            const GmPoint middle = variant.Map(GmPoint(0, 0));
+            RC_ASSERT(variant.contour.In(middle) && !variant.contour.Out(middle));
+            const GmPoint away = variant.Map(GmPoint(11, 11));
+            RC_ASSERT(!variant.contour.In(away) && variant.contour.Out(away));
+            const GmPoint joint = variant.contour.GetElement(2)->EP();
+            RC_ASSERT(!variant.contour.In(joint) && !variant.contour.Out(joint));
+        }
+    });
+}
+
+TEST(ContourQueries, TheSenseOfRotationIsTheSameFromEveryPoint) {
+    rc::check([](unsigned seed, bool bWithArcs) {
+        const GmPoint p = RandomPoint();
+        for (auto variant : shapes::Variants(shapes::RandomStar(seed, bWithArcs))) {
+            const auto sense = variant.bReversed ? GmBase::eRotCW : GmBase::eRotCCW;
+            RC_ASSERT(variant.contour.Dir(variant.Map(p)) == sense);
+            variant.contour.RemoveElement(static_cast<int>(variant.contour.ElementCount()) - 1);
+            GmContour open(variant.contour);
+            RC_ASSERT(!open.IsClosed());
+            RC_ASSERT(open.Dir(variant.Map(p)) == sense);
+        }
+    });
+}
+
+TEST(ContourQueries, TheSenseOfArcsCountsWhereTheJointsEncloseNothing) {
+    for (const auto sense : {GmBase::eRotCW, GmBase::eRotCCW}) {
+        GmContour circle;
+        const GmPoint left(-2, 0);
+        const GmPoint right(2, 0);
+        circle.AddElement(GmArc(right, left, GmPoint(0, 0), sense), false, 0);
+        circle.AddElement(GmArc(left, right, GmPoint(0, 0), sense), false, 0);
+        EXPECT_TRUE(circle.IsClosed());
+        EXPECT_EQ(circle.Dir(GmPoint(7, 3)), sense);
+    }
+    GmContour flat = shapes::Polygon({GmPoint(0, 0), GmPoint(8, 0)});
+    EXPECT_EQ(flat.Dir(GmPoint(0, 0)), GmBase::eRotNone);
+    EXPECT_EQ(flat.Dir(GmPoint(4, 0)), GmBase::eRotNone);
+    GmContour noHeight;
+    const double inf = std::numeric_limits<double>::infinity();
+    noHeight.AddElement(GmStretch(GmPoint(0, 0, inf), GmPoint(1, 0, inf)), false, 0);
+    EXPECT_EQ(noHeight.Dir(GmPoint(0, 0)), GmBase::eRotNone) << "the start equals no point";
+}
+
+TEST(ContourQueries, TheBoxIsTheSmallestAroundTheContour) {
+    rc::check([](unsigned seed) {
+        for (auto const& variant : shapes::Variants(shapes::RandomStar(seed, true))) {
+            const GmRect box = variant.contour.BoundingRect();
+            GmRect sampled;
+            for (GmPoint const& p : shapes::Samples(variant.contour, 60))
+                sampled.Include(p);
+            RC_ASSERT(box.Or(sampled) == box);
+            RC_ASSERT(box.Width() - sampled.Width() < 0.01 * variant.scale);
+            RC_ASSERT(box.Height() - sampled.Height() < 0.01 * variant.scale);
+        }
+    });
+}
+
+TEST(ContourQueries, MovingAndTransformingKeepTheChain) {
+    rc::check([](unsigned seed) {
+        const GmContour star = shapes::RandomStar(seed, true);
+        for (auto const& variant : shapes::Variants(star)) {
+            RC_ASSERT(variant.contour.IsClosed());
+            const double length = shapes::ChainLength(star) * variant.scale;
+            RC_ASSERT(std::fabs(shapes::ChainLength(variant.contour) - length) < 1e-6 * length);
+            GmContour moved(variant.contour);
+            moved.Translation(GmVec(3, -4, 0));
+            RC_ASSERT(moved != variant.contour);
+            moved.Translation(GmVec(-3, 4, 0));
+            RC_ASSERT(moved == variant.contour);
+        }
+    });
+}

@@ -1,0 +1,92 @@
+#include "gmkernel/KxArray.h"
+
+#include <gtest/gtest.h>
+#include <rapidcheck.h>
+
+#include <vector>
+
+namespace {
+
+using Pointers = KxArray<int*, int*>;
+
+struct OpenArray : Pointers {
+    int Capacity() const { return m_nMaxSize; }
+};
+
+int g_values[64];
+
+std::vector<int*> Content(Pointers const& array) {
+    std::vector<int*> content;
+    for (int i = 0; i < array.GetSize(); ++i)
+        content.push_back(array[i]);
+    return content;
+}
+
+}  // namespace
+
+TEST(KxArray, GrowsByTheStepOrToTheSizeNeeded) {
+    struct Row {
+        int size, growBy, newSize, capacity;
+    };
+    const Row rows[] = {{0, 0, 1, 1},    {16, 0, 17, 20},   {40, 0, 41, 45},
+                        {40, 0, 45, 45}, {40, 0, 100, 100}, {16000, 0, 16001, 17024},
+                        {40, 7, 41, 47}, {40, -5, 41, 41},  {40, 0, 20, 40}};
+    for (Row const& row : rows) {
+        OpenArray array;
+        array.SetSize(row.size, row.growBy);
+        array.SetSize(row.newSize);
+        EXPECT_EQ(array.GetSize(), row.newSize);
+        EXPECT_EQ(array.Capacity(), row.capacity) << row.size << " to " << row.newSize;
+    }
+}
+
+TEST(KxArray, NewEntriesAreNullAlsoWhereAShrunkArrayHadValues) {
+    OpenArray array;
+    array.SetSize(3);
+    for (int i = 0; i < 3; ++i)
+        array[i] = &g_values[i];
+    array.SetSize(1);
+    array.SetSize(3);
+    EXPECT_EQ(Content(array), (std::vector<int*>{&g_values[0], nullptr, nullptr}));
+    array.InsertAt(5, &g_values[5]);
+    EXPECT_EQ(Content(array),
+              (std::vector<int*>{&g_values[0], nullptr, nullptr, nullptr, nullptr, &g_values[5]}));
+    array.SetSize(0);
+    EXPECT_EQ(array.Capacity(), 0);
+}
+
+TEST(KxArray, IgnoresNegativeAndOutsideArguments) {
+    OpenArray array;
+    array.SetAtGrow(0, &g_values[0]);
+    array.SetSize(-1);
+    array.SetAtGrow(-1, &g_values[1]);
+    array.InsertAt(-1, &g_values[1]);
+    array.InsertAt(0, &g_values[1], -2);
+    array.RemoveAt(0, 2);
+    array.RemoveAt(1, 1);
+    array.RemoveAt(-1, 1);
+    EXPECT_EQ(Content(array), std::vector<int*>{&g_values[0]});
+}
+
+TEST(KxArray, FollowsAModelThroughRandomEdits) {
+    rc::check([] {
+        OpenArray array;
+        std::vector<int*> model;
+        const int edits = *rc::gen::inRange(1, 60);
+        for (int i = 0; i < edits; ++i) {
+            int* const value = &g_values[*rc::gen::inRange(0, 64)];
+            const int size = static_cast<int>(model.size());
+            const int at = *rc::gen::inRange(0, size + 1);
+            if (*rc::gen::inRange(0, 3) > 0) {
+                const int count = *rc::gen::inRange(1, 4);
+                array.InsertAt(at, value, count);
+                model.insert(model.begin() + at, static_cast<size_t>(count), value);
+            } else if (const int count = *rc::gen::inRange(0, size - at + 1); count > 0) {
+                array.RemoveAt(at, count);
+                model.erase(model.begin() + at, model.begin() + at + count);
+            }
+            RC_ASSERT(Content(array) == model);
+            RC_ASSERT(array.Capacity() >= array.GetSize());
+        }
+    });
+}

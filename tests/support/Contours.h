@@ -1,0 +1,71 @@
+#pragma once
+
+#include <string>
+#include <vector>
+
+#include "gmkernel/GmContour.h"
+#include "gmkernel/GmMatrix.h"
+#include "gmkernel/GmPoint.h"
+
+/// Contours to test with, and the variants under which a law about contours must go on holding.
+namespace shapes {
+
+/// The open chain of segments through the points.
+GmContour Polyline(std::vector<GmPoint> const& points);
+
+/// The closed chain of segments through the points and back to the first one.
+GmContour Polygon(std::vector<GmPoint> const& points);
+
+/// Counter-clockwise square from (0, 0) to (side, side), starting at the origin.
+GmContour Square(double side);
+
+/// Counter-clockwise slot: segments of the length from y = 0 and y = 2 r, half circles at the ends.
+GmContour Slot(double length, double r);
+
+/// Counter-clockwise rectangle from (0, 0) to (width, height) with quarter circles at the corners.
+GmContour RoundedRectangle(double width, double height, double r);
+
+/// One corner of a star: its distance from the origin and the height of the arc over the side that
+/// starts there, as a share of half the side; 0 is a segment, positive bulges to the right of the
+/// direction of travel, which is outwards.
+struct StarCorner {
+    double r;
+    double bulge;
+};
+
+/// Counter-clockwise closed contour with its corners at equal angles about the origin.
+GmContour Star(std::vector<StarCorner> const& corners);
+
+/// A star without self-intersections made from the seed alone: 5 to 12 corners at radii from 6 to
+/// 10, arcs up to a bulge of 0.15 where wanted. Every ray from the origin leaves it once, at
+/// 3.5 or more.
+GmContour RandomStar(unsigned seed, bool bWithArcs);
+
+/// A contour changed in a way that keeps its shape up to a similarity.
+struct Variant {
+    std::string name;
+    GmContour contour;
+    GmMatrix map;    ///< takes points of the original to the variant
+    double scale;    ///< factor of lengths
+    bool bReversed;  ///< is the right side of the original on the left of the variant?
+
+    GmPoint Map(GmPoint const& p) const;
+    /// A signed distance beside the original, as it is beside the variant.
+    double MapOffset(double d) const { return (bReversed ? -d : d) * scale; }
+};
+
+/// The contour itself; reversed, started at another element (if closed), mirrored at the y axis,
+/// rotated, moved far, made larger and smaller.
+std::vector<Variant> Variants(GmContour const& contour);
+
+/// The closed contour with the given element first.
+GmContour StartedAt(GmContour const& contour, int first);
+
+/// Sum of the elements' lengths.
+double ChainLength(GmContour const& contour);
+
+/// Points on the contour, `perElement` on each element with both of its ends among them (at least
+/// two).
+std::vector<GmPoint> Samples(GmContour const& contour, int perElement);
+
+}  // namespace shapes

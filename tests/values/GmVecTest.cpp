@@ -1,0 +1,174 @@
+#include "gmkernel/GmVec.h"
+
+#include <gtest/gtest.h>
+
+#include <cmath>
+
+#include "gmkernel/GmAngle.h"
+#include "gmkernel/GmDir.h"
+#include "gmkernel/GmMatrix.h"
+#include "values/Generators.h"
+
+namespace {
+
+constexpr double kDegree = M_PI / 180.0;
+
+}  // namespace
+
+TEST(GmVec, ComparesPerCoordinateWithinTheTolerance) {
+    GmVec const v(1, 2, 3);
+    EXPECT_EQ(v, GmVec(1.00009, 2, 3));
+    EXPECT_EQ(v, GmVec(1, 2, 2.99991));
+    EXPECT_NE(v, GmVec(1.0002, 2, 3));
+    EXPECT_NE(v, GmVec(1, 1.9998, 3));
+    EXPECT_NE(GmVec(0, 0, 0), GmVec(0, 0, GmBase::m_scdPrec)) << "the tolerance itself is outside";
+    EXPECT_FALSE(v == GmPoint(1, 2, 3)) << "a vector never equals a point";
+    EXPECT_EQ(GmVec(), GmVec(0, 0, 0)) << "flags take no part";
+
+    GmVec const nan(std::nan(""), 0, 0);
+    EXPECT_EQ(nan, nan) << "the very same object";
+    EXPECT_NE(nan, GmVec(nan));
+}
+
+TEST(GmVec, OrdersByLengthWithinTheTolerance) {
+    GmVec const v(3, 4, 0);
+    EXPECT_DOUBLE_EQ(v.Length(), 5);
+    EXPECT_DOUBLE_EQ(v.Norm(), 25);
+    EXPECT_FALSE(v < GmVec(5.00005, 0, 0));
+    EXPECT_TRUE(v < GmVec(0, 0, 5.0002));
+    EXPECT_TRUE(v >= GmVec(0, 5.00005, 0));
+    EXPECT_TRUE(GmVec(0, 0, 5.0002) > v);
+}
+
+TEST(GmVec, ReachesCoordinatesByNameAndByIndex) {
+    GmVec v(1, 2, 3);
+    v.X() += 10;
+    v.Y(20);
+    SetCoordByIndex(v, 2, 30);
+    SetCoordByIndex(v, 3, 99);
+    SetCoordByIndex(v, -1, 99);
+    double const expected[] = {0, 11, 20, 30, 0};
+    for (int i = -1; i < 4; ++i) {
+        EXPECT_EQ(v[i], expected[i + 1]);
+    }
+    EXPECT_EQ(v.k(), 20.0 / 11.0);
+    EXPECT_EQ(GmVec(0, 5, 0).k(), 0);
+    EXPECT_EQ(v.GetTraceString(), "vec (11.00000, 20.00000, 30.00000)");
+}
+
+TEST(GmVec, KeepsTheFlagsOfItsSources) {
+    GmPoint const defined(1, 2, 3);
+    GmVec const undefined(GmPoint(), defined);
+    EXPECT_FALSE(undefined.CreationOK());
+    EXPECT_EQ(undefined, GmVec(0, 0, 0));
+    EXPECT_FALSE(GmVec(defined, GmPoint()).CreationOK());
+    EXPECT_EQ(GmVec(defined, GmPoint(5, 5, 5)), GmVec(4, 3, 2));
+
+    EXPECT_FALSE(GmVec(GmDir()).CreationOK());
+    EXPECT_FALSE((GmVec() + defined).CreationOK()) << "the left operand decides";
+    EXPECT_TRUE((defined + GmVec()).CreationOK());
+    EXPECT_TRUE((defined + GmVec()).IsVec());
+    EXPECT_TRUE((GmVec() % GmVec()).CreationOK());
+    EXPECT_TRUE(GmVec().Standardized().CreationOK());
+    GmVec transformed;
+    transformed.Transform(GmMatrix());
+    EXPECT_TRUE(transformed.CreationOK());
+}
+
+TEST(GmVec, SnapsPolarAnglesToTheAxes) {
+    struct {
+        double x, y, degrees;
+    } const rows[] = {{-1, 0, 180},   {0, -1e-9, -90}, {0, 1e-9, 0},        {0, 0, 0},
+                      {-1, -1, -135}, {1, 0.00005, 0}, {0.00005, 1, 90},    {-1, -0.00005, 180},
+                      {1, 1, 45},     {-1, 1, 135},    {-0.00005, -1, -90}, {1, -1, -45}};
+    for (auto const& row : rows) {
+        GmVec const v(row.x, row.y, 7);
+        EXPECT_EQ(v.DAngle(), row.degrees) << v.GetTraceString();
+        EXPECT_DOUBLE_EQ(v.RAngle(), row.degrees * kDegree) << v.GetTraceString();
+        EXPECT_DOUBLE_EQ(v.Angle().Degree(), row.degrees) << v.GetTraceString();
+    }
+}
+
+TEST(GmVec, MeasuresAnglesBetweenVectors) {
+    GmVec const x(1, 0, 0);
+    GmVec const y(0, 1, 0);
+    EXPECT_DOUBLE_EQ(x.DAngle(y), 90);
+    EXPECT_DOUBLE_EQ(y.DAngle(x), -90);
+    EXPECT_DOUBLE_EQ(x.DAngle(y, GmBase::eRotCW), -270);
+    EXPECT_DOUBLE_EQ(x.DAngle(y, GmBase::eRotCCW), 90);
+    EXPECT_DOUBLE_EQ(x.RAngle(y, GmBase::eRotCW), -1.5 * M_PI);
+    EXPECT_DOUBLE_EQ(y.RAngle(x), -M_PI / 2);
+    EXPECT_EQ(x.DAngle(GmVec(-3, 0, 0)), 180);
+    EXPECT_EQ(x.DAngle(GmVec(5, 0, 0), GmBase::eRotCCW), 0);
+    EXPECT_EQ(x.DAngle(GmVec(0, 0, 0)), 0);
+    EXPECT_DOUBLE_EQ(x.DAngle(GmVec(0, 0, -2)), 90) << "z counts in the magnitude, not in the sign";
+}
+
+TEST(GmVec, CountsQuadrantsWithThreeTreatmentsOfTheAxes) {
+    struct {
+        double x, y;
+        int strict, to13, to24;
+    } const rows[] = {{1, 1, 0, 0, 0},        {-1, 1, 1, 1, 1},        {-1, -1, 2, 2, 2},
+                      {1, -1, 3, 3, 3},       {1, 0, -1, 0, 3},        {0, 1, -1, 0, 1},
+                      {-1, 0, -1, 2, 1},      {0, -1, -1, 2, 3},       {0, 0, -1, 0, 1},
+                      {1, 0.00005, -1, 0, 0}, {-0.00005, 1, -1, 0, 1}, {-0.00005, -1, -1, 2, 3},
+                      {1e-9, -1, -1, 3, 3},   {-0.0001, 1, 1, 1, 1}};
+    for (auto const& row : rows) {
+        GmVec const v(row.x, row.y, 0);
+        EXPECT_EQ(v.Quadrant(), row.strict) << v.GetTraceString();
+        EXPECT_EQ(v.Quadrant13(), row.to13) << v.GetTraceString();
+        EXPECT_EQ(v.Quadrant24(), row.to24) << v.GetTraceString();
+    }
+}
+
+TEST(GmVec, TurnsIntoNormals) {
+    GmVec const v(1, 0, 5);
+    EXPECT_EQ(v.Normalized(GmBase::eRotCCW), GmVec(0, 1, 5));
+    EXPECT_EQ(v.Normalized(GmBase::eRotCW), GmVec(0, -1, 5));
+    EXPECT_EQ(v.Normalized(GmBase::eRotNone), GmVec(0, -1, 5));
+    EXPECT_EQ(GmVec(0, 0, 0).Standardized(), GmVec(0, 0, 0));
+    EXPECT_TRUE(rc::check("a normal keeps the length and four quarter turns close", [] {
+        GmVec const v = anyVec();
+        GmVec n = v.Normalized(GmBase::eRotCCW);
+        RC_ASSERT(n.Norm() == v.Norm());
+        RC_ASSERT(n.Normalized(GmBase::eRotCW) == v);
+        RC_ASSERT(n.Normalized(GmBase::eRotCCW) == GmVec(-v[0], -v[1], v[2]));
+    }));
+}
+
+TEST(GmVec, FollowsTheLawsOfVectorAlgebra) {
+    EXPECT_TRUE(rc::check("algebra", [] {
+        GmVec const a = anyVec();
+        GmVec const b = anyVec();
+        double const f = *anyCoordinate();
+        RC_ASSERT(a + b - b == a);
+        RC_ASSERT(a * f == f * a);
+        RC_ASSERT(a.SkalarMult(f) == a * f);
+        RC_ASSERT(-a == a * -1.0);
+        RC_ASSERT(a * b == b * a);
+        RC_ASSERT(a % b == -(b % a));
+        RC_ASSERT(std::fabs((a % b) * a) <= 1e-6 * (1 + a.Norm() * b.Length()));
+        if (a.Length() > 0) RC_ASSERT(std::fabs(a.Standardized().Length() - 1) < 1e-12);
+    }));
+    EXPECT_TRUE(rc::check("swapping the arguments negates an angle", [] {
+        GmVec const a = anyVec();
+        GmVec const b = anyVec();
+        double const d = a.DAngle(b);
+        RC_ASSERT(d > -180 && d <= 180);
+        RC_ASSERT(b.DAngle(a) == (d == 180 ? d : -d) || a[0] * b[1] == a[1] * b[0]);
+        RC_ASSERT(std::fabs(a.DAngle(b, GmBase::eRotCCW) - a.DAngle(b, GmBase::eRotCW)) < 360.001);
+        RC_ASSERT(a.DAngle(b, GmBase::eRotCW) <= 0);
+        RC_ASSERT(a.DAngle(b, GmBase::eRotCCW) >= 0);
+    }));
+    EXPECT_TRUE(rc::check("a rotation adds to the polar angle", [] {
+        GmVec const v = anyVec();
+        RC_PRE(std::hypot(v[0], v[1]) > 0.01);
+        GmAngle const turn(*anyDegrees(), false);
+        GmVec const r = v.Rotated(turn);
+        RC_ASSERT(std::fabs(r.Length() - v.Length()) < 1e-9);
+        RC_ASSERT(r[2] == v[2]);
+        double const off = (r.Angle() - v.Angle() - turn).Degree();
+        double const snap = GmBase::m_scdPrec / std::hypot(v[0], v[1]) / kDegree;
+        RC_ASSERT(std::fabs(off) < 2 * snap + 1e-9 || std::fabs(off) > 360 - 2 * snap - 1e-9);
+    }));
+}

@@ -1,0 +1,15 @@
+#pragma once
+
+#include <cstddef>
+
+#include "Path.h"
+
+namespace gmpath {
+
+/// Drops the elements of a path that are shorter than the kernel's tolerance, or arcs of a radius
+/// below it, and returns how many. The element behind a dropped one starts where the dropped one
+/// started, so gaps never add up along a row of short elements. Arcs that are straight within a
+/// tenth of the tolerance become segments. A path may be left without elements.
+std::size_t dropShortElements(Path& path);
+
+}  // namespace gmpath
