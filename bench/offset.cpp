@@ -21,7 +21,6 @@ void Offset(benchmark::State& state, ChainKind kind, double distance) {
             break;
         }
     }
-    state.SetComplexityN(state.range(0));
 }
 
 }  // namespace
@@ -31,23 +30,19 @@ BENCHMARK_CAPTURE(Offset, lines_outside, ChainKind::eLines, 1.0)
     ->Arg(10)
     ->Arg(100)
     ->Arg(1000)
-    ->Unit(benchmark::kMillisecond)
-    ->Complexity();
+    ->Unit(benchmark::kMillisecond);
 BENCHMARK_CAPTURE(Offset, lines_inside, ChainKind::eLines, -1.0)
     ->Arg(10)
     ->Arg(100)
     ->Arg(1000)
-    ->Unit(benchmark::kMillisecond)
-    ->Complexity();
+    ->Unit(benchmark::kMillisecond);
 BENCHMARK_CAPTURE(Offset, lines_and_arcs_outside, ChainKind::eLinesAndArcs, 1.0)
     ->Arg(10)
     ->Arg(100)
     ->Arg(1000)
-    ->Unit(benchmark::kMillisecond)
-    ->Complexity();
+    ->Unit(benchmark::kMillisecond);
 BENCHMARK_CAPTURE(Offset, lines_and_arcs_inside, ChainKind::eLinesAndArcs, -1.0)
     ->Arg(10)
     ->Arg(100)
     ->Arg(1000)
-    ->Unit(benchmark::kMillisecond)
-    ->Complexity();
+    ->Unit(benchmark::kMillisecond);

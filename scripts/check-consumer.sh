@@ -1,6 +1,6 @@
 #!/usr/bin/env bash
-# Installs a build into a new folder, moves it, and builds and runs the small program in
-# tests/consumer against it: by CMake, and by pkg-config.
+# Installs a build into a new folder, moves it, and builds and runs programs against it: the one in
+# tests/consumer by CMake and by pkg-config, and the example of the README.
 #   scripts/check-consumer.sh BUILD_DIR
 set -euo pipefail
 cd "$(dirname "$0")/.."
@@ -22,9 +22,15 @@ PKG_CONFIG_PATH=$(dirname "$(find "$prefix" -name gmkernel.pc)")
 export PKG_CONFIG_PATH
 libdir=$(pkg-config --variable=libdir gmkernel)
 read -ra flags <<<"$(pkg-config --cflags --libs gmkernel)"
-g++ -std=c++20 -Wall -Wextra -Werror tests/consumer/main.cpp "${flags[@]}" \
-    -Wl,-rpath,"$libdir" -o "$work/consumer"
+flags+=("-Wl,-rpath,$libdir")
+g++ -std=c++20 -Wall -Wextra -Werror tests/consumer/main.cpp "${flags[@]}" -o "$work/consumer"
 "$work/consumer"
+
+echo "-- the example of the README"
+awk '/^```cpp$/ { inside = 1; next } /^```$/ { inside = 0 } inside' README.md >"$work/readme.cpp"
+g++ -std=c++17 -Wall -Wextra -Werror "$work/readme.cpp" "${flags[@]}" -o "$work/readme"
+"$work/readme" | tee "$work/readme.out"
+[ -s "$work/readme.out" ]
 
 echo "-- the installed program"
 "$prefix/bin/gmpath" --help >/dev/null

@@ -25,9 +25,7 @@ void splitPiece(PieceList& list, PieceList::iterator piece, Points& points) {
         curve.SetSP(p);
         split = true;
     }
-    if (!split) return;
-    piece->reach = reachOf(curve);
-    piece->keepsDistance = false;
+    if (split) piece->measure();
 }
 
 }  // namespace

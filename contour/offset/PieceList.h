@@ -1,7 +1,9 @@
 #pragma once
 
 #include <list>
+#include <utility>
 
+#include "contour/ContourElements.h"
 #include "contour/offset/OffsetElement.h"
 #include "contour/offset/PieceBox.h"
 
@@ -9,12 +11,20 @@ namespace gmkernel_detail {
 
 /// A band piece in a working list, with what spares it needless tests.
 struct Piece {
-    explicit Piece(GmOffsetElement element)
-        : element(std::move(element)), reach(reachOf(this->element.curve())) {}
+    explicit Piece(GmOffsetElement source) : element(std::move(source)) { measure(); }
+
+    /// To be called when the curve has changed.
+    void measure() {
+        reach = reachOf(element.curve());
+        halving = MiddleOf(&element.curve());
+        keepsDistance = false;
+    }
 
     GmOffsetElement element;
     /// Pieces whose boxes are apart cannot cross.
-    PieceBox reach;
+    PieceBox reach{};
+    /// The point that stands for the piece when its distance from the source is judged.
+    GmPoint halving;
     /// The piece keeps its distance from every element of the span but the newest one. A split
     /// takes this back, since the halves are judged by other points.
     bool keepsDistance = false;

@@ -2,7 +2,6 @@
 
 #include <cmath>
 
-#include "contour/ContourElements.h"
 #include "curves/dispatch/Distance.h"
 
 namespace gmkernel_detail {
@@ -26,8 +25,8 @@ void removeNearPieces(PieceList& active, GmContour const& span, bool spanGrew, d
     const int all = static_cast<int>(span.ElementCount());
     const int newest = spanGrew && all > 0 ? 1 : 0;
     for (auto piece = active.begin(); piece != active.end();) {
-        const GmPoint halving = MiddleOf(&piece->element.curve());
-        if (isNear(halving, span, piece->keepsDistance ? newest : all, threshold)) {
+        const int count = piece->keepsDistance ? newest : all;
+        if (isNear(piece->halving, span, count, threshold)) {
             piece = active.erase(piece);
         } else {
             piece->keepsDistance = true;

@@ -65,7 +65,8 @@ public:
     bool Element(GmPoint const& p, double eps) const override;
     /// Element(p, m_scdPrec).
     bool Element(GmPoint const& p) const override;
-    /// The smallest distance of an element from the point; 1e30 without elements.
+    /// The smallest distance of an element from the point; 1e30 without elements. An arc counts
+    /// with its full circle, so this can fall below the distance that MinDist() finds.
     double Dist(GmPoint const& p) const override;
     /// The point of the contour nearest to `p`; of equally near elements the first one answers.
     /// Without elements, and when no distance is a finite number, undefined.
@@ -82,18 +83,22 @@ public:
     GmPoint MinDist(double& d, GmCurve const* c, bool bPreferSP) const override;
     /// Not provided for contours: an undefined point.
     GmPoint MinDist(GmPoint const& p, bool bPreferSP) const override;
-    /// True when the point lies strictly inside the closed chain, by the parity of the crossings
-    /// with a segment from the point through the middle of the first element. False on the contour,
-    /// outside the bounding rectangle and without elements. The segment reaches only as far beyond
-    /// that middle as the point lies before it, so the answer is meant for shapes which it leaves.
-    /// Replaces the solution list.
+    /// True when the point lies strictly inside the closed chain: by an odd number of crossings
+    /// with a segment from the point through the middle of the first element and as far beyond it.
+    /// False on the contour, outside the bounding rectangle and without elements. Replaces the
+    /// solution list.
+    ///
+    /// Known limit: the parity is right only where the far end of that segment lies outside. For a
+    /// convex contour this holds for all points inside it, but not for points outside it that are
+    /// within its rectangle and close to the middle of the first element.
     bool In(GmPoint const& p) override;
     /// True when the point is neither on the contour nor In(), true without elements.
     bool Out(GmPoint const& p) override;
     /// Not provided for contours: an undefined point.
     GmPoint NP(GmPoint const& p) const override;
-    /// The tangent line of the last element that contains the point, see LastPointElem(); an
-    /// undefined line for a point off the contour.
+    /// The tangent line of the last element that contains the point, see LastPointElem(): along a
+    /// segment, clockwise about the centre of every arc. Undefined for a point off the contour, and
+    /// for one that lies m_scdPrec or more off an arc.
     GmLine Tangent(GmPoint const& p) const override;
     /// Not provided for contours, null: see Offsetting().
     GmCurve* GetParallel(double d) const override;

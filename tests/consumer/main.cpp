@@ -25,7 +25,8 @@ void UseValues() {
     Expect(GmPoint(p + GmVec(1, 0, 0)) == GmPoint(4, 4, 12), "sum of point and vector");
     Expect(GmParallelDir(GmDir(1, 0, 0), GmDir(1, 0, 0)), "parallel directions");
     Expect(GmAngle(180, false) + GmAngle(90, false) == GmAngle(-90, false), "sum of angles");
-    Expect(GmMatrix().isIdentity() && GmMatrix::_identity[5] == 1, "identity matrix");
+    Expect(GmMatrix() * GmMatrix::matrixScale(1) == GmMatrix() && GmMatrix().isIdentity(),
+           "identity matrix");
 }
 
 void UseCurves() {

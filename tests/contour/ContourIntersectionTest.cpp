@@ -51,7 +51,7 @@ TEST(ContourIntersection, AFullCircleKeepsACrossingAtItsStart) {
 }
 
 TEST(ContourIntersection, ARayFromTheMiddleOfAStarLeavesItOnce) {
-    rc::check([](unsigned seed, bool bWithArcs) {
+    EXPECT_TRUE(rc::check([](unsigned seed, bool bWithArcs) {
         const double angle = *rc::gen::inRange(0, 3600) * 0.1;
         const GmContour star = shapes::RandomStar(seed, bWithArcs);
         std::vector<GmPoint> targets = {GmPoint(20 * std::cos(angle), 20 * std::sin(angle))};
@@ -68,7 +68,7 @@ TEST(ContourIntersection, ARayFromTheMiddleOfAStarLeavesItOnce) {
                 RC_ASSERT(ray.Intersection(&variant.contour) == 1);
             }
         }
-    });
+    }));
 }
 
 TEST(ContourIntersection, TwoContoursMeetInsideTheirElementsOrAlsoAtEnds) {
@@ -88,7 +88,7 @@ TEST(ContourIntersection, TwoContoursMeetInsideTheirElementsOrAlsoAtEnds) {
 }
 
 TEST(ContourIntersection, CrossingsOfTwoStarsAreTheSameFromBothSides) {
-    rc::check([](unsigned seedA, unsigned seedB) {
+    EXPECT_TRUE(rc::check([](unsigned seedA, unsigned seedB) {
         const GmContour a = shapes::RandomStar(seedA, true);
         GmContour b = shapes::RandomStar(seedB, true);
         b.Translation(GmVec(7.3, 2.1, 0));
@@ -98,7 +98,7 @@ TEST(ContourIntersection, CrossingsOfTwoStarsAreTheSameFromBothSides) {
         for (GmPoint const& p : a.GetPtSol()) {
             RC_ASSERT(a.Element(p, 0.001) && b.Element(p, 0.001));
         }
-    });
+    }));
 }
 
 TEST(ContourIntersection, AContourMeetsItselfAtItsJoints) {

@@ -69,7 +69,7 @@ TEST(KxArray, IgnoresNegativeAndOutsideArguments) {
 }
 
 TEST(KxArray, FollowsAModelThroughRandomEdits) {
-    rc::check([] {
+    EXPECT_TRUE(rc::check([] {
         OpenArray array;
         std::vector<int*> model;
         const int edits = *rc::gen::inRange(1, 60);
@@ -88,5 +88,5 @@ TEST(KxArray, FollowsAModelThroughRandomEdits) {
             RC_ASSERT(Content(array) == model);
             RC_ASSERT(array.Capacity() >= array.GetSize());
         }
-    });
+    }));
 }

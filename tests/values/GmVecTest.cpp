@@ -155,10 +155,12 @@ TEST(GmVec, FollowsTheLawsOfVectorAlgebra) {
         GmVec const b = anyVec();
         double const d = a.DAngle(b);
         RC_ASSERT(d > -180 && d <= 180);
-        RC_ASSERT(b.DAngle(a) == (d == 180 ? d : -d) || a[0] * b[1] == a[1] * b[0]);
-        RC_ASSERT(std::fabs(a.DAngle(b, GmBase::eRotCCW) - a.DAngle(b, GmBase::eRotCW)) < 360.001);
-        RC_ASSERT(a.DAngle(b, GmBase::eRotCW) <= 0);
-        RC_ASSERT(a.DAngle(b, GmBase::eRotCCW) >= 0);
+        RC_ASSERT(
+            (a[0] * b[1] == a[1] * b[0] || std::fabs(std::remainder(b.DAngle(a) + d, 360)) < 1e-5));
+        double const ccw = a.DAngle(b, GmBase::eRotCCW);
+        double const cw = a.DAngle(b, GmBase::eRotCW);
+        RC_ASSERT(cw > -360 && cw <= 0 && ccw >= 0 && ccw < 360);
+        RC_ASSERT((d == 0 ? ccw == cw : std::fabs(ccw - cw - 360) < 1e-9));
     }));
     EXPECT_TRUE(rc::check("a rotation adds to the polar angle", [] {
         GmVec const v = anyVec();
@@ -166,7 +168,7 @@ TEST(GmVec, FollowsTheLawsOfVectorAlgebra) {
         GmAngle const turn(*anyDegrees(), false);
         GmVec const r = v.Rotated(turn);
         RC_ASSERT(std::fabs(r.Length() - v.Length()) < 1e-9);
-        RC_ASSERT(r[2] == v[2]);
+        RC_ASSERT(std::fabs(r[2] - v[2]) < 1e-9);
         double const off = (r.Angle() - v.Angle() - turn).Degree();
         double const snap = GmBase::m_scdPrec / std::hypot(v[0], v[1]) / kDegree;
         RC_ASSERT(std::fabs(off) < 2 * snap + 1e-9 || std::fabs(off) > 360 - 2 * snap - 1e-9);

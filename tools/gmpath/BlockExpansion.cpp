@@ -42,7 +42,8 @@ private:
         for (const auto& [kind, count] : block.skipped.unusable) {
             skip({kind.kind, placedLayer(kind.layer, layer), kind.reason}, count);
         }
-        for (const Path& path : block.paths) addPath(path, placement, layer);
+        for (const Path& path : block.paths)
+            addPath(path, placement, layer);
         for (const BlockReference& reference : block.references) {
             expandReference(reference, placement, placedLayer(reference.layer, layer));
         }

@@ -19,7 +19,8 @@ struct OrderedContour {
 
 std::size_t dropShort(std::vector<Path>& paths) {
     std::size_t dropped = 0;
-    for (Path& path : paths) dropped += dropShortElements(path);
+    for (Path& path : paths)
+        dropped += dropShortElements(path);
     const auto empty = [](const Path& path) { return path.elements.empty(); };
     paths.erase(std::remove_if(paths.begin(), paths.end(), empty), paths.end());
     return dropped;
@@ -106,7 +107,8 @@ std::vector<Path> joinOpenPaths(std::vector<Path> paths, double tolerance) {
     std::sort(contours.begin(), contours.end(),
               [](const auto& a, const auto& b) { return a.earliest < b.earliest; });
     std::vector<Path> result;
-    for (OrderedContour& contour : contours) result.push_back(std::move(contour.path));
+    for (OrderedContour& contour : contours)
+        result.push_back(std::move(contour.path));
     return result;
 }
 

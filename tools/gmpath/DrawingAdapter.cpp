@@ -21,10 +21,13 @@ double sweepBetween(double startDegrees, double endDegrees) {
 }
 
 void mirrorInX(Path& path) {
-    for (Element& e : path.elements) e = {{-e.sp.x, e.sp.y}, {-e.ep.x, e.ep.y}, -e.bulge};
+    for (Element& e : path.elements)
+        e = {{-e.sp.x, e.sp.y}, {-e.ep.x, e.ep.y}, -e.bulge};
 }
 
-int atLeastOne(int count) { return count < 1 ? 1 : count; }
+int atLeastOne(int count) {
+    return count < 1 ? 1 : count;
+}
 
 }  // namespace
 
@@ -80,7 +83,9 @@ void DrawingAdapter::addVertex(const DL_VertexData& data) {
     if (m_polyline) m_polyline->corners.push_back({{data.x, data.y}, {}, data.bulge});
 }
 
-void DrawingAdapter::endEntity() { finishPolyline(); }
+void DrawingAdapter::endEntity() {
+    finishPolyline();
+}
 
 void DrawingAdapter::addInsert(const DL_InsertData& data) {
     if (isTilted("INSERT")) return;
@@ -105,9 +110,13 @@ bool DrawingAdapter::isTilted(const std::string& kind) {
     return true;
 }
 
-bool DrawingAdapter::isMirrored() { return extrusion->getDirection()[2] < 0.0; }
+bool DrawingAdapter::isMirrored() {
+    return extrusion->getDirection()[2] < 0.0;
+}
 
-Path DrawingAdapter::emptyPath() { return {{}, false, attributes.getLayer()}; }
+Path DrawingAdapter::emptyPath() {
+    return {{}, false, attributes.getLayer()};
+}
 
 void DrawingAdapter::addPath(Path path, bool mirrored) {
     if (mirrored) mirrorInX(path);
@@ -119,13 +128,15 @@ void DrawingAdapter::finishPolyline() {
     OpenPolyline polyline = std::move(*m_polyline);
     m_polyline.reset();
     std::vector<Element>& corners = polyline.corners;
-    for (std::size_t i = 0; i + 1 < corners.size(); ++i) corners[i].ep = corners[i + 1].sp;
+    for (std::size_t i = 0; i + 1 < corners.size(); ++i)
+        corners[i].ep = corners[i + 1].sp;
     if (polyline.path.closed && !corners.empty()) {
         corners.back().ep = corners.front().sp;
     } else if (!corners.empty()) {
         corners.pop_back();
     }
-    for (const Element& e : corners) appendBulge(polyline.path.elements, e);
+    for (const Element& e : corners)
+        appendBulge(polyline.path.elements, e);
     addPath(std::move(polyline.path), polyline.mirrored);
 }
 

@@ -41,8 +41,12 @@ const std::vector<EntityKind>& usableKinds() {
     return kinds;
 }
 
-bool isNameCode(int code) { return code == 2 || code == kLayerCode; }
-bool isIntegerCode(int code) { return code == 70 || code == 71; }
+bool isNameCode(int code) {
+    return code == 2 || code == kLayerCode;
+}
+bool isIntegerCode(int code) {
+    return code == 70 || code == 71;
+}
 
 /// A run of groups that starts with the entity's kind.
 struct Record {

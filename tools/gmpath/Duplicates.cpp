@@ -9,7 +9,9 @@ namespace gmpath {
 
 namespace {
 
-bool isSame(Vec2 a, Vec2 b) { return distance(a, b) < kKernelTolerance; }
+bool isSame(Vec2 a, Vec2 b) {
+    return distance(a, b) < kKernelTolerance;
+}
 
 bool isSame(const Element& a, const Element& b) {
     return isSame(a.sp, b.sp) && isSame(a.ep, b.ep) && isSame(halvingPoint(a), halvingPoint(b));
@@ -65,9 +67,8 @@ std::size_t dropDuplicates(std::vector<Path>& paths) {
         const Box box = boundingBox(path);
         const Vec2 key = middle(box.low, box.high);
         bool duplicate = false;
-        middles.visitNear(key, [&](std::size_t i) {
-            duplicate = duplicate || isDuplicate(path, kept[i]);
-        });
+        middles.visitNear(
+            key, [&](std::size_t i) { duplicate = duplicate || isDuplicate(path, kept[i]); });
         if (duplicate) continue;
         middles.add(key, kept.size());
         kept.push_back(std::move(path));

@@ -41,7 +41,9 @@ std::string_view withoutByteOrderMark(std::string_view text) {
     return text;
 }
 
-bool isEndMark(const DxfGroup& group) { return group.code == 0 && trimmed(group.value) == "EOF"; }
+bool isEndMark(const DxfGroup& group) {
+    return group.code == 0 && trimmed(group.value) == "EOF";
+}
 
 bool hasSection(const std::vector<DxfGroup>& groups, std::string_view name) {
     for (std::size_t i = 1; i < groups.size(); ++i) {
@@ -56,8 +58,7 @@ bool hasSection(const std::vector<DxfGroup>& groups, std::string_view name) {
 
 [[noreturn]] void failAtLine(std::size_t line, bool anyGroupRead) {
     const std::string where = "line " + std::to_string(line) + " is no group code";
-    throw InputError(
-                     (anyGroupRead ? "damaged DXF file, " + where : "no DXF file, " + where));
+    throw InputError((anyGroupRead ? "damaged DXF file, " + where : "no DXF file, " + where));
 }
 
 }  // namespace
@@ -73,7 +74,7 @@ std::string readFile(const std::string& fileName) {
     std::ifstream stream(fileName, std::ios::binary);
     std::string text(std::istreambuf_iterator<char>(stream), {});
     if (!stream.is_open() || stream.bad()) {
-        throw InputError("cannot be read: " + std::strerror(errno));
+        throw InputError(std::string("cannot be read: ") + std::strerror(errno));
     }
     if (text.empty()) throw InputError("the file is empty");
     return text;

@@ -28,7 +28,9 @@ double distanceToSegment(const Element& e, Vec2 p) {
 
 }  // namespace
 
-double sweep(const Element& e) { return 4.0 * std::atan(e.bulge); }
+double sweep(const Element& e) {
+    return 4.0 * std::atan(e.bulge);
+}
 
 double radius(const Element& e) {
     if (!isArc(e)) return std::numeric_limits<double>::infinity();
@@ -48,16 +50,26 @@ double length(const Element& e) {
     return isArc(e) ? radius(e) * std::abs(sweep(e)) : distance(e.sp, e.ep);
 }
 
-Vec2 tangentStart(const Element& e) { return unit(turnedHalfSweep(e.ep - e.sp, e.bulge, -1.0)); }
+Vec2 tangentStart(const Element& e) {
+    return unit(turnedHalfSweep(e.ep - e.sp, e.bulge, -1.0));
+}
 
-Vec2 tangentEnd(const Element& e) { return unit(turnedHalfSweep(e.ep - e.sp, e.bulge, 1.0)); }
+Vec2 tangentEnd(const Element& e) {
+    return unit(turnedHalfSweep(e.ep - e.sp, e.bulge, 1.0));
+}
 
-Element reversed(const Element& e) { return {e.ep, e.sp, -e.bulge}; }
+Element reversed(const Element& e) {
+    return {e.ep, e.sp, -e.bulge};
+}
 
-double sideOfChord(const Element& e, Vec2 p) { return cross(e.ep - e.sp, p - e.sp); }
+double sideOfChord(const Element& e, Vec2 p) {
+    return cross(e.ep - e.sp, p - e.sp);
+}
 
 // A counter-clockwise arc lies right of its chord, a clockwise one left of it.
-bool arcHolds(const Element& e, Vec2 q) { return e.bulge * sideOfChord(e, q) <= 0.0; }
+bool arcHolds(const Element& e, Vec2 q) {
+    return e.bulge * sideOfChord(e, q) <= 0.0;
+}
 
 double distance(const Element& e, Vec2 p) {
     if (!isArc(e)) return distanceToSegment(e, p);

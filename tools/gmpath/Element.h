@@ -19,7 +19,9 @@ struct Element {
     double bulge = 0.0;
 };
 
-inline bool isArc(const Element& e) { return e.bulge != 0.0; }
+inline bool isArc(const Element& e) {
+    return e.bulge != 0.0;
+}
 
 /// Sweep in radians, positive counter-clockwise, 0 for a segment.
 double sweep(const Element& e);

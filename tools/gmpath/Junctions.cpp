@@ -41,7 +41,8 @@ public:
         std::iota(m_parent.begin(), m_parent.end(), std::size_t{0});
     }
     std::size_t find(std::size_t i) {
-        while (m_parent[i] != i) i = m_parent[i] = m_parent[m_parent[i]];
+        while (m_parent[i] != i)
+            i = m_parent[i] = m_parent[m_parent[i]];
         return i;
     }
     void unite(std::size_t a, std::size_t b) { m_parent[find(a)] = find(b); }
@@ -72,7 +73,8 @@ std::vector<std::vector<PathEnd>> endsByPlace(const std::vector<Path>& paths,
         grid.add(ends[end].p, end);
     }
     std::unordered_map<std::size_t, std::vector<PathEnd>> byPlace;
-    for (PathEnd end = 0; end < ends.size(); ++end) byPlace[places.find(end)].push_back(end);
+    for (PathEnd end = 0; end < ends.size(); ++end)
+        byPlace[places.find(end)].push_back(end);
     std::vector<std::vector<PathEnd>> result;
     for (auto& entry : byPlace) {
         if (entry.second.size() > kMaxEndsAtOnePlace) failCrowded(ends[entry.first].p);
@@ -118,7 +120,8 @@ std::vector<Pair> pairsOf(const std::vector<Path>& paths, const std::vector<EndV
 
 std::vector<std::optional<PathEnd>> joinEnds(const std::vector<Path>& paths, double tolerance) {
     std::vector<EndView> ends;
-    for (PathEnd end = 0; end < 2 * paths.size(); ++end) ends.push_back(viewOf(paths, end));
+    for (PathEnd end = 0; end < 2 * paths.size(); ++end)
+        ends.push_back(viewOf(paths, end));
 
     std::vector<std::optional<PathEnd>> joined(ends.size());
     for (const std::vector<PathEnd>& place : endsByPlace(paths, ends, tolerance)) {

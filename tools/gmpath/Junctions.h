@@ -11,10 +11,18 @@ namespace gmpath {
 /// An end of an open path: twice the path's index, plus 1 for its end point.
 using PathEnd = std::size_t;
 
-inline PathEnd startOf(std::size_t path) { return 2 * path; }
-inline PathEnd otherEnd(PathEnd end) { return end ^ 1U; }
-inline std::size_t pathOf(PathEnd end) { return end / 2; }
-inline bool isStart(PathEnd end) { return end % 2 == 0; }
+inline PathEnd startOf(std::size_t path) {
+    return 2 * path;
+}
+inline PathEnd otherEnd(PathEnd end) {
+    return end ^ 1U;
+}
+inline std::size_t pathOf(PathEnd end) {
+    return end / 2;
+}
+inline bool isStart(PathEnd end) {
+    return end % 2 == 0;
+}
 
 /// Joins the ends of open paths in pairs. The result holds for every end the end it is joined to,
 /// or nothing.

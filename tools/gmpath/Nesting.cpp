@@ -47,7 +47,8 @@ bool liesIn(const ClosedRegion& inner, const ClosedRegion& outer) {
 
 std::vector<std::optional<int>> nestingDepths(const std::vector<Path>& paths) {
     std::vector<ClosedRegion> regions;
-    for (const Path& path : paths) regions.push_back(regionOf(path));
+    for (const Path& path : paths)
+        regions.push_back(regionOf(path));
 
     std::vector<std::optional<int>> depths(paths.size());
     for (std::size_t i = 0; i < paths.size(); ++i) {

@@ -18,7 +18,8 @@ namespace gmpath {
 namespace {
 
 void add(SkipReport& report, const SkipReport& other) {
-    for (const auto& [kind, count] : other.unusable) report.unusable[kind] += count;
+    for (const auto& [kind, count] : other.unusable)
+        report.unusable[kind] += count;
     report.shortElements += other.shortElements;
     report.duplicates += other.duplicates;
 }
@@ -39,9 +40,9 @@ Drawing readFiltered(const FilteredDrawing& filtered) {
 [[noreturn]] void failWithoutContours(const SkipReport& skipped) {
     const std::size_t unusable = skipped.unusableCount();
     throw InputError("the drawing holds no contours" +
-                     (unusable == 0 ? std::string()
-                                    : ", " + std::to_string(unusable) +
-                                          " of its entities cannot be used"));
+                     (unusable == 0
+                          ? std::string()
+                          : ", " + std::to_string(unusable) + " of its entities cannot be used"));
 }
 
 }  // namespace

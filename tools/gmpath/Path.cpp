@@ -32,20 +32,23 @@ std::size_t arcCount(const Path& path) {
 
 double length(const Path& path) {
     double sum = 0.0;
-    for (const Element& e : path.elements) sum += length(e);
+    for (const Element& e : path.elements)
+        sum += length(e);
     return sum;
 }
 
 Path reversed(const Path& path) {
     Path result = path;
     std::reverse(result.elements.begin(), result.elements.end());
-    for (Element& e : result.elements) e = reversed(e);
+    for (Element& e : result.elements)
+        e = reversed(e);
     return result;
 }
 
 double distance(const Path& path, Vec2 p) {
     double nearest = std::numeric_limits<double>::infinity();
-    for (const Element& e : path.elements) nearest = std::min(nearest, distance(e, p));
+    for (const Element& e : path.elements)
+        nearest = std::min(nearest, distance(e, p));
     return nearest;
 }
 

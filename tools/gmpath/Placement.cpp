@@ -53,12 +53,15 @@ Placement Placement::after(const Placement& inner) const {
     return both;
 }
 
-Vec2 Placement::apply(Vec2 p) const { return m_origin + p.x * m_xAxis + p.y * m_yAxis; }
+Vec2 Placement::apply(Vec2 p) const {
+    return m_origin + p.x * m_xAxis + p.y * m_yAxis;
+}
 
 Path Placement::apply(const Path& path) const {
     const double turn = cross(m_xAxis, m_yAxis) < 0.0 ? -1.0 : 1.0;
     Path placed = path;
-    for (Element& e : placed.elements) e = {apply(e.sp), apply(e.ep), turn * e.bulge};
+    for (Element& e : placed.elements)
+        e = {apply(e.sp), apply(e.ep), turn * e.bulge};
     return placed;
 }
 

@@ -17,7 +17,8 @@ public:
     static Placement scaling(double factor);
 
     /// Where a block with the given base point comes to lie by one cell of a reference, column and
-    /// row counted from 0. Nothing when the scale is not uniform or 0, so that no similarity exists.
+    /// row counted from 0. Nothing when the scale is not uniform or 0, so that no similarity
+    /// exists.
     static std::optional<Placement> ofReference(const BlockReference& reference, Vec2 base,
                                                 int column, int row);
 

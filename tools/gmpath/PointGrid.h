@@ -18,15 +18,16 @@ public:
 
     void add(Vec2 p, std::size_t number) { m_cells[{cellOf(p.x), cellOf(p.y)}].push_back(number); }
 
-    /// Calls visit(number) for every point in the cell of p and the eight cells round it: all points
-    /// within the cell width of p, and some beyond.
+    /// Calls visit(number) for every point in the cell of p and the eight cells round it: all
+    /// points within the cell width of p, and some beyond.
     template <typename Visit>
     void visitNear(Vec2 p, const Visit& visit) const {
         for (std::int64_t dx = -1; dx <= 1; ++dx) {
             for (std::int64_t dy = -1; dy <= 1; ++dy) {
                 const auto found = m_cells.find({cellOf(p.x) + dx, cellOf(p.y) + dy});
                 if (found == m_cells.end()) continue;
-                for (const std::size_t number : found->second) visit(number);
+                for (const std::size_t number : found->second)
+                    visit(number);
             }
         }
     }

@@ -71,9 +71,9 @@ std::optional<int> parseInteger(std::string_view text) {
 
 std::string formatReal(double value, int digits) {
     std::array<char, 64> buffer{};
-    const auto [end, error] = std::to_chars(buffer.data(), buffer.data() + buffer.size(),
-                                            value == 0.0 ? 0.0 : value,
-                                            std::chars_format::general, digits);
+    const auto [end, error] =
+        std::to_chars(buffer.data(), buffer.data() + buffer.size(), value == 0.0 ? 0.0 : value,
+                      std::chars_format::general, digits);
     return error == std::errc() ? std::string(buffer.data(), end) : std::string("?");
 }
 
@@ -101,11 +101,20 @@ std::string xmlEscaped(std::string_view text) {
     std::string result;
     for (const char c : text) {
         switch (c) {
-            case '&': result += "&amp;"; break;
-            case '<': result += "&lt;"; break;
-            case '>': result += "&gt;"; break;
-            case '"': result += "&quot;"; break;
-            default: result += c;
+            case '&':
+                result += "&amp;";
+                break;
+            case '<':
+                result += "&lt;";
+                break;
+            case '>':
+                result += "&gt;";
+                break;
+            case '"':
+                result += "&quot;";
+                break;
+            default:
+                result += c;
         }
     }
     return result;

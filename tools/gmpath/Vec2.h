@@ -10,26 +10,50 @@ struct Vec2 {
     double y = 0.0;
 };
 
-inline Vec2 operator+(Vec2 a, Vec2 b) { return {a.x + b.x, a.y + b.y}; }
-inline Vec2 operator-(Vec2 a, Vec2 b) { return {a.x - b.x, a.y - b.y}; }
-inline Vec2 operator*(double f, Vec2 v) { return {f * v.x, f * v.y}; }
-inline bool operator==(Vec2 a, Vec2 b) { return a.x == b.x && a.y == b.y; }
-inline bool operator!=(Vec2 a, Vec2 b) { return !(a == b); }
+inline Vec2 operator+(Vec2 a, Vec2 b) {
+    return {a.x + b.x, a.y + b.y};
+}
+inline Vec2 operator-(Vec2 a, Vec2 b) {
+    return {a.x - b.x, a.y - b.y};
+}
+inline Vec2 operator*(double f, Vec2 v) {
+    return {f * v.x, f * v.y};
+}
+inline bool operator==(Vec2 a, Vec2 b) {
+    return a.x == b.x && a.y == b.y;
+}
+inline bool operator!=(Vec2 a, Vec2 b) {
+    return !(a == b);
+}
 
 /// Order by x, then by y.
-inline bool operator<(Vec2 a, Vec2 b) { return a.x < b.x || (a.x == b.x && a.y < b.y); }
+inline bool operator<(Vec2 a, Vec2 b) {
+    return a.x < b.x || (a.x == b.x && a.y < b.y);
+}
 
-inline double dot(Vec2 a, Vec2 b) { return a.x * b.x + a.y * b.y; }
+inline double dot(Vec2 a, Vec2 b) {
+    return a.x * b.x + a.y * b.y;
+}
 
 /// Positive when b points to the left of a.
-inline double cross(Vec2 a, Vec2 b) { return a.x * b.y - a.y * b.x; }
+inline double cross(Vec2 a, Vec2 b) {
+    return a.x * b.y - a.y * b.x;
+}
 
-inline double length(Vec2 v) { return std::hypot(v.x, v.y); }
-inline double distance(Vec2 a, Vec2 b) { return length(b - a); }
-inline Vec2 middle(Vec2 a, Vec2 b) { return {0.5 * (a.x + b.x), 0.5 * (a.y + b.y)}; }
+inline double length(Vec2 v) {
+    return std::hypot(v.x, v.y);
+}
+inline double distance(Vec2 a, Vec2 b) {
+    return length(b - a);
+}
+inline Vec2 middle(Vec2 a, Vec2 b) {
+    return {0.5 * (a.x + b.x), 0.5 * (a.y + b.y)};
+}
 
 /// v turned a quarter-turn to the right (clockwise).
-inline Vec2 rightNormal(Vec2 v) { return {v.y, -v.x}; }
+inline Vec2 rightNormal(Vec2 v) {
+    return {v.y, -v.x};
+}
 
 /// v with length 1; the zero vector stays the zero vector.
 inline Vec2 unit(Vec2 v) {

@@ -1,0 +1,94 @@
+#include "Commands.h"
+
+#include <cmath>
+
+#include "InfoTable.h"
+#include "InputError.h"
+#include "OutputFiles.h"
+#include "Progress.h"
+#include "Text.h"
+
+namespace gmpath {
+
+namespace {
+
+constexpr int kMaxPasses = 10'000;
+
+/// Distances beyond this leave the plane in which the kernel can tell points apart.
+constexpr double kLargestDistance = 1e9;
+
+constexpr int kDistanceDigits = 9;
+
+void checkPositive(double value, const std::string& option) {
+    if (!std::isfinite(value) || value <= 0.0 || value > kLargestDistance) {
+        throw InputError(option + ": not a positive finite number");
+    }
+}
+
+Part readInput(const InputOptions& options, const Console& console) {
+    checkPositive(options.read.joinTolerance, "--join");
+    checkPositive(options.read.scale, "--scale");
+    Part part = readPart(options.drawing, options.read);
+    if (part.skipped.unusable.empty()) return part;
+    const std::string line = options.drawing + ": " + unusableLine(part.skipped);
+    if (options.strict) throw InputError(line);
+    console.err << "gmpath: " << line << "\n";
+    return part;
+}
+
+std::vector<double> distancesOf(const OffsetOptions& options) {
+    if (options.count < 1 || options.count > kMaxPasses) {
+        throw InputError("--count: not a number from 1 to " + std::to_string(kMaxPasses));
+    }
+    std::vector<double> distances;
+    for (int pass = 0; pass < options.count; ++pass) {
+        const double distance = options.distance + pass * options.step;
+        if (!std::isfinite(distance) || std::abs(distance) > kLargestDistance) {
+            throw InputError("--distance, --step: not a finite number, or beyond 1e9");
+        }
+        distances.push_back(distance);
+    }
+    return distances;
+}
+
+std::size_t reportContours(const OffsetOptions& options, const std::vector<double>& distances,
+                           const std::vector<ContourOffsets>& offsets, const Console& console) {
+    std::size_t paths = 0;
+    for (std::size_t i = 0; i < offsets.size(); ++i) {
+        const std::string contour =
+            "gmpath: " + options.input.drawing + ": contour " + std::to_string(i + 1);
+        paths += offsets[i].paths.size();
+        if (!offsets[i].accepted) {
+            console.err << contour << ": the kernel cannot take it over\n";
+            continue;
+        }
+        for (const std::size_t pass : offsets[i].emptyPasses) {
+            console.err << contour << ": nothing left at distance "
+                        << formatReal(distances[pass], kDistanceDigits) << "\n";
+        }
+    }
+    return paths;
+}
+
+}  // namespace
+
+void runInfo(const InputOptions& options, const Console& console) {
+    console.out << infoTable(readInput(options, console));
+}
+
+void runOffset(const OffsetOptions& options, const Console& console) {
+    const std::vector<double> distances = distancesOf(options);
+    checkOutputs(options.outputs, options.input.drawing);
+    const Part part = readInput(options.input, console);
+    Progress progress(console.err, console.showProgress);
+    const std::vector<ContourOffsets> offsets =
+        offsetContours(part.contours, {options.side, distances},
+                       [&](std::size_t done, std::size_t total) { progress.show(done, total); });
+    writeOutputs({part.contours, offsets, distances}, options.outputs);
+    progress.clear();
+    const std::size_t paths = reportContours(options, distances, offsets, console);
+    console.out << counted(part.contours.size(), "contour") << ", " << counted(paths, "offset")
+                << "\n";
+}
+
+}  // namespace gmpath

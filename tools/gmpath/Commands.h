@@ -1,0 +1,42 @@
+#pragma once
+
+#include <ostream>
+#include <string>
+#include <vector>
+
+#include "OffsetJob.h"
+#include "PartReader.h"
+
+namespace gmpath {
+
+/// The drawing to read, and how.
+struct InputOptions {
+    std::string drawing;
+    ReadOptions read;
+    bool strict = false;  ///< entities that cannot be used are an error
+};
+
+struct OffsetOptions {
+    InputOptions input;
+    double distance = 0.0;  ///< of the first pass
+    double step = 0.0;      ///< from one pass to the next
+    int count = 1;          ///< number of passes
+    Side side = Side::kWaste;
+    std::vector<std::string> outputs;
+};
+
+/// Streams of a command.
+struct Console {
+    std::ostream& out;
+    std::ostream& err;
+    bool showProgress = false;  ///< `err` is a terminal
+};
+
+/// Prints the table of contours. Throws InputError for input that cannot be used.
+void runInfo(const InputOptions& options, const Console& console);
+
+/// Offsets every contour and writes the outputs; contours that yield nothing are reported. Throws
+/// InputError for input, distances and outputs that cannot be used; then no output is written.
+void runOffset(const OffsetOptions& options, const Console& console);
+
+}  // namespace gmpath

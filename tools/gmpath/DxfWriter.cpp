@@ -1,0 +1,149 @@
+#include "DxfWriter.h"
+
+#include <dxflib/dl_dxf.h>
+
+#include <array>
+#include <fstream>
+#include <iterator>
+#include <memory>
+
+#include "ClassicLocale.h"
+#include "Text.h"
+
+namespace gmpath {
+
+namespace {
+
+constexpr int kBlack = 7;
+
+/// Colour numbers of the passes; further passes start again at the first.
+constexpr std::array<int, 8> kPassColours = {1, 5, 3, 6, 30, 4, 200, 94};
+
+constexpr const char* kLineType = "CONTINUOUS";
+constexpr const char* kSourceLayer = "SOURCE";
+
+std::string passLayer(std::size_t pass) {
+    return "OFFSET_" + std::to_string(pass + 1);
+}
+
+class DxfWriter {
+public:
+    DxfWriter(const OffsetDrawing& drawing, const std::string& fileName)
+        : m_drawing(drawing), m_out(m_dxf.out(fileName.c_str(), DL_Codes::AC1015)) {}
+
+    bool run() {
+        if (m_out == nullptr) return false;
+        m_dxf.writeHeader(*m_out);
+        m_out->sectionEnd();
+        writeTables();
+        writeBlocks();
+        writeEntities();
+        m_dxf.writeObjects(*m_out);
+        m_dxf.writeObjectsEnd(*m_out);
+        m_out->dxfEOF();
+        m_out->close();
+        return true;
+    }
+
+private:
+    void writeTables() {
+        m_out->sectionTables();
+        m_dxf.writeVPort(*m_out);
+        m_out->tableLinetypes(3);
+        for (const char* name : {"BYBLOCK", "BYLAYER", kLineType}) {
+            m_dxf.writeLinetype(*m_out, DL_LinetypeData(name, "", 0, 0, 0.0));
+        }
+        m_out->tableEnd();
+        writeLayers();
+        m_out->tableStyle(1);
+        m_dxf.writeStyle(*m_out, DL_StyleData("STANDARD", 0, 0.0, 1.0, 0.0, 0, 2.5, "", ""));
+        m_out->tableEnd();
+        m_dxf.writeView(*m_out);
+        m_dxf.writeUcs(*m_out);
+        m_out->tableAppid(1);
+        m_dxf.writeAppid(*m_out, "ACAD");
+        m_out->tableEnd();
+        m_dxf.writeDimStyle(*m_out, 1.0, 1.0, 1.0, 1.0, 1.0);
+        m_dxf.writeBlockRecord(*m_out);
+        m_out->tableEnd();
+        m_out->sectionEnd();
+    }
+
+    void writeLayers() {
+        const std::size_t passes = m_drawing.distances.size();
+        m_out->tableLayers(static_cast<int>(passes) + 2);
+        writeLayer("0", kBlack);
+        writeLayer(kSourceLayer, kBlack);
+        for (std::size_t pass = 0; pass < passes; ++pass) {
+            writeLayer(passLayer(pass), kPassColours[pass % kPassColours.size()]);
+        }
+        m_out->tableEnd();
+    }
+
+    void writeLayer(const std::string& name, int colour) {
+        constexpr int kDefaultWidth = -3;
+        m_dxf.writeLayer(*m_out, DL_LayerData(name, 0),
+                         DL_Attributes(name, colour, kDefaultWidth, kLineType, 1.0));
+    }
+
+    void writeBlocks() {
+        m_out->sectionBlocks();
+        for (const char* name : {"*Model_Space", "*Paper_Space", "*Paper_Space0"}) {
+            m_dxf.writeBlock(*m_out, DL_BlockData(name, 0, 0.0, 0.0, 0.0));
+            m_dxf.writeEndBlock(*m_out, name);
+        }
+        m_out->sectionEnd();
+    }
+
+    void writeEntities() {
+        m_out->sectionEntities();
+        for (const Path& contour : m_drawing.contours)
+            writePolyline(contour, kSourceLayer);
+        for (const ContourOffsets& offsets : m_drawing.offsets) {
+            for (const OffsetPath& offset : offsets.paths) {
+                writePolyline(offset.path, passLayer(offset.pass));
+            }
+        }
+        m_out->sectionEnd();
+    }
+
+    void writePolyline(const Path& path, const std::string& layer) {
+        constexpr int kByLayer = 256;
+        constexpr int kWidthByLayer = -1;
+        const DL_Attributes attributes(layer, kByLayer, kWidthByLayer, "BYLAYER", 1.0);
+        const int vertices = static_cast<int>(path.elements.size()) + (path.closed ? 0 : 1);
+        m_dxf.writePolyline(*m_out, DL_PolylineData(vertices, 0, 0, path.closed ? 1 : 0),
+                            attributes);
+        for (const Element& e : path.elements)
+            writeVertex(e.sp, e.bulge);
+        if (!path.closed) writeVertex(path.elements.back().ep, 0.0);
+        m_dxf.writePolylineEnd(*m_out);
+    }
+
+    void writeVertex(Vec2 p, double bulge) {
+        m_dxf.writeVertex(*m_out, DL_VertexData(p.x, p.y, 0.0, bulge));
+    }
+
+    const OffsetDrawing& m_drawing;
+    DL_Dxf m_dxf;
+    std::unique_ptr<DL_WriterA> m_out;
+};
+
+/// The DXF library does not tell of failed writes, so the end of the file is looked at.
+bool endsWithEndMark(const std::string& fileName) {
+    std::ifstream stream(fileName, std::ios::binary | std::ios::ate);
+    constexpr std::streamoff kTail = 8;
+    if (!stream || stream.tellg() < kTail) return false;
+    stream.seekg(-kTail, std::ios::end);
+    const std::string tail(std::istreambuf_iterator<char>(stream), {});
+    return tail.find("EOF") != std::string::npos;
+}
+
+}  // namespace
+
+bool writeDxf(const OffsetDrawing& drawing, const std::string& fileName) {
+    const ClassicLocale locale;
+    return DxfWriter(drawing, fileName).run() && endsWithEndMark(fileName);
+}
+
+}  // namespace gmpath

@@ -1,0 +1,54 @@
+#pragma once
+
+#include <functional>
+#include <string_view>
+#include <vector>
+
+#include "Path.h"
+
+namespace gmpath {
+
+/// On which side of a contour to offset.
+enum class Side {
+    kWaste,    ///< outside of outlines, inside of holes, by nesting depth
+    kRight,    ///< right of the direction of travel
+    kLeft,     ///< left of the direction of travel
+    kInside,   ///< towards what a closed contour encloses
+    kOutside,  ///< away from what a closed contour encloses
+    kBoth      ///< both sides
+};
+
+/// What to offset, and how far.
+struct OffsetRequest {
+    Side side = Side::kWaste;
+    /// One distance a pass, in units of the contours; a negative distance lies on the other side.
+    std::vector<double> distances;
+};
+
+/// A result contour.
+struct OffsetPath {
+    std::size_t pass;  ///< index of the distance
+    Path path;
+};
+
+/// What became of one source contour.
+struct ContourOffsets {
+    std::vector<OffsetPath> paths;         ///< by pass
+    std::vector<std::size_t> emptyPasses;  ///< passes that yielded nothing
+    bool accepted = true;                  ///< false when the kernel refused the contour
+};
+
+/// Called with the number of offsets done and their total.
+using ProgressCall = std::function<void(std::size_t done, std::size_t total)>;
+
+/// Signed kernel distances (positive: right) for a distance on the side asked for. Open contours,
+/// and closed ones that enclose nothing, have no inside: they get both sides unless right or left
+/// is asked for. `depth` is the nesting depth, even for outlines.
+std::vector<double> signedDistances(const Path& contour, int depth, Side side, double distance);
+
+/// Offsets every contour in every pass; the result has one entry a contour, in order.
+std::vector<ContourOffsets> offsetContours(const std::vector<Path>& contours,
+                                           const OffsetRequest& request,
+                                           const ProgressCall& progress);
+
+}  // namespace gmpath

@@ -1,0 +1,18 @@
+#pragma once
+
+#include <string>
+
+#include "Path.h"
+
+namespace gmpath {
+
+/// A dot at the start of a path and an arrow head a little further along it, as SVG of the given
+/// style class. Their size follows the diagonal of the whole picture, but stays small beside small
+/// paths. Nothing for a path without elements.
+std::string startMark(const Path& path, const std::string& styleClass, double diagonal);
+
+/// The path's number beside its start, on the side where a counter-clockwise contour has its
+/// inside. The text stands upright.
+std::string numberLabel(const Path& path, const std::string& number, double diagonal);
+
+}  // namespace gmpath
