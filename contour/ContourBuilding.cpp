@@ -3,7 +3,13 @@
 #include "contour/ContourElements.h"
 #include "gmkernel/GmContour.h"
 
+using gmkernel_detail::ChainEnd;
+using gmkernel_detail::ChainStart;
+
 namespace {
+
+// A validated curve may touch the chain at the joint and at the closing end.
+constexpr int kMaxTouches = 2;
 
 // The curve while its record does not own it yet; whoever takes the record over releases both.
 struct ElementHolder {
@@ -19,8 +25,7 @@ struct ElementHolder {
     }
 };
 
-// The crossings of a validated curve that are allowed: its start, the joint, and its end when it
-// closes the contour.
+// The end of the curve counts only when it closes the contour.
 bool MeetsOnlyAtOwnEnds(GmContour const& contour, int count, GmCurve const& c, bool bCloses) {
     for (int i = 0; i < count; ++i) {
         const GmPoint hit = contour.GetSolution(static_cast<unsigned>(i));
@@ -35,12 +40,11 @@ bool GmContour::AppendElementValid(GmCurve const* c, bool bValidate) {
     if (!c) return false;
     if (bValidate && m_bClosed) return false;
     if (ElementCount() == 0) return true;
-    const int maxHits = 2;
     const int hits = bValidate ? Intersection(c) : 0;
-    if (hits > maxHits) return false;
+    if (hits > kMaxTouches) return false;
     if (!(c->SP() == ChainEnd(*this))) return false;
     const bool bCloses = c->EP() == ChainStart(*this);
-    if (!bCloses && hits == maxHits) return false;
+    if (!bCloses && hits == kMaxTouches) return false;
     if (!MeetsOnlyAtOwnEnds(*this, hits, *c, bCloses)) return false;
     if (bCloses) m_bClosed = true;
     return true;

@@ -4,6 +4,9 @@
 #include "gmkernel/GmContour.h"
 #include "gmkernel/GmStretch.h"
 
+using gmkernel_detail::ChainEnd;
+using gmkernel_detail::ChainStart;
+
 // Only the pointers move: every record keeps its fields.
 void GmContour::Invert() {
     for (int i = 0; i < m_pElements->GetSize(); ++i) {

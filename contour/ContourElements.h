@@ -3,6 +3,8 @@
 #include "gmkernel/GmContour.h"
 #include "gmkernel/GmPoint.h"
 
+namespace gmkernel_detail {
+
 /// The middle point of a segment or an arc; undefined for any other curve and for null.
 GmPoint MiddleOf(GmCurve const* element);
 
@@ -15,3 +17,5 @@ inline GmPoint ChainStart(GmContour const& contour) {
 inline GmPoint ChainEnd(GmContour const& contour) {
     return contour.GetElement(static_cast<int>(contour.ElementCount()) - 1)->EP();
 }
+
+}  // namespace gmkernel_detail

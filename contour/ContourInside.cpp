@@ -19,14 +19,14 @@ enum class Location {
 Location Locate(GmContour const& contour, GmPoint const& p) {
     if (contour.Element(p)) return Location::eOnContour;
     if (!contour.BoundingRect().In(p)) return Location::eOutside;
-    const GmPoint middle = MiddleOf(contour.GetElement(0));
+    const GmPoint middle = gmkernel_detail::MiddleOf(contour.GetElement(0));
     const GmStretch probe(p, GmPoint(p + 2.0 * (middle - p)));
     return contour.Intersection(&probe) % 2 != 0 ? Location::eInside : Location::eOutside;
 }
 
 }  // namespace
 
-GmPoint MiddleOf(GmCurve const* element) {
+GmPoint gmkernel_detail::MiddleOf(GmCurve const* element) {
     if (element && element->IsStretch()) return static_cast<GmStretch const&>(*element).HP();
     if (element && element->IsArc()) return static_cast<GmArc const&>(*element).HP();
     return GmPoint();
@@ -41,5 +41,5 @@ bool GmContour::Out(GmPoint const& p) {
 }
 
 GmPoint GmContour::GetHP(int index) {
-    return MiddleOf(GetElement(index));
+    return gmkernel_detail::MiddleOf(GetElement(index));
 }

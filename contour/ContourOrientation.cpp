@@ -1,6 +1,7 @@
 #include <cmath>
 
 #include "contour/ContourElements.h"
+#include "curves/kernels/Constants.h"
 #include "gmkernel/GmArc.h"
 #include "gmkernel/GmContour.h"
 
@@ -8,8 +9,6 @@
 // of the arcs, by the sum of cross products of neighbouring radius vectors (the shoelace formula).
 
 namespace {
-
-constexpr double kPi = 3.14159265358979323846;
 
 // Twice the area swept by the radius vector from `reference` along the points given to MoveTo().
 class SweptArea {
@@ -33,12 +32,12 @@ private:
 
 // Four chords a half-turn, at least two. A sweep that is no number gives two.
 int ChordCount(GmArc const& arc) {
-    const double chords = std::fabs(arc.Ang()) * 4.0 / kPi;
+    const double chords = std::fabs(arc.Ang()) * 4.0 / gmkernel_detail::PI;
     return chords >= 2.0 && chords <= 8.0 ? static_cast<int>(chords) : 2;
 }
 
 double DoubledArea(GmContour const& contour, GmPoint const& reference) {
-    const GmPoint start = ChainStart(contour);
+    const GmPoint start = gmkernel_detail::ChainStart(contour);
     SweptArea area(reference, start);
     for (int i = 0; i < contour.ElementCount(); ++i) {
         GmCurve const& element = *contour.GetElement(i);
@@ -58,7 +57,7 @@ double DoubledArea(GmContour const& contour, GmPoint const& reference) {
 
 GmBase::eRotDir GmContour::Dir(GmPoint const& r) {
     if (ElementCount() == 0) return eRotNone;
-    const GmPoint start = ChainStart(*this);
+    const GmPoint start = gmkernel_detail::ChainStart(*this);
     double area = DoubledArea(*this, r);
     if (area == 0.0 && !(r == start)) area = DoubledArea(*this, start);
     if (area < 0.0) return eRotCW;

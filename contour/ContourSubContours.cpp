@@ -6,6 +6,8 @@
 #include "gmkernel/GmContour.h"
 #include "gmkernel/GmRect.h"
 
+using gmkernel_detail::ChainStart;
+
 namespace {
 
 bool Encloses(GmRect const& outer, GmRect const& inner) {

@@ -3,6 +3,8 @@
 #include "contour/ContourElements.h"
 #include "gmkernel/GmContour.h"
 
+using gmkernel_detail::ChainStart;
+
 namespace {
 
 // Two starts are equally near within this number: of distances in the search by one point, of

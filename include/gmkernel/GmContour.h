@@ -98,7 +98,7 @@ public:
     GmPoint NP(GmPoint const& p) const override;
     /// The tangent line of the last element that contains the point, see LastPointElem(): along a
     /// segment, clockwise about the centre of every arc. Undefined for a point off the contour, and
-    /// for one that lies m_scdPrec or more off an arc.
+    /// for one that lies more than m_scdPrec off an arc.
     GmLine Tangent(GmPoint const& p) const override;
     /// Not provided for contours, null: see Offsetting().
     GmCurve* GetParallel(double d) const override;

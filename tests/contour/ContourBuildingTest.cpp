@@ -90,15 +90,26 @@ TEST(ContourBuilding, ValidationAllowsContactOnlyAtTheJointAndTheClosingEnd) {
         const GmStretch next(GmPoint(10, 10), row.end);
         EXPECT_EQ(contour.AddElement(&next, true, 0), row.bAccepted) << row.what;
         EXPECT_EQ(contour.ElementCount(), row.bAccepted ? 3 : 2);
-        EXPECT_TRUE(contour.GetSolution(0) == GmPoint(0, 0) || contour.GetPtSol().size() > 0);
+        EXPECT_FALSE(contour.GetPtSol().empty());
         EXPECT_EQ(contour.IsClosed(), row.end == GmPoint(0, 0));
         GmContour unguarded = Angle();
         EXPECT_TRUE(unguarded.AddElement(&next, false, 0)) << row.what;
     }
 }
 
+TEST(ContourBuilding, ValidationRefusesWhatMeetsTheChainOnceMoreThanAtTheJoint) {
+    // Straight on into the first element: the collinear joint gives no point, the end does.
+    GmContour straightOn =
+        shapes::Polyline({GmPoint(0, 0), GmPoint(0, 10), GmPoint(10, 5), GmPoint(5, 5)});
+    EXPECT_FALSE(straightOn.AddElement(Segment(5, 5, 0, 5), true, 0));
+    EXPECT_TRUE(straightOn.AddElement(Segment(5, 5, 1, 5), true, 0));
+    // The joint itself lies on the first element and is found twice.
+    GmContour touching =
+        shapes::Polyline({GmPoint(0, 0), GmPoint(10, 0), GmPoint(10, 5), GmPoint(5, 0)});
+    EXPECT_FALSE(touching.AddElement(Segment(5, 0, 5, -5), true, 0));
+}
+
 TEST(ContourBuilding, AClosingElementMustNotCrossTheChain) {
-    // A zigzag whose closing segment runs through its middle part: three points at least.
     GmContour zigzag = shapes::Polyline(
         {GmPoint(0, 0), GmPoint(4, 4), GmPoint(6, -4), GmPoint(8, 4), GmPoint(10, 0)});
     const GmStretch closing(GmPoint(10, 0), GmPoint(0, 0));

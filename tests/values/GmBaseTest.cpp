@@ -3,6 +3,7 @@
 #include <gtest/gtest.h>
 
 #include <memory>
+#include <typeinfo>
 
 #include "gmkernel/GmAngle.h"
 #include "gmkernel/GmDir.h"
@@ -60,7 +61,8 @@ TEST(GmBase, DefaultObjectsAreUndefinedAndCloneToTheirOwnClass) {
         EXPECT_FALSE(a->CreationOK());
         EXPECT_FALSE(a->BoundingRect().CreationOK());
         std::unique_ptr<GmBase> const copy(a->Clone());
-        EXPECT_EQ(typeid(*copy), typeid(*a));
+        GmBase const& cloned = *copy;
+        EXPECT_EQ(typeid(cloned), typeid(*a));
         EXPECT_EQ(copy->GetType(), a->GetType());
         for (GmBase const* b : objects) {
             EXPECT_EQ(*a == *b, a == b);

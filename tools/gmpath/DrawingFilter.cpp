@@ -48,6 +48,11 @@ bool isIntegerCode(int code) {
     return code == 70 || code == 71;
 }
 
+/// Parts of other entities, and windows onto the drawing from its sheet.
+bool isNoEntityOfItsOwn(std::string_view kind) {
+    return kind == "VERTEX" || kind == "SEQEND" || kind == "VIEWPORT";
+}
+
 /// A run of groups that starts with the entity's kind.
 struct Record {
     std::string_view kind;
@@ -136,7 +141,7 @@ private:
             m_block.clear();
         } else if (record.kind == "POLYLINE") {
             filterPolyline(record);
-        } else if (record.kind != "VERTEX" && record.kind != "SEQEND") {
+        } else if (!isNoEntityOfItsOwn(record.kind)) {
             filterEntity(record);
         }
     }

@@ -21,6 +21,8 @@ constexpr const char* kSourceColour = "#212529";
 /// Sizes as fractions of the picture's diagonal.
 constexpr double kMarginFraction = 0.03;
 constexpr double kLegendFraction = 0.014;
+constexpr double kSourceStrokeFraction = 0.0014;
+constexpr double kOffsetStrokeFraction = 0.0009;
 
 const char* passColour(std::size_t pass) {
     return kPassColours[pass % kPassColours.size()];
@@ -90,20 +92,29 @@ private:
                  "\" fill=\"#ffffff\"/>\n";
     }
 
+    /// Where strokes can keep their width they do; elsewhere it follows the size of the drawing.
     void writeStyle() {
+        const std::string sourceWidth = formatReal(kSourceStrokeFraction * m_diagonal);
+        const std::string offsetWidth = formatReal(kOffsetStrokeFraction * m_diagonal);
         m_svg +=
             "<style>\n"
-            "path { fill: none; stroke-linejoin: round; stroke-linecap: round; "
-            "vector-effect: non-scaling-stroke; }\n"
+            "path { fill: none; stroke-linejoin: round; stroke-linecap: round; }\n"
             "text { font-family: sans-serif; }\n";
-        m_svg += std::string(".source { stroke: ") + kSourceColour + "; stroke-width: 1.8px; }\n";
-        m_svg += std::string(".source-mark { stroke: none; fill: ") + kSourceColour + "; }\n";
+        m_svg += std::string(".source { stroke: ") + kSourceColour +
+                 "; stroke-width: " + sourceWidth + "; }\n.offset { stroke-width: " + offsetWidth +
+                 "; }\n";
+        m_svg += std::string(".source-mark { fill: ") + kSourceColour + "; }\n";
         for (std::size_t pass = 0; pass < m_drawing.distances.size(); ++pass) {
             const std::string name = passClass(pass);
-            m_svg += "." + name + " { stroke: " + passColour(pass) + "; stroke-width: 1.1px; }\n";
-            m_svg += "." + name + "-mark { stroke: none; fill: " + passColour(pass) + "; }\n";
+            const std::string colour = passColour(pass);
+            m_svg += "." + name + " { stroke: " + colour + "; }\n";
+            m_svg += "." + name + "-mark { fill: " + colour + "; }\n";
         }
-        m_svg += "</style>\n";
+        m_svg +=
+            "@supports (vector-effect: non-scaling-stroke) {\n"
+            "path { vector-effect: non-scaling-stroke; }\n"
+            ".source { stroke-width: 1.8px; }\n.offset { stroke-width: 1.2px; }\n}\n"
+            "</style>\n";
     }
 
     static std::string passClass(std::size_t pass) { return "pass-" + std::to_string(pass + 1); }
@@ -114,7 +125,7 @@ private:
         m_svg += "<g id=\"contour-" + number + "\">\n<title>contour " + number + ", layer " +
                  xmlEscaped(printable(contour.layer)) + ", " + senseName(contour) + "</title>\n";
         for (const OffsetPath& offset : m_drawing.offsets[index].paths) {
-            m_svg += pathTag(offset.path, passClass(offset.pass));
+            m_svg += pathTag(offset.path, "offset " + passClass(offset.pass));
             m_svg += startMark(offset.path, passClass(offset.pass) + "-mark", m_diagonal);
         }
         m_svg += pathTag(contour, "source");
