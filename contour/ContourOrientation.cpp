@@ -32,7 +32,7 @@ private:
 
 // Four chords a half-turn, at least two. A sweep that is no number gives two.
 int ChordCount(GmArc const& arc) {
-    const double chords = std::fabs(arc.Ang()) * 4.0 / gmkernel_detail::PI;
+    const double chords = std::fabs(arc.Ang()) * 4.0 / gmkernel_detail::kPi;
     return chords >= 2.0 && chords <= 8.0 ? static_cast<int>(chords) : 2;
 }
 

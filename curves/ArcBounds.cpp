@@ -1,9 +1,9 @@
 /// @file
 /// The bounding rectangle of an arc.
 ///
-/// An arc reaches one of the four axis directions when it passes over it. With all angles shifted so
-/// that the direction lies on the seam of (-180, 180], a clockwise arc passes it when its start angle
-/// is the smaller one, a counter-clockwise arc when its end angle is.
+/// An arc reaches one of the four axis directions when it passes over it. With all angles shifted
+/// so that the direction lies on the seam of (-180, 180], a clockwise arc passes it when its start
+/// angle is the smaller one, a counter-clockwise arc when its end angle is.
 #include <algorithm>
 
 #include "gmkernel/GmArc.h"
@@ -23,13 +23,21 @@ bool crossesSeam(double start, double end, GmBase::eRotDir rot) {
 }
 
 // Shifts of an angle in (-180, 180] that move an axis direction onto the seam.
-double plusXOnSeam(double a) { return a > 0.0 ? a - 180.0 : a + 180.0; }
-double minusYOnSeam(double a) { return a > -90.0 ? a - 90.0 : a + 270.0; }
-double plusYOnSeam(double a) { return a < 90.0 ? a + 90.0 : a - 270.0; }
+double plusXOnSeam(double a) {
+    return a > 0.0 ? a - 180.0 : a + 180.0;
+}
+double minusYOnSeam(double a) {
+    return a > -90.0 ? a - 90.0 : a + 270.0;
+}
+double plusYOnSeam(double a) {
+    return a < 90.0 ? a + 90.0 : a - 270.0;
+}
 
 }  // namespace
 
-GmRect GmArc::BoundingRect() const { return BoundingRect(false); }
+GmRect GmArc::BoundingRect() const {
+    return BoundingRect(false);
+}
 
 GmRect GmArc::BoundingRect(bool bIgnoreFullCircle) const {
     if (!bIgnoreFullCircle && IsFullCircle()) return GmCircle::BoundingRect();

@@ -6,10 +6,14 @@
 
 namespace {
 
-GmDir upAxis() { return GmDir(0.0, 0.0, 1.0); }
+GmDir upAxis() {
+    return GmDir(0.0, 0.0, 1.0);
+}
 
 /// The polar angle of a point seen from a centre.
-GmAngle angleAbout(GmPoint const& m, GmPoint const& p) { return GmAngle((p - m).RAngle(), true); }
+GmAngle angleAbout(GmPoint const& m, GmPoint const& p) {
+    return GmAngle((p - m).RAngle(), true);
+}
 
 struct CentreAndRadius {
     GmPoint m;
@@ -159,9 +163,7 @@ GmArc::GmArc(GmArc const& arc, double d) : m_eDir(eRotNone) {
     if (!arc.CreationOK() || !(r >= m_scdPrec)) return;
 
     Define(arc.m_M, arc.m_Axis, r);
-    const auto scaled = [&](GmPoint const& p) {
-        return GmPoint(m_M + (p - m_M) * r / arc.m_dR);
-    };
+    const auto scaled = [&](GmPoint const& p) { return GmPoint(m_M + (p - m_M) * r / arc.m_dR); };
     m_SP = scaled(arc.m_SP);
     m_EP = scaled(arc.m_EP);
     m_SAng = arc.m_SAng;
@@ -193,6 +195,10 @@ void GmArc::SetAngles(double sAng, double eAng, eRotDir rot) {
     m_EP = EP_Ang();
 }
 
-GmPoint GmArc::SP_Ang() const { return GmPoint(m_M + m_dR * GmVec(GmDir(m_SAng))); }
+GmPoint GmArc::SP_Ang() const {
+    return GmPoint(m_M + m_dR * GmVec(GmDir(m_SAng)));
+}
 
-GmPoint GmArc::EP_Ang() const { return GmPoint(m_M + m_dR * GmVec(GmDir(m_EAng))); }
+GmPoint GmArc::EP_Ang() const {
+    return GmPoint(m_M + m_dR * GmVec(GmDir(m_EAng)));
+}

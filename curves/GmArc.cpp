@@ -15,7 +15,7 @@
 namespace {
 
 /// The membership tolerance of arcs, in length units.
-constexpr double ARC_ELEMENT_PREC = 0.01;
+constexpr double kArcElementPrec = 0.01;
 
 /// Does a transform turn the x-y plane over?
 bool mirrors(GmMatrix const& m) {
@@ -41,7 +41,9 @@ GmArc& GmArc::operator=(GmArc const& arc) {
     return *this;
 }
 
-GmArc* GmArc::Clone() const { return new GmArc(*this); }
+GmArc* GmArc::Clone() const {
+    return new GmArc(*this);
+}
 
 void GmArc::Undefine() {
     GmCircle::Undefine();
@@ -52,7 +54,9 @@ void GmArc::Undefine() {
     m_eDir = eRotNone;
 }
 
-bool GmArc::Trim(GmCurve* next) { return gmkernel_detail::trimToCrossing(*this, next); }
+bool GmArc::Trim(GmCurve* next) {
+    return gmkernel_detail::trimToCrossing(*this, next);
+}
 
 GmCurve* GmArc::Concat(GmCurve const& next, int mode) {
     GmLine normalAtNext;
@@ -70,7 +74,8 @@ bool GmArc::Concat(GmCurve const& next) {
     bool takeSecond = false;
     if (next.IsStretch()) {
         count = circle.IntersectionWithLine(GmLine(static_cast<GmStretch const&>(next)));
-        takeSecond = count > 1 && m_EP.Dist(circle.GetSolution(0)) > m_EP.Dist(circle.GetSolution(1));
+        takeSecond =
+            count > 1 && m_EP.Dist(circle.GetSolution(0)) > m_EP.Dist(circle.GetSolution(1));
     } else if (next.IsArc()) {
         count = circle.IntersectionWithCircle(static_cast<GmArc const&>(next));
         if (count == 0) return next.SP() == m_EP;
@@ -95,7 +100,9 @@ bool GmArc::Element(GmPoint const& p, double eps) const {
     return GmCircle::Element(p, eps);
 }
 
-bool GmArc::Element(GmPoint const& p) const { return Element(p, ARC_ELEMENT_PREC); }
+bool GmArc::Element(GmPoint const& p) const {
+    return Element(p, kArcElementPrec);
+}
 
 double GmArc::DistSP(GmPoint const& p) const {
     if (p == m_SP) return 0.0;
@@ -112,9 +119,13 @@ GmPoint GmArc::MinDist(GmPoint const& p, bool bPreferSP) const {
     return m_EP.Dist2(p) <= m_SP.Dist2(p) ? m_EP : m_SP;
 }
 
-bool GmArc::In(GmPoint const& /*p*/) { return false; }
+bool GmArc::In(GmPoint const& /*p*/) {
+    return false;
+}
 
-bool GmArc::Out(GmPoint const& /*p*/) { return false; }
+bool GmArc::Out(GmPoint const& /*p*/) {
+    return false;
+}
 
 void GmArc::SetSP(GmPoint const& p) {
     m_SP = p;
@@ -126,9 +137,13 @@ void GmArc::SetEP(GmPoint const& p) {
     m_EAng = GmDir(m_M, p).Angle();
 }
 
-GmPoint GmArc::SP() const { return m_SP; }
+GmPoint GmArc::SP() const {
+    return m_SP;
+}
 
-GmPoint GmArc::EP() const { return m_EP; }
+GmPoint GmArc::EP() const {
+    return m_EP;
+}
 
 GmDir GmArc::TangentAt(GmDir const& radial) const {
     GmDir tangent = radial.Normalized(eRotCW);
@@ -136,15 +151,25 @@ GmDir GmArc::TangentAt(GmDir const& radial) const {
     return tangent;
 }
 
-GmDir GmArc::TangSP() const { return TangentAt(GmDir(m_SAng)); }
+GmDir GmArc::TangSP() const {
+    return TangentAt(GmDir(m_SAng));
+}
 
-GmDir GmArc::TangEP() const { return TangentAt(GmDir(m_EAng)); }
+GmDir GmArc::TangEP() const {
+    return TangentAt(GmDir(m_EAng));
+}
 
-GmDir GmArc::TangHP() const { return TangentAt(GmDir(m_M, HP())); }
+GmDir GmArc::TangHP() const {
+    return TangentAt(GmDir(m_M, HP()));
+}
 
-double GmArc::Length() const { return m_dR * Ang2Pi(); }
+double GmArc::Length() const {
+    return m_dR * Ang2Pi();
+}
 
-GmCurve* GmArc::GetParallel(double d) const { return new GmArc(*this, d); }
+GmCurve* GmArc::GetParallel(double d) const {
+    return new GmArc(*this, d);
+}
 
 void GmArc::Translation(GmVec const& v) {
     GmCircle::Translation(v);
@@ -168,19 +193,33 @@ std::string GmArc::GetTraceString() const {
         .ToStdString();
 }
 
-GmBase::eRotDir GmArc::Dir() const { return m_eDir; }
+GmBase::eRotDir GmArc::Dir() const {
+    return m_eDir;
+}
 
-double GmArc::SAng() const { return m_SAng.Radiant(); }
+double GmArc::SAng() const {
+    return m_SAng.Radiant();
+}
 
-double GmArc::EAng() const { return m_EAng.Radiant(); }
+double GmArc::EAng() const {
+    return m_EAng.Radiant();
+}
 
-double GmArc::SAngDeg() const { return m_SAng.Degree(); }
+double GmArc::SAngDeg() const {
+    return m_SAng.Degree();
+}
 
-double GmArc::EAngDeg() const { return m_EAng.Degree(); }
+double GmArc::EAngDeg() const {
+    return m_EAng.Degree();
+}
 
-double GmArc::Ang() const { return std::fabs(GmDir(m_SAng).RAngle(GmDir(m_EAng), m_eDir)); }
+double GmArc::Ang() const {
+    return std::fabs(GmDir(m_SAng).RAngle(GmDir(m_EAng), m_eDir));
+}
 
-double GmArc::Ang2Pi() const { return IsFullCircle() ? 2.0 * gmkernel_detail::PI : Ang(); }
+double GmArc::Ang2Pi() const {
+    return IsFullCircle() ? 2.0 * gmkernel_detail::kPi : Ang();
+}
 
 bool GmArc::IsFullCircle() const {
     const double dx = m_EP.X() - m_SP.X();
@@ -194,7 +233,9 @@ GmPoint GmArc::SectionPoint(int i, int n) const {
     return GmPoint(m_M + radius.Rotated(GmAngle(sweep / n * i, true)));
 }
 
-GmPoint GmArc::HP() const { return SectionPoint(1, 2); }
+GmPoint GmArc::HP() const {
+    return SectionPoint(1, 2);
+}
 
 GmArc GmArc::Inverted() const {
     return GmArc(GmCircle(m_M, m_dR, false), m_EP, m_SP, static_cast<eRotDir>(-m_eDir));

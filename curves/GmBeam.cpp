@@ -1,12 +1,16 @@
 #include "gmkernel/GmBeam.h"
 
-GmBeam::GmBeam() { m_eType = eGmBeam; }
+GmBeam::GmBeam() {
+    m_eType = eGmBeam;
+}
 
 GmBeam::GmBeam(GmBeam const& beam) : GmLine(beam), boost::equality_comparable<GmBeam>(beam) {
     m_eType = eGmBeam;
 }
 
-GmBeam::GmBeam(GmPoint const& p1, GmPoint const& p2) : GmLine(p1, p2) { m_eType = eGmBeam; }
+GmBeam::GmBeam(GmPoint const& p1, GmPoint const& p2) : GmLine(p1, p2) {
+    m_eType = eGmBeam;
+}
 
 GmBeam::GmBeam(GmPoint const& p, GmDir const& dir) : GmBeam() {
     if (p.CreationOK() && dir.CreationOK()) Define(p, dir);
@@ -24,9 +28,13 @@ GmBeam& GmBeam::operator=(GmBeam const& beam) {
     return *this;
 }
 
-GmBeam* GmBeam::Clone() const { return new GmBeam(*this); }
+GmBeam* GmBeam::Clone() const {
+    return new GmBeam(*this);
+}
 
-void GmBeam::Invert() { GmLine::Invert(); }
+void GmBeam::Invert() {
+    GmLine::Invert();
+}
 
 bool GmBeam::Element(GmPoint const& p, double eps) const {
     const GmPoint foot = GmLine::MinDist(p, false);
@@ -39,11 +47,17 @@ GmPoint GmBeam::MinDist(GmPoint const& p, bool /*bPreferSP*/) const {
     return Element(foot) ? foot : m_SP;
 }
 
-void GmBeam::SetSP(GmPoint const& p) { m_SP = p; }
+void GmBeam::SetSP(GmPoint const& p) {
+    m_SP = p;
+}
 
-GmDir GmBeam::TangSP() const { return m_Dir; }
+GmDir GmBeam::TangSP() const {
+    return m_Dir;
+}
 
-GmBeam GmBeam::Inverted() const { return GmBeam(SP(), m_Dir.Inverted()); }
+GmBeam GmBeam::Inverted() const {
+    return GmBeam(SP(), m_Dir.Inverted());
+}
 
 bool GmBeam::operator==(GmBeam const& beam) const {
     if (this == &beam) return true;

@@ -54,7 +54,9 @@ void GmCircle::Define(GmPoint const& m, GmDir const& axis, double r) {
     m_bCreationOK = true;
 }
 
-GmCircle* GmCircle::Clone() const { return new GmCircle(*this); }
+GmCircle* GmCircle::Clone() const {
+    return new GmCircle(*this);
+}
 
 GmRect GmCircle::BoundingRect() const {
     return GmRect(GmPoint(m_M.X() - m_dR, m_M.Y() + m_dR), GmPoint(m_M.X() + m_dR, m_M.Y() - m_dR));
@@ -67,26 +69,42 @@ void GmCircle::Undefine() {
     m_Axis = GmDir(0.0, 0.0, 1.0);
 }
 
-bool GmCircle::Element(GmPoint const& p, double eps) const { return GmCircle::Dist(p) < eps; }
+bool GmCircle::Element(GmPoint const& p, double eps) const {
+    return GmCircle::Dist(p) < eps;
+}
 
-bool GmCircle::Element(GmPoint const& p) const { return Element(p, m_scdPrec); }
+bool GmCircle::Element(GmPoint const& p) const {
+    return Element(p, m_scdPrec);
+}
 
-double GmCircle::Dist(GmPoint const& p) const { return std::fabs(m_M.Dist(p) - m_dR); }
+double GmCircle::Dist(GmPoint const& p) const {
+    return std::fabs(m_M.Dist(p) - m_dR);
+}
 
-bool GmCircle::In(GmPoint const& p) { return m_M.Dist(p) < m_dR; }
+bool GmCircle::In(GmPoint const& p) {
+    return m_M.Dist(p) < m_dR;
+}
 
-bool GmCircle::Out(GmPoint const& p) { return m_M.Dist(p) > m_dR; }
+bool GmCircle::Out(GmPoint const& p) {
+    return m_M.Dist(p) > m_dR;
+}
 
 GmLine GmCircle::Tangent(GmPoint const& p) const {
     if (GmCircle::Dist(p) <= m_scdPrec) return GmLine(p, GmDir(m_M, p).Normalized(eRotCW));
     return GmLine();
 }
 
-double GmCircle::Length() const { return 2.0 * m_dR * gmkernel_detail::PI; }
+double GmCircle::Length() const {
+    return 2.0 * m_dR * gmkernel_detail::kPi;
+}
 
-GmCurve* GmCircle::GetParallel(double d) const { return new GmCircle(*this, d); }
+GmCurve* GmCircle::GetParallel(double d) const {
+    return new GmCircle(*this, d);
+}
 
-void GmCircle::Translation(GmVec const& v) { m_M.Translation(v); }
+void GmCircle::Translation(GmVec const& v) {
+    m_M.Translation(v);
+}
 
 void GmCircle::Transform(GmMatrix const& /*m*/) {}
 
@@ -94,17 +112,25 @@ std::string GmCircle::GetTraceString() const {
     return wxString::Format("circ (%0.5f, %0.5f) R = %0.5f", m_M.X(), m_M.Y(), m_dR).ToStdString();
 }
 
-GmPoint GmCircle::M() const { return m_M; }
+GmPoint GmCircle::M() const {
+    return m_M;
+}
 
-double GmCircle::R() const { return m_dR; }
+double GmCircle::R() const {
+    return m_dR;
+}
 
-GmDir const& GmCircle::Axis() const { return m_Axis; }
+GmDir const& GmCircle::Axis() const {
+    return m_Axis;
+}
 
 GmDir GmCircle::TangDir(GmPoint const& p) const {
     return Element(p) ? GmDir(m_M, p).Normalized(eRotCW) : GmDir();
 }
 
-double GmCircle::Dist(GmLine const& line) const { return std::max(0.0, line.Dist(m_M) - m_dR); }
+double GmCircle::Dist(GmLine const& line) const {
+    return std::max(0.0, line.Dist(m_M) - m_dR);
+}
 
 double GmCircle::Dist(GmCircle const& circle) const {
     const double larger = std::max(m_dR, circle.m_dR);
@@ -122,8 +148,7 @@ int GmCircle::IntersectionWithLine(GmLine const& line) const {
 }
 
 int GmCircle::IntersectionWithCircle(GmCircle const& circle) const {
-    const auto hits =
-        gmkernel_detail::intersectCircleCircle(m_M, m_dR, circle.m_M, circle.m_dR);
+    const auto hits = gmkernel_detail::intersectCircleCircle(m_M, m_dR, circle.m_M, circle.m_dR);
     m_ptSol.assign(hits.begin(), hits.end());
     return static_cast<int>(m_ptSol.size());
 }

@@ -17,7 +17,9 @@ GmCircle const* asCircle(GmCurve const* curve) {
 
 }  // namespace
 
-GmCurve::GmCurve() { m_eType = eGmCurve; }
+GmCurve::GmCurve() {
+    m_eType = eGmCurve;
+}
 
 GmCurve::GmCurve(GmCurve const& other)
     : GmBase(other), boost::equality_comparable<GmCurve>(other), m_ptSol(other.m_ptSol) {}
@@ -44,9 +46,13 @@ void GmCurve::CopyPtSol(GmCurve const& other) const {
     if (this != &other) m_ptSol = other.m_ptSol;
 }
 
-GmRect GmCurve::BoundingRect() const { return GmRect(); }
+GmRect GmCurve::BoundingRect() const {
+    return GmRect();
+}
 
-void GmCurve::Undefine() { GmBase::Undefine(); }
+void GmCurve::Undefine() {
+    GmBase::Undefine();
+}
 
 int GmCurve::Intersection(GmCurve const* other) const {
     if (other == nullptr) {
@@ -61,14 +67,24 @@ GmPoint GmCurve::GetSolution(unsigned int i) const {
     return i < m_ptSol.size() ? m_ptSol[i] : GmPoint(0.0, 0.0, 0.0);
 }
 
-std::vector<GmPoint> const& GmCurve::GetPtSol() const { return m_ptSol; }
+std::vector<GmPoint> const& GmCurve::GetPtSol() const {
+    return m_ptSol;
+}
 
-bool GmCurve::Trim(GmCurve* /*next*/) { return false; }
-GmCurve* GmCurve::Concat(GmCurve const& /*next*/, int /*mode*/) { return nullptr; }
-bool GmCurve::Concat(GmCurve const& /*next*/) { return false; }
+bool GmCurve::Trim(GmCurve* /*next*/) {
+    return false;
+}
+GmCurve* GmCurve::Concat(GmCurve const& /*next*/, int /*mode*/) {
+    return nullptr;
+}
+bool GmCurve::Concat(GmCurve const& /*next*/) {
+    return false;
+}
 void GmCurve::Invert() {}
 
-double GmCurve::DistSP(GmPoint const& /*p*/) const { return std::numeric_limits<double>::max(); }
+double GmCurve::DistSP(GmPoint const& /*p*/) const {
+    return std::numeric_limits<double>::max();
+}
 
 GmPoint GmCurve::MinDist(double& d, GmPoint const& p, bool bPreferSP) const {
     const GmPoint start = SP();
@@ -128,15 +144,29 @@ GmPoint GmCurve::MinDist(double& d, GmCurve const* c, bool bPreferSP) const {
     return best;
 }
 
-bool GmCurve::In(GmPoint const& /*p*/) { return false; }
-bool GmCurve::Out(GmPoint const& /*p*/) { return false; }
+bool GmCurve::In(GmPoint const& /*p*/) {
+    return false;
+}
+bool GmCurve::Out(GmPoint const& /*p*/) {
+    return false;
+}
 void GmCurve::SetSP(GmPoint const& /*p*/) {}
 void GmCurve::SetEP(GmPoint const& /*p*/) {}
-GmPoint GmCurve::SP() const { return GmPoint(); }
-GmPoint GmCurve::EP() const { return GmPoint(); }
-GmDir GmCurve::TangSP() const { return GmDir(); }
-GmDir GmCurve::TangEP() const { return GmDir(); }
-double GmCurve::Length() const { return 0.0; }
+GmPoint GmCurve::SP() const {
+    return GmPoint();
+}
+GmPoint GmCurve::EP() const {
+    return GmPoint();
+}
+GmDir GmCurve::TangSP() const {
+    return GmDir();
+}
+GmDir GmCurve::TangEP() const {
+    return GmDir();
+}
+double GmCurve::Length() const {
+    return 0.0;
+}
 
 // Pure, with an empty body that derived classes may use.
 void GmCurve::Transform(GmMatrix const& /*m*/) {}
@@ -162,4 +192,6 @@ bool less_than_curve::operator()(GmPoint const& a, GmPoint const& b) const {
 
 point_is_element::point_is_element(GmCurve const* curve) : m_pCurve(curve) {}
 
-bool point_is_element::operator()(GmPoint p) const { return m_pCurve->Element(p); }
+bool point_is_element::operator()(GmPoint p) const {
+    return m_pCurve->Element(p);
+}

@@ -12,10 +12,7 @@ GmLine::GmLine() {
 }
 
 GmLine::GmLine(GmLine const& line)
-    : GmCurve(line),
-      boost::equality_comparable<GmLine>(line),
-      m_SP(line.m_SP),
-      m_Dir(line.m_Dir) {
+    : GmCurve(line), boost::equality_comparable<GmLine>(line), m_SP(line.m_SP), m_Dir(line.m_Dir) {
     m_eType = eGmLine;
 }
 
@@ -92,9 +89,13 @@ void GmLine::Define(GmPoint const& p, GmDir const& dir) {
     m_bCreationOK = true;
 }
 
-GmLine* GmLine::Clone() const { return new GmLine(*this); }
+GmLine* GmLine::Clone() const {
+    return new GmLine(*this);
+}
 
-GmRect GmLine::BoundingRect() const { return m_SP.BoundingRect(); }
+GmRect GmLine::BoundingRect() const {
+    return m_SP.BoundingRect();
+}
 
 void GmLine::Undefine() {
     GmCurve::Undefine();
@@ -102,11 +103,17 @@ void GmLine::Undefine() {
     m_SP = GmPoint();
 }
 
-void GmLine::Invert() { m_Dir = -m_Dir; }
+void GmLine::Invert() {
+    m_Dir = -m_Dir;
+}
 
-bool GmLine::Element(GmPoint const& p, double eps) const { return p.Dist(NP(p)) < eps; }
+bool GmLine::Element(GmPoint const& p, double eps) const {
+    return p.Dist(NP(p)) < eps;
+}
 
-bool GmLine::Element(GmPoint const& p) const { return Element(p, m_scdPrec); }
+bool GmLine::Element(GmPoint const& p) const {
+    return Element(p, m_scdPrec);
+}
 
 double GmLine::Dist(GmPoint const& p) const {
     const gmkernel_detail::SlopeForm form = gmkernel_detail::slopeForm(m_SP, m_Dir);
@@ -114,7 +121,9 @@ double GmLine::Dist(GmPoint const& p) const {
     return std::fabs(p.Y() - form.k * p.X() - form.d) / std::sqrt(form.k * form.k + 1.0);
 }
 
-double GmLine::DistSP(GmPoint const& p) const { return m_SP.Dist(p); }
+double GmLine::DistSP(GmPoint const& p) const {
+    return m_SP.Dist(p);
+}
 
 GmPoint GmLine::MinDist(GmPoint const& p, bool /*bPreferSP*/) const {
     const GmVec dir(m_Dir);
@@ -122,27 +131,47 @@ GmPoint GmLine::MinDist(GmPoint const& p, bool /*bPreferSP*/) const {
     return GmPoint(m_SP + t * dir);
 }
 
-GmPoint GmLine::SP() const { return m_SP; }
+GmPoint GmLine::SP() const {
+    return m_SP;
+}
 
-GmPoint GmLine::NP(GmPoint const& p) const { return MinDist(p, false); }
+GmPoint GmLine::NP(GmPoint const& p) const {
+    return MinDist(p, false);
+}
 
-GmLine GmLine::Tangent(GmPoint const& /*p*/) const { return GmLine(*this); }
+GmLine GmLine::Tangent(GmPoint const& /*p*/) const {
+    return GmLine(*this);
+}
 
-GmCurve* GmLine::GetParallel(double d) const { return new GmLine(*this, d); }
+GmCurve* GmLine::GetParallel(double d) const {
+    return new GmLine(*this, d);
+}
 
-void GmLine::Translation(GmVec const& v) { m_SP.Translation(v); }
+void GmLine::Translation(GmVec const& v) {
+    m_SP.Translation(v);
+}
 
 void GmLine::Transform(GmMatrix const& /*m*/) {}
 
-std::string GmLine::GetTraceString() const { return {}; }
+std::string GmLine::GetTraceString() const {
+    return {};
+}
 
-GmDir const& GmLine::Dir() const { return m_Dir; }
+GmDir const& GmLine::Dir() const {
+    return m_Dir;
+}
 
-double GmLine::k() const { return gmkernel_detail::slopeForm(m_SP, m_Dir).k; }
+double GmLine::k() const {
+    return gmkernel_detail::slopeForm(m_SP, m_Dir).k;
+}
 
-double GmLine::d() const { return gmkernel_detail::slopeForm(m_SP, m_Dir).d; }
+double GmLine::d() const {
+    return gmkernel_detail::slopeForm(m_SP, m_Dir).d;
+}
 
-GmDir GmLine::Normal() const { return m_Dir.Normalized(eRotCW); }
+GmDir GmLine::Normal() const {
+    return m_Dir.Normalized(eRotCW);
+}
 
 double GmLine::Dist(GmLine const& line) const {
     return GmParallelDir(m_Dir, line.m_Dir) ? Dist(line.SP()) : 0.0;
@@ -160,7 +189,9 @@ int GmLine::IntersectionWithLine(GmLine const& line) const {
     return static_cast<int>(m_ptSol.size());
 }
 
-GmLine GmLine::Inverted() const { return GmLine(SP(), -m_Dir); }
+GmLine GmLine::Inverted() const {
+    return GmLine(SP(), -m_Dir);
+}
 
 bool GmLine::operator==(GmLine const& line) const {
     if (this == &line) return true;

@@ -9,7 +9,9 @@
 #include "gmkernel/GmArc.h"
 #include "gmkernel/GmRect.h"
 
-GmStretch::GmStretch() { m_eType = eGmStretch; }
+GmStretch::GmStretch() {
+    m_eType = eGmStretch;
+}
 
 GmStretch::GmStretch(GmStretch const& stretch)
     : GmLine(stretch), boost::equality_comparable<GmStretch>(stretch), m_EP(stretch.m_EP) {
@@ -43,16 +45,22 @@ GmStretch& GmStretch::operator=(GmStretch const& stretch) {
     return *this;
 }
 
-GmStretch* GmStretch::Clone() const { return new GmStretch(*this); }
+GmStretch* GmStretch::Clone() const {
+    return new GmStretch(*this);
+}
 
-GmRect GmStretch::BoundingRect() const { return GmRect(m_SP, m_EP); }
+GmRect GmStretch::BoundingRect() const {
+    return GmRect(m_SP, m_EP);
+}
 
 void GmStretch::Undefine() {
     GmLine::Undefine();
     m_EP = GmPoint();
 }
 
-bool GmStretch::Trim(GmCurve* next) { return gmkernel_detail::trimToCrossing(*this, next); }
+bool GmStretch::Trim(GmCurve* next) {
+    return gmkernel_detail::trimToCrossing(*this, next);
+}
 
 GmCurve* GmStretch::Concat(GmCurve const& next, int mode) {
     GmLine normalAtNext;
@@ -93,7 +101,9 @@ bool GmStretch::Element(GmPoint const& p, double eps) const {
     return gmkernel_detail::onSegment(foot, m_SP, m_EP, m_Dir) && foot.Dist(p) < eps;
 }
 
-double GmStretch::Dist(GmPoint const& p) const { return p.Dist(MinDist(p, false)); }
+double GmStretch::Dist(GmPoint const& p) const {
+    return p.Dist(MinDist(p, false));
+}
 
 GmPoint GmStretch::MinDist(GmPoint const& p, bool bPreferSP) const {
     const GmPoint foot = GmLine::MinDist(p, false);
@@ -116,15 +126,25 @@ void GmStretch::FollowEnds() {
     if (m_SP != m_EP) m_Dir = m_SP.Dir(m_EP);
 }
 
-GmPoint GmStretch::EP() const { return m_EP; }
+GmPoint GmStretch::EP() const {
+    return m_EP;
+}
 
-GmDir GmStretch::TangSP() const { return m_Dir; }
+GmDir GmStretch::TangSP() const {
+    return m_Dir;
+}
 
-GmDir GmStretch::TangEP() const { return m_Dir; }
+GmDir GmStretch::TangEP() const {
+    return m_Dir;
+}
 
-double GmStretch::Length() const { return m_SP.Dist(m_EP); }
+double GmStretch::Length() const {
+    return m_SP.Dist(m_EP);
+}
 
-GmCurve* GmStretch::GetParallel(double d) const { return new GmStretch(*this, d); }
+GmCurve* GmStretch::GetParallel(double d) const {
+    return new GmStretch(*this, d);
+}
 
 void GmStretch::Translation(GmVec const& v) {
     m_SP.Translation(v);
@@ -143,11 +163,17 @@ std::string GmStretch::GetTraceString() const {
         .ToStdString();
 }
 
-GmPoint GmStretch::HP() const { return GmPoint(m_SP, m_EP); }
+GmPoint GmStretch::HP() const {
+    return GmPoint(m_SP, m_EP);
+}
 
-GmDir GmStretch::TangHP() const { return m_Dir; }
+GmDir GmStretch::TangHP() const {
+    return m_Dir;
+}
 
-GmStretch GmStretch::Inverted() const { return GmStretch(m_EP, m_SP); }
+GmStretch GmStretch::Inverted() const {
+    return GmStretch(m_EP, m_SP);
+}
 
 bool GmStretch::operator==(GmStretch const& stretch) const {
     return this == &stretch || (m_SP == stretch.m_SP && m_EP == stretch.m_EP);

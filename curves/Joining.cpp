@@ -12,15 +12,16 @@ namespace gmkernel_detail {
 
 namespace {
 
-/// The largest relative difference of the distances from the centre to the ends of a connecting arc.
-constexpr double RADIUS_RATIO = 0.05;
+/// The largest relative difference of the distances from the centre to the ends of a connecting
+/// arc.
+constexpr double kRadiusRatio = 0.05;
 
 /// Can an arc about `centre` connect both points?
 bool fitsRadius(GmPoint const& centre, GmPoint const& start, GmPoint const& end) {
     const double rStart = centre.Dist(start);
     const double rEnd = centre.Dist(end);
     const double ratio = rStart / rEnd;
-    return 1.0 - RADIUS_RATIO < ratio && ratio < 1.0 + RADIUS_RATIO &&
+    return 1.0 - kRadiusRatio < ratio && ratio < 1.0 + kRadiusRatio &&
            std::fabs(rStart - rEnd) < GmBase::m_scdPrec;
 }
 

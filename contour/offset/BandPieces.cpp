@@ -51,8 +51,8 @@ GmPoint meetingOfCaps(GmArc const& arc, double d) {
 void shortenCaps(GmArc const& arc, double d, Cap& start, Cap& end) {
     if (!(arc.R() <= std::fabs(d))) return;
     const GmPoint meeting = meetingOfCaps(arc, d);
-    const bool awayFromCentre = (d > 0.0 && arc.Dir() == GmBase::eRotCCW) ||
-                                (d < 0.0 && arc.Dir() == GmBase::eRotCW);
+    const bool awayFromCentre =
+        (d > 0.0 && arc.Dir() == GmBase::eRotCCW) || (d < 0.0 && arc.Dir() == GmBase::eRotCW);
     if (awayFromCentre) {
         start.from = meeting;
         end.to = meeting;

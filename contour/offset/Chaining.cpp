@@ -7,12 +7,12 @@ namespace gmkernel_detail {
 namespace {
 
 /// How far apart the end of a chain and the start of the next piece may lie, in length tolerances.
-constexpr double JOINT_GAP = 3.0;
+constexpr double kJointGap = 3.0;
 /// Pieces below this length are left out of the results, in length units.
-constexpr double SHORTEST_PIECE = 0.001;
+constexpr double kShortestPiece = 0.001;
 
 bool startsAt(Piece const& piece, GmPoint const& p) {
-    return piece.element.curve().SP().Dist(p) < JOINT_GAP * GmBase::m_scdPrec;
+    return piece.element.curve().SP().Dist(p) < kJointGap * GmBase::m_scdPrec;
 }
 
 bool anyStartsAt(PieceList const& pieces, GmPoint const& p) {
@@ -70,7 +70,7 @@ PieceList takeChain(PieceList& pieces) {
     growBackward(chain, pieces);
     growForward(chain, pieces);
     chain.remove_if(
-        [](Piece const& piece) { return piece.element.curve().Length() < SHORTEST_PIECE; });
+        [](Piece const& piece) { return piece.element.curve().Length() < kShortestPiece; });
     return chain;
 }
 

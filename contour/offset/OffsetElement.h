@@ -12,7 +12,8 @@ public:
     /// @param curve the piece, taken over
     /// @param source index of the source element whose band the piece belongs to
     /// @param id identifier of the source element, carried to the results
-    /// @param kept true for the offset on the chosen side and for the end cap; the other pieces only
+    /// @param kept true for the offset on the chosen side and for the end cap; the other pieces
+    /// only
     ///        serve to cut
     /// @param auxiliary false only for the offset on the chosen side
     GmOffsetElement(GmCurve* curve, int source, int id, bool kept, bool auxiliary);

@@ -1,10 +1,10 @@
 /// @file
 /// Offsetting a contour at a constant distance.
 ///
-/// A band construction: the points at distance |d| from the contour are bounded by the boundaries of
-/// the elements' bands. All band pieces are cut at their mutual crossings, so that each remaining
-/// piece lies wholly at the distance or wholly too near, and its halving point decides. What keeps
-/// its distance on the chosen side is chained into the results.
+/// A band construction: the points at distance |d| from the contour are bounded by the boundaries
+/// of the elements' bands. All band pieces are cut at their mutual crossings, so that each
+/// remaining piece lies wholly at the distance or wholly too near, and its halving point decides.
+/// What keeps its distance on the chosen side is chained into the results.
 ///
 /// The bands of single elements are exact, but caps touch the offsets of their neighbours, so the
 /// distance test must not be strict: it leaves the calculation tolerance. Cost: quadratic in the
@@ -22,7 +22,7 @@ namespace {
 using namespace gmkernel_detail;
 
 /// The span that lets every element cut and test every piece.
-constexpr int WHOLE_CONTOUR = 1000000;
+constexpr int kWholeContour = 1000000;
 
 bool goesInside(GmBase::eRotDir sense, double d) {
     return (sense == GmBase::eRotCW && d > 0.0) || (sense == GmBase::eRotCCW && d < 0.0);
@@ -39,10 +39,9 @@ int GmContour::Offsetting(double d, int nSpan, bool bKeepOpen) {
         RemoveAllSubConts();
         return 0;
     }
-    const bool insideOnly =
-        IsClosed() && !bKeepOpen && goesInside(Dir(GmPoint(0.0, 0.0, 0.0)), d);
+    const bool insideOnly = IsClosed() && !bKeepOpen && goesInside(Dir(GmPoint(0.0, 0.0, 0.0)), d);
 
-    BandSweep sweep(d, insideOnly ? WHOLE_CONTOUR : nSpan);
+    BandSweep sweep(d, insideOnly ? kWholeContour : nSpan);
     for (int i = 0; i < ElementCount(); ++i) {
         sweep.add(*GetContElement(i));
     }
@@ -59,5 +58,5 @@ int GmContour::Offsetting(double d, int nSpan, bool bKeepOpen) {
 }
 
 int GmContour::ParallelContours(double d, bool /*unused*/, bool /*unused*/, bool /*unused*/) {
-    return Offsetting(d, WHOLE_CONTOUR, false);
+    return Offsetting(d, kWholeContour, false);
 }

@@ -8,7 +8,7 @@ namespace gmkernel_detail {
 namespace {
 
 /// Twice the membership tolerance of arcs, in length units.
-constexpr double REACH_MARGIN = 0.02;
+constexpr double kReachMargin = 0.02;
 
 /// Does the arc's membership test accept points all around the circle? Arcs whose ends are equal
 /// within the point tolerance count as full circles there, whatever their sweep.
@@ -36,8 +36,8 @@ GmRect arcReach(GmArc const& arc) {
 PieceBox reachOf(GmCurve const& piece) {
     const GmRect box =
         piece.IsArc() ? arcReach(static_cast<GmArc const&>(piece)) : piece.BoundingRect();
-    return {box.Left() - REACH_MARGIN, box.Right() + REACH_MARGIN, box.Bottom() - REACH_MARGIN,
-            box.Top() + REACH_MARGIN};
+    return {box.Left() - kReachMargin, box.Right() + kReachMargin, box.Bottom() - kReachMargin,
+            box.Top() + kReachMargin};
 }
 
 }  // namespace gmkernel_detail

@@ -25,19 +25,19 @@ double measureSwapped(GmBase const& first, GmBase const& second) {
 }
 
 DistanceMap buildMap() {
-    constexpr auto POINT = GmBase::eGmPoint;
-    constexpr auto ARC = GmBase::eGmArc;
-    constexpr auto STRETCH = GmBase::eGmStretch;
+    constexpr auto kPoint = GmBase::eGmPoint;
+    constexpr auto kArc = GmBase::eGmArc;
+    constexpr auto kStretch = GmBase::eGmStretch;
     return {
-        {pairKey(POINT, POINT), measurePair<GmPoint, GmPoint>},
-        {pairKey(POINT, ARC), measurePair<GmPoint, GmArc>},
-        {pairKey(ARC, POINT), measureSwapped<GmPoint, GmArc>},
-        {pairKey(POINT, STRETCH), measurePair<GmPoint, GmStretch>},
-        {pairKey(STRETCH, POINT), measureSwapped<GmPoint, GmStretch>},
-        {pairKey(ARC, ARC), measurePair<GmArc, GmArc>},
-        {pairKey(ARC, STRETCH), measurePair<GmArc, GmStretch>},
-        {pairKey(STRETCH, ARC), measureSwapped<GmArc, GmStretch>},
-        {pairKey(STRETCH, STRETCH), measurePair<GmStretch, GmStretch>},
+        {pairKey(kPoint, kPoint), measurePair<GmPoint, GmPoint>},
+        {pairKey(kPoint, kArc), measurePair<GmPoint, GmArc>},
+        {pairKey(kArc, kPoint), measureSwapped<GmPoint, GmArc>},
+        {pairKey(kPoint, kStretch), measurePair<GmPoint, GmStretch>},
+        {pairKey(kStretch, kPoint), measureSwapped<GmPoint, GmStretch>},
+        {pairKey(kArc, kArc), measurePair<GmArc, GmArc>},
+        {pairKey(kArc, kStretch), measurePair<GmArc, GmStretch>},
+        {pairKey(kStretch, kArc), measureSwapped<GmArc, GmStretch>},
+        {pairKey(kStretch, kStretch), measurePair<GmStretch, GmStretch>},
     };
 }
 

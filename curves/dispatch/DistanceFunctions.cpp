@@ -63,9 +63,13 @@ double squaredFacing(GmArc const& a, GmArc const& b) {
 
 }  // namespace
 
-double distance(GmPoint const& a, GmPoint const& b) { return a.Dist(b); }
+double distance(GmPoint const& a, GmPoint const& b) {
+    return a.Dist(b);
+}
 
-double distance(GmPoint const& p, GmArc const& arc) { return std::sqrt(squared(p, arc)); }
+double distance(GmPoint const& p, GmArc const& arc) {
+    return std::sqrt(squared(p, arc));
+}
 
 double distance(GmPoint const& p, GmStretch const& stretch) {
     return std::sqrt(squared(p, stretch));

@@ -1,9 +1,9 @@
 /// @file
 /// Which kernel intersects which ordered pair of curves.
 ///
-/// A kernel works on the infinite carriers and full circles; its points are kept where every bounded
-/// curve of the pair accepts them. Swapped pairs run the same function with swapped arguments, so
-/// that both give the same points in the same order.
+/// A kernel works on the infinite carriers and full circles; its points are kept where every
+/// bounded curve of the pair accepts them. Swapped pairs run the same function with swapped
+/// arguments, so that both give the same points in the same order.
 #include <stdexcept>
 #include <unordered_map>
 #include <vector>
@@ -25,11 +25,21 @@ using IntersectionEntry = void (*)(GmBase const&, GmBase const&, Points&);
 using IntersectionMap = std::unordered_map<int, IntersectionEntry>;
 
 // Does a point that lies on the carrier or the full circle also lie on the curve itself?
-bool holds(GmLine const&, GmPoint const&) { return true; }
-bool holds(GmCircle const&, GmPoint const&) { return true; }
-bool holds(GmBeam const& beam, GmPoint const& p) { return beam.Element(p); }
-bool holds(GmStretch const& stretch, GmPoint const& p) { return stretch.Element(p); }
-bool holds(GmArc const& arc, GmPoint const& p) { return arc.Element(p); }
+bool holds(GmLine const&, GmPoint const&) {
+    return true;
+}
+bool holds(GmCircle const&, GmPoint const&) {
+    return true;
+}
+bool holds(GmBeam const& beam, GmPoint const& p) {
+    return beam.Element(p);
+}
+bool holds(GmStretch const& stretch, GmPoint const& p) {
+    return stretch.Element(p);
+}
+bool holds(GmArc const& arc, GmPoint const& p) {
+    return arc.Element(p);
+}
 
 Hits<1> kernel(GmLine const& a, GmLine const& b) {
     return intersectLineLine(a.SP(), a.Dir(), b.SP(), b.Dir());

@@ -2,8 +2,8 @@
 /// Circle against straight carrier.
 ///
 /// With the carrier as y = k x + d and u the x offset from the centre, the crossings are the roots
-/// of A u^2 + B u + C = 0. The roots come from q = -(B + sgn(B) sqrt(D)) / 2 as q / A and C / q, the
-/// form without cancellation (Press et al., Numerical Recipes, section 5.6). A line that passes
+/// of A u^2 + B u + C = 0. The roots come from q = -(B + sgn(B) sqrt(D)) / 2 as q / A and C / q,
+/// the form without cancellation (Press et al., Numerical Recipes, section 5.6). A line that passes
 /// within the length tolerance of the circle touches it: then the foot on the circle in the
 /// direction of the line's normal counts, provided that the line really comes that near.
 #pragma once

@@ -2,6 +2,6 @@
 
 namespace gmkernel_detail {
 
-constexpr double PI = 3.14159265358979323846;
+constexpr double kPi = 3.14159265358979323846;
 
 }  // namespace gmkernel_detail

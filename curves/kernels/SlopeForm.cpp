@@ -2,7 +2,9 @@
 
 namespace gmkernel_detail {
 
-bool parallelToYAxis(GmDir const& dir) { return GmParallelDir(dir, GmDir(0.0, 1.0, 0.0)); }
+bool parallelToYAxis(GmDir const& dir) {
+    return GmParallelDir(dir, GmDir(0.0, 1.0, 0.0));
+}
 
 SlopeForm slopeForm(GmPoint const& sp, GmDir const& dir) {
     if (parallelToYAxis(dir)) return {true, 0.0, sp.X()};

@@ -30,19 +30,20 @@ public:
     GmArc(GmCircle const& circle, GmPoint const& sp, GmPoint const& ep, bool bShort);
     /// The arc on a circle between two polar angles (radians); undefined when the circle is.
     GmArc(GmCircle const& circle, double sAng, double eAng, eRotDir rot);
-    /// The arc about `m` between two polar angles (radians); undefined when `m` is or when the radius
-    /// falls below m_scdPrec.
+    /// The arc about `m` between two polar angles (radians); undefined when `m` is or when the
+    /// radius falls below m_scdPrec.
     GmArc(GmPoint const& m, double r, double sAng, double eAng, eRotDir rot);
     /// The arc from `sp` to `ep` about a centre near `m`: where the two distances from `m` differ,
     /// the centre moves to the point of the perpendicular bisector on the same side that keeps the
-    /// radius |m sp| (|m ep| where the chord is longer than the diameter). Undefined when a point is.
+    /// radius |m sp| (|m ep| where the chord is longer than the diameter). Undefined when a point
+    /// is.
     GmArc(GmPoint const& sp, GmPoint const& ep, GmPoint const& m, eRotDir rot);
-    /// The arc from `p1` through `p2` to `p3`; undefined when a point is, when two are equal or when
-    /// all are collinear.
+    /// The arc from `p1` through `p2` to `p3`; undefined when a point is, when two are equal or
+    /// when all are collinear.
     GmArc(GmPoint const& p1, GmPoint const& p2, GmPoint const& p3);
-    /// The arc of radius |r| from `sp` to `ep` in the given sense with a sweep of at most 180 degrees
-    /// (bShort) or more; undefined when a point is, when the points are equal or when no such arc
-    /// exists.
+    /// The arc of radius |r| from `sp` to `ep` in the given sense with a sweep of at most 180
+    /// degrees (bShort) or more; undefined when a point is, when the points are equal or when no
+    /// such arc exists.
     GmArc(GmPoint const& sp, GmPoint const& ep, double r, bool bShort, eRotDir rot);
     /// The parallel arc at the signed distance `d`, positive to the right of the direction of
     /// travel, with the same centre and angles; not created, with radius 0, when the new radius
@@ -71,10 +72,10 @@ public:
     /// GmStretch::Concat; else a stretch. Null for any other mode, and for mode 1 where `next` is
     /// neither a stretch nor an arc.
     GmCurve* Concat(GmCurve const& next, int mode) override;
-    /// Moves this end and the start of `next` (although it is passed as constant) to the crossing of
-    /// this full circle with the carrier of a stretch (the crossing nearer to this end) or with the
-    /// full circle of an arc (at the smaller angle from this end). Without a crossing true only for
-    /// an arc that already starts at this end.
+    /// Moves this end and the start of `next` (although it is passed as constant) to the crossing
+    /// of this full circle with the carrier of a stretch (the crossing nearer to this end) or with
+    /// the full circle of an arc (at the smaller angle from this end). Without a crossing true only
+    /// for an arc that already starts at this end.
     bool Concat(GmCurve const& next) override;
     /// Swaps the ends and reverses the sense.
     void Invert() override;
@@ -111,14 +112,14 @@ public:
     GmCurve* GetParallel(double d) const override;
     /// Moves centre and ends.
     void Translation(GmVec const& v) override;
-    /// Transforms ends and centre and rebuilds the arc from them; a mirroring transform reverses the
-    /// sense. Shapes other than circles cannot result: a non-uniform scale keeps the ends.
+    /// Transforms ends and centre and rebuilds the arc from them; a mirroring transform reverses
+    /// the sense. Shapes other than circles cannot result: a non-uniform scale keeps the ends.
     void Transform(GmMatrix const& m) override;
     /// "circ2 (x, y) - (x, y) mp (x, y)" with five decimals: start, end, centre; "circ3" for every
     /// arc that is not clockwise.
     std::string GetTraceString() const override;
-    /// The box over the arc; `true` leaves the case of a full circle out, which then answers the box
-    /// of its end point.
+    /// The box over the arc; `true` leaves the case of a full circle out, which then answers the
+    /// box of its end point.
     virtual GmRect BoundingRect(bool bIgnoreFullCircle) const;
 
     /// The sense of rotation.
@@ -143,7 +144,8 @@ public:
     GmPoint HP() const;
     /// The direction of travel at HP().
     GmDir TangHP() const;
-    /// The arc from end to start in the opposite sense; not created when a point lies off the circle.
+    /// The arc from end to start in the opposite sense; not created when a point lies off the
+    /// circle.
     GmArc Inverted() const;
     /// The same object, or equal circle, points, angles and sense.
     bool operator==(GmArc const& arc) const;

@@ -21,8 +21,8 @@ public:
     GmBeam(GmPoint const& p1, GmPoint const& p2);
     /// The ray from `p` along `dir`; undefined when one of them is.
     GmBeam(GmPoint const& p, GmDir const& dir);
-    /// The parallel ray at the signed distance `d`, positive to the right; carries the creation flag
-    /// of `beam`, its fields are computed also when that is undefined.
+    /// The parallel ray at the signed distance `d`, positive to the right; carries the creation
+    /// flag of `beam`, its fields are computed also when that is undefined.
     GmBeam(GmBeam const& beam, double d);
     ~GmBeam() override;
     /// Copies origin, direction, creation flag and solution list.

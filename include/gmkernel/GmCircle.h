@@ -23,8 +23,8 @@ public:
     /// Copies centre, radius, axis, creation flag and solution list; the copy is a circle also when
     /// the source is an arc.
     GmCircle(GmCircle const& circle);
-    /// The circle of radius |r| (length units, 0 allowed) about `m`; undefined when `m` is. The flag
-    /// has no effect.
+    /// The circle of radius |r| (length units, 0 allowed) about `m`; undefined when `m` is. The
+    /// flag has no effect.
     GmCircle(GmPoint const& m, double r, bool flag);
     /// The circle of radius |r| about `m` in the plane with the given axis; undefined when `m` is.
     GmCircle(GmPoint const& m, GmDir const& axis, double r);
@@ -77,7 +77,8 @@ public:
     /// "circ (x, y) R = r" with five decimals: centre, radius.
     std::string GetTraceString() const override;
 
-    /// The point in which a line touches the circle (within m_scdPrec); undefined where it does not.
+    /// The point in which a line touches the circle (within m_scdPrec); undefined where it does
+    /// not.
     virtual GmPoint GetTangPoint(GmLine const& line);
     /// The point in which another circle touches this one from outside or inside (within
     /// m_scdPrec); undefined where it does not, and for equal radii in internal contact.
@@ -117,7 +118,7 @@ protected:
     /// Sets centre, axis and radius and marks the circle as created.
     void Define(GmPoint const& m, GmDir const& axis, double r);
 
-    GmPoint m_M;    ///< centre
-    GmDir m_Axis;   ///< axis of the plane
-    double m_dR;    ///< radius
+    GmPoint m_M;   ///< centre
+    GmDir m_Axis;  ///< axis of the plane
+    double m_dR;   ///< radius
 };

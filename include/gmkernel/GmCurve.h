@@ -139,8 +139,9 @@ public:
     /// A one-line description for diagnostics.
     virtual std::string GetTraceString() const = 0;
 
-    /// True for the very same object, else when the solution lists have the same length and pairwise
-    /// equal points. Nothing else is compared here; derived classes compare their own fields.
+    /// True for the very same object, else when the solution lists have the same length and
+    /// pairwise equal points. Nothing else is compared here; derived classes compare their own
+    /// fields.
     bool operator==(GmCurve const& other) const;
 
 protected:
@@ -162,7 +163,8 @@ private:
 
 /// Intersects two objects and stores the points in `result`, which is cleared first. The same as
 /// GmCurve::Intersection, but no curve's own solution list is touched unless a contour takes part.
-/// @throw std::runtime_error "Function not found" for a pair that cannot be intersected; `result` is
+/// @throw std::runtime_error "Function not found" for a pair that cannot be intersected; `result`
+/// is
 ///        empty then
 GMKERNEL_EXPORT void Intersection(GmBase const& a, GmBase const& b, std::vector<GmPoint>& result);
 

@@ -48,8 +48,8 @@ public:
     /// A line made from two points, see eLineCustructionTypePP (any other value goes through both);
     /// undefined when a point is or when the points are equal.
     GmLine(GmPoint const& p1, GmPoint const& p2, eLineCustructionTypePP type);
-    /// The parallel at the signed distance `d` (length units), positive to the right; undefined when
-    /// `line` is.
+    /// The parallel at the signed distance `d` (length units), positive to the right; undefined
+    /// when `line` is.
     GmLine(GmLine const& line, double d);
     /// The bisector of two lines: through their crossing along the sum of both unit directions, so
     /// that reversing one line gives the other, perpendicular bisector. Of parallel lines it is the

@@ -206,7 +206,7 @@ TEST(ContourBuilding, CloseJoinsTheEndsUnlessTheyMeet) {
     EXPECT_TRUE(contour.IsClosed());
     EXPECT_EQ(contour, shapes::Polygon({GmPoint(0, 0), GmPoint(10, 0), GmPoint(10, 10)}));
     EXPECT_EQ(contour.GetContElement(2)->lId, 0);
-    contour.Close(true);
+    contour.Close(false);
     EXPECT_EQ(contour.ElementCount(), 3);
     GmContour empty;
     empty.Close(true);

@@ -82,8 +82,12 @@ TEST(ContourIntersection, TwoContoursMeetInsideTheirElementsOrAlsoAtEnds) {
     const GmContour diamond =
         shapes::Polygon({GmPoint(10, 5), GmPoint(15, 0), GmPoint(20, 5), GmPoint(15, 10)});
     EXPECT_EQ(square.Intersection(&diamond, false), 0);
-    EXPECT_EQ(square.Intersection(&diamond, true), 1);
-    EXPECT_EQ(square.GetSolution(0), GmPoint(10, 5));
+    for (int first = 0; first < 4; ++first) {
+        const GmContour turned = shapes::StartedAt(diamond, first);
+        EXPECT_EQ(square.Intersection(&turned, true), 1);
+        EXPECT_EQ(square.GetSolution(0), GmPoint(10, 5));
+        EXPECT_EQ(turned.Intersection(&square, true), 1);
+    }
     EXPECT_EQ(square.Intersection(static_cast<GmContour const*>(nullptr), true), 0);
 }
 

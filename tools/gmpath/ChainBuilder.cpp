@@ -20,7 +20,7 @@ struct OrderedContour {
 std::size_t dropShort(std::vector<Path>& paths) {
     std::size_t dropped = 0;
     for (Path& path : paths)
-        dropped += dropShortElements(path);
+        dropped += dropShortElements(path, kKernelTolerance);
     const auto empty = [](const Path& path) { return path.elements.empty(); };
     paths.erase(std::remove_if(paths.begin(), paths.end(), empty), paths.end());
     return dropped;

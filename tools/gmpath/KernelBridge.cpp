@@ -2,6 +2,7 @@
 
 #include <memory>
 
+#include "ShortElements.h"
 #include "gmkernel/GmArc.h"
 #include "gmkernel/GmContour.h"
 #include "gmkernel/GmStretch.h"
@@ -14,6 +15,16 @@ constexpr double kPi = 3.14159265358979323846;
 
 /// Every element of the source stays in view, whatever its length.
 constexpr int kWholeContour = 1'000'000;
+
+/// Elements below this length are passed over.
+constexpr double kShortestForKernel = 10.0 * kKernelTolerance;
+
+/// The path without what is too short for the kernel; a path that small altogether stays as it is.
+Path simplified(const Path& path) {
+    Path result = path;
+    dropShortElements(result, kShortestForKernel);
+    return result.elements.empty() ? path : result;
+}
 
 GmPoint kernelPoint(Vec2 p) {
     return {p.x, p.y};
@@ -77,7 +88,7 @@ Path pathFrom(const GmContour& contour, const std::string& layer) {
 
 KernelOffset offsetByKernel(const Path& path, double d) {
     GmContour contour;
-    if (!fill(contour, path)) return {{}, false};
+    if (!fill(contour, simplified(path))) return {{}, false};
     const bool keepOpen = !path.closed;
     contour.Offsetting(d, kWholeContour, keepOpen);
     KernelOffset offset;

@@ -4,19 +4,19 @@ namespace gmpath {
 
 namespace {
 
-bool isShort(const Element& e) {
-    return length(e) < kKernelTolerance || radius(e) < kKernelTolerance;
+bool isShort(const Element& e, double shortest) {
+    return length(e) < shortest || radius(e) < shortest;
 }
 
 }  // namespace
 
-std::size_t dropShortElements(Path& path) {
+std::size_t dropShortElements(Path& path, double shortest) {
     if (path.elements.empty()) return 0;
     std::vector<Element> kept;
     Vec2 sp = path.elements.front().sp;
     for (const Element& e : path.elements) {
         const Element moved = straightened(withEnds(e, sp, e.ep));
-        if (isShort(moved)) continue;
+        if (isShort(moved, shortest)) continue;
         kept.push_back(moved);
         sp = moved.ep;
     }

@@ -6,10 +6,10 @@
 
 namespace gmpath {
 
-/// Drops the elements of a path that are shorter than the kernel's tolerance, or arcs of a radius
-/// below it, and returns how many. The element behind a dropped one starts where the dropped one
+/// Drops the elements of a path that are shorter than `shortest`, or arcs of a radius below it, and
+/// returns how many. The element behind a dropped one starts where the dropped one
 /// started, so gaps never add up along a row of short elements. Arcs that are straight within a
 /// tenth of the tolerance become segments. A path may be left without elements.
-std::size_t dropShortElements(Path& path);
+std::size_t dropShortElements(Path& path, double shortest);
 
 }  // namespace gmpath

@@ -12,7 +12,8 @@ namespace {
 /// Sizes as fractions of the picture's diagonal, and of the extent of the marked path.
 constexpr double kDotOfDiagonal = 0.0022;
 constexpr double kDotOfPath = 0.04;
-constexpr double kLabelOfDiagonal = 0.012;
+constexpr double kLargestLabel = 0.011;
+constexpr double kSmallestLabel = 0.005;
 constexpr double kLabelOfPath = 0.3;
 
 /// The arrow head, in dot radii: where it starts behind the dot, how long and how wide it is.
@@ -25,6 +26,23 @@ double dotRadius(const Path& path, double diagonal) {
     return std::min(kDotOfDiagonal * diagonal, kDotOfPath * std::max(size.x, size.y));
 }
 
+/// The point at a distance along the path; the end of a path that is shorter.
+Vec2 pointAlong(const Path& path, double distanceAlong) {
+    for (const Element& e : path.elements) {
+        const double len = length(e);
+        if (distanceAlong <= len) {
+            const double t = len > 0.0 ? distanceAlong / len : 0.0;
+            if (!isArc(e)) return e.sp + t * (e.ep - e.sp);
+            const Vec2 m = centre(e);
+            const double angle = t * sweep(e);
+            const Vec2 r = e.sp - m;
+            return m + std::cos(angle) * r - std::sin(angle) * rightNormal(r);
+        }
+        distanceAlong -= len;
+    }
+    return path.elements.back().ep;
+}
+
 std::string coordinates(Vec2 p) {
     return formatReal(p.x) + " " + formatReal(-p.y);
 }
@@ -35,24 +53,25 @@ std::string startMark(const Path& path, const std::string& styleClass, double di
     if (path.elements.empty()) return {};
     const Element& first = path.elements.front();
     const double r = dotRadius(path, diagonal);
-    const Vec2 along = tangentStart(first);
-    const Vec2 side = kArrowHalfWidth * r * rightNormal(along);
-    const Vec2 back = first.sp + kArrowStart * r * along;
-    const Vec2 tip = back + kArrowLength * r * along;
+    const Vec2 back = pointAlong(path, kArrowStart * r);
+    const Vec2 tip = pointAlong(path, (kArrowStart + kArrowLength) * r);
+    const Vec2 side = kArrowHalfWidth * r * rightNormal(unit(tip - back));
     return "<circle class=\"" + styleClass + "\" cx=\"" + formatReal(first.sp.x) + "\" cy=\"" +
            formatReal(-first.sp.y) + "\" r=\"" + formatReal(r) + "\"/>\n<path class=\"" +
            styleClass + "\" d=\"M " + coordinates(back + side) + " L " + coordinates(tip) + " L " +
            coordinates(back - side) + " Z\"/>\n";
 }
 
-std::string numberLabel(const Path& path, const std::string& number, double diagonal) {
+std::string numberLabel(const Path& path, const std::string& number, bool inside, double diagonal) {
     if (path.elements.empty()) return {};
     const Vec2 extent = boundingBox(path).size();
+    const double room = path.closed ? std::min(extent.x, extent.y) : std::max(extent.x, extent.y);
     const double size =
-        std::min(kLabelOfDiagonal * diagonal, kLabelOfPath * std::max(extent.x, extent.y));
+        std::clamp(kLabelOfPath * room, kSmallestLabel * diagonal, kLargestLabel * diagonal);
     const Element& first = path.elements.front();
-    const double inside = signedArea(path) < 0.0 ? 1.0 : -1.0;
-    const Vec2 at = first.sp + inside * size * rightNormal(tangentStart(first));
+    const bool leftIsInside = sense(path) == Sense::kCounterClockwise;
+    const double toTheRight = sense(path) == Sense::kNone || leftIsInside != inside ? 1.0 : -1.0;
+    const Vec2 at = first.sp + toTheRight * size * rightNormal(tangentStart(first));
     constexpr double kHalfCapital = 0.35;  // lowers the text so that it centres on the point
     return "<text class=\"source-mark\" text-anchor=\"middle\" font-size=\"" + formatReal(size) +
            "\" x=\"" + formatReal(at.x) + "\" y=\"" + formatReal(-at.y + kHalfCapital * size) +

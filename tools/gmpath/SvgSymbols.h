@@ -11,8 +11,8 @@ namespace gmpath {
 /// paths. Nothing for a path without elements.
 std::string startMark(const Path& path, const std::string& styleClass, double diagonal);
 
-/// The path's number beside its start, on the side where a counter-clockwise contour has its
-/// inside. The text stands upright.
-std::string numberLabel(const Path& path, const std::string& number, double diagonal);
+/// The path's number beside its start, inside of what a closed path encloses or outside of it;
+/// right of the direction of travel where there is no inside. The text stands upright.
+std::string numberLabel(const Path& path, const std::string& number, bool inside, double diagonal);
 
 }  // namespace gmpath

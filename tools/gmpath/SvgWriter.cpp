@@ -4,6 +4,7 @@
 #include <array>
 
 #include "Measure.h"
+#include "Nesting.h"
 #include "SvgSymbols.h"
 #include "Text.h"
 
@@ -63,7 +64,10 @@ std::string senseName(const Path& path) {
 class SvgWriter {
 public:
     explicit SvgWriter(const OffsetDrawing& drawing)
-        : m_drawing(drawing), m_box(boxOf(drawing)), m_diagonal(length(m_box.size())) {}
+        : m_drawing(drawing),
+          m_depths(nestingDepths(drawing.contours)),
+          m_box(boxOf(drawing)),
+          m_diagonal(length(m_box.size())) {}
 
     std::string run() {
         writeHead();
@@ -130,9 +134,12 @@ private:
         }
         m_svg += pathTag(contour, "source");
         m_svg += startMark(contour, "source-mark", m_diagonal);
-        m_svg += numberLabel(contour, number, m_diagonal);
+        m_svg += numberLabel(contour, number, isOutline(index), m_diagonal);
         m_svg += "</g>\n";
     }
+
+    /// Numbers stand in the material: inside of outlines, outside of holes.
+    bool isOutline(std::size_t index) const { return m_depths[index].value_or(0) % 2 == 0; }
 
     /// A line of text under the picture: what each colour stands for. Ends where the page does.
     void writeLegend() {
@@ -160,6 +167,7 @@ private:
     }
 
     const OffsetDrawing& m_drawing;
+    std::vector<std::optional<int>> m_depths;
     Box m_box;
     double m_diagonal;
     std::string m_svg;

@@ -157,6 +157,9 @@ int CheckLaws(std::vector<Case> const& cases) {
                     EXPECT_EQ(verdict.fault, "") << Where(c, v, d);
                     checked += verdict.checked;
                 }
+                // The cap at the end of an open chain belongs to its offset, the one at the start
+                // does not.
+                if (v.name == "reversed" && !v.contour.IsClosed()) continue;
                 const Fingerprint print = FingerprintOf(v);
                 if (v.name == "as it is") first = print;
                 const double tolerance = 0.001 * (10 + first.length);
