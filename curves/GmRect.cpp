@@ -12,10 +12,10 @@ constexpr double kOverlapTolerance = 1e-6;
 
 /// The reference point, undefined for a value that names none.
 GmPoint referencePoint(GmRect const& r, eGmRefPoint ref) {
-    double const w = r.Width();
-    double const h = r.Height();
-    GmPoint const lt = r.LTPoint();
-    GmPoint const rb = r.RBPoint();
+    const double w = r.Width();
+    const double h = r.Height();
+    const GmPoint lt = r.LTPoint();
+    const GmPoint rb = r.RBPoint();
     switch (ref) {
         case eRefCenter:
             return r.Center();
@@ -99,8 +99,8 @@ void GmRect::Undefine() {
 }
 
 bool GmRect::Element(GmPoint const& p, double t) const {
-    double const x = p.X();
-    double const y = p.Y();
+    const double x = p.X();
+    const double y = p.Y();
     if (std::fabs(x - Right()) < t || std::fabs(x - Left()) < t) {
         return Bottom() <= y && y <= Top();
     }
@@ -202,10 +202,10 @@ GmPoint GmRect::PMax() const {
 
 GmRect GmRect::And(GmRect const& r) const {
     if (!CreationOK() || !r.CreationOK()) return GmRect();
-    double const left = std::max(Left(), r.Left());
-    double const right = std::min(Right(), r.Right());
-    double const bottom = std::max(Bottom(), r.Bottom());
-    double const top = std::min(Top(), r.Top());
+    const double left = std::max(Left(), r.Left());
+    const double right = std::min(Right(), r.Right());
+    const double bottom = std::max(Bottom(), r.Bottom());
+    const double top = std::min(Top(), r.Top());
     if (right - left <= -kOverlapTolerance || top - bottom <= -kOverlapTolerance) return GmRect();
     return GmRect(GmPoint(left, top), GmPoint(right, bottom));
 }
@@ -233,8 +233,8 @@ void GmRect::Include(GmPoint const& p) {
 
 void GmRect::Stretch(GmPoint const& p, double f) {
     // Both images first: p may be one of the corners.
-    GmPoint const lt = p + (m_ptLT - p) * f;
-    GmPoint const rb = p + (m_ptRB - p) * f;
+    const GmPoint lt = p + (m_ptLT - p) * f;
+    const GmPoint rb = p + (m_ptRB - p) * f;
     m_ptLT = lt;
     m_ptRB = rb;
 }
@@ -252,7 +252,7 @@ void GmRect::Shrink(eGmRefPoint ref, double f) {
 }
 
 void GmRect::StretchX(eGmRefPoint ref, double f) {
-    double const growth = (f - 1.0) * Width();
+    const double growth = (f - 1.0) * Width();
     switch (ref) {
         case eRefCenter:
         case eRefTop:
@@ -274,7 +274,7 @@ void GmRect::StretchX(eGmRefPoint ref, double f) {
 }
 
 void GmRect::StretchY(eGmRefPoint ref, double f) {
-    double const growth = (f - 1.0) * Height();
+    const double growth = (f - 1.0) * Height();
     switch (ref) {
         case eRefCenter:
         case eRefRight:

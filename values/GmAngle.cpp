@@ -81,7 +81,7 @@ bool GmAngle::operator<(GmAngle const& a) const {
 }
 
 GmBase::eRotDir GmAngle::Rotation(GmAngle const& other) const {
-    double const z = (GmDir(*this) % GmDir(other)).Z();
+    const double z = (GmDir(*this) % GmDir(other)).Z();
     if (z > 0.0) return eRotCCW;
     if (z < 0.0) return eRotCW;
     return eRotNone;

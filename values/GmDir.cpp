@@ -34,7 +34,7 @@ GmDir::GmDir(GmPoint const& a, GmPoint const& b) : GmDir(GmVec(a, b)) {}
 
 GmDir::GmDir(GmAngle const& a) : GmDir() {
     if (!a.CreationOK()) return;
-    double const r = a.Radiant();
+    const double r = a.Radiant();
     m_vec = GmVec(std::cos(r), std::sin(r), 0.0);
     m_bCreationOK = true;
 }

@@ -41,10 +41,10 @@ struct RowPairMinors {
 /// pair of rows. The sign is that of the row's first cofactor.
 void rowCofactors(double const* m, int otherRow, RowPairMinors const& opposite, double sign,
                   double cofactors[4]) {
-    double const a = at(m, otherRow, 0);
-    double const b = at(m, otherRow, 1);
-    double const c = at(m, otherRow, 2);
-    double const d = at(m, otherRow, 3);
+    const double a = at(m, otherRow, 0);
+    const double b = at(m, otherRow, 1);
+    const double c = at(m, otherRow, 2);
+    const double d = at(m, otherRow, 3);
     cofactors[0] = sign * (b * opposite.m23 - c * opposite.m13 + d * opposite.m12);
     cofactors[1] = -sign * (a * opposite.m23 - c * opposite.m03 + d * opposite.m02);
     cofactors[2] = sign * (a * opposite.m13 - b * opposite.m03 + d * opposite.m01);
@@ -99,14 +99,14 @@ GmMatrix& GmMatrix::operator*=(GmMatrix const& b) {
 }
 
 GmVec GmMatrix::operator*(GmVec const& v) const {
-    double const x = v[0];
-    double const y = v[1];
-    double const z = v[2];
+    const double x = v[0];
+    const double y = v[1];
+    const double z = v[2];
     double image[4];
     for (int r = 0; r < 4; ++r) {
         image[r] = get(r, 0) * x + get(r, 1) * y + get(r, 2) * z + get(r, 3);
     }
-    double const reciprocal = 1.0 / image[3];
+    const double reciprocal = 1.0 / image[3];
     return GmVec(image[0] * reciprocal, image[1] * reciprocal, image[2] * reciprocal);
 }
 
@@ -136,18 +136,18 @@ GmMatrix GmMatrix::matrixTranslate(double x, double y, double z) {
 
 // Rodrigues' rotation formula for the negated angle.
 GmMatrix GmMatrix::matrixRotate(GmVec const& axis, double angle) {
-    double const t = toRadians(angle);
-    double const s = std::sin(t);
-    double const c = std::cos(t);
-    double const C = 1.0 - c;
+    const double t = toRadians(angle);
+    const double s = std::sin(t);
+    const double c = std::cos(t);
+    const double C = 1.0 - c;
 
     GmMatrix m;
-    double const length = std::sqrt(axis.Norm());
+    const double length = std::sqrt(axis.Norm());
     if (length == 0.0) return m;
-    GmVec const u = axis / length;
-    double const ux = u[0];
-    double const uy = u[1];
-    double const uz = u[2];
+    const GmVec u = axis / length;
+    const double ux = u[0];
+    const double uy = u[1];
+    const double uz = u[2];
 
     m.set(0, 0, ux * ux * C + c);
     m.set(0, 1, ux * uy * C + uz * s);
@@ -162,10 +162,10 @@ GmMatrix GmMatrix::matrixRotate(GmVec const& axis, double angle) {
 }
 
 GmMatrix GmMatrix::matrixRotate(double a, double b) {
-    double const sinA = std::sin(toRadians(a));
-    double const cosA = std::cos(toRadians(a));
-    double const sinB = std::sin(toRadians(b));
-    double const cosB = std::cos(toRadians(b));
+    const double sinA = std::sin(toRadians(a));
+    const double cosA = std::cos(toRadians(a));
+    const double sinB = std::sin(toRadians(b));
+    const double cosB = std::cos(toRadians(b));
 
     GmMatrix m;
     m.set(0, 0, cosB);
@@ -191,8 +191,8 @@ GmMatrix GmMatrix::matrixOrient(GmVec const& a, GmVec const& b, GmVec const& c) 
 }
 
 GmMatrix GmMatrix::matrixOrient(GmVec const& a, GmVec const& b) {
-    GmVec const aTurned = a.Normalized(GmBase::eRotCW);
-    GmVec const bTurned = b.Normalized(GmBase::eRotCW);
+    const GmVec aTurned = a.Normalized(GmBase::eRotCW);
+    const GmVec bTurned = b.Normalized(GmBase::eRotCW);
     return matrixOrient(bTurned % aTurned, bTurned, aTurned);
 }
 
@@ -246,7 +246,7 @@ GmMatrix GmMatrix::transpose() const {
 
 // An affine matrix x -> A x + t has the inverse x -> A^-1 x - A^-1 t.
 void GmMatrix::invertMatrix(double const* src, double* dst) {
-    bool const affine = at(src, 3, 0) == 0.0 && at(src, 3, 1) == 0.0 && at(src, 3, 2) == 0.0 &&
+    const bool affine = at(src, 3, 0) == 0.0 && at(src, 3, 1) == 0.0 && at(src, 3, 2) == 0.0 &&
                         at(src, 3, 3) == 1.0;
     if (!affine) {
         invertMatrixGeneral(src, dst);
@@ -254,18 +254,18 @@ void GmMatrix::invertMatrix(double const* src, double* dst) {
     }
 
     std::copy(_identity, _identity + 16, dst);
-    auto const minor = [src](int r1, int r2, int c1, int c2) {
+    const auto minor = [src](int r1, int r2, int c1, int c2) {
         return at(src, r1, c1) * at(src, r2, c2) - at(src, r1, c2) * at(src, r2, c1);
     };
-    double const cofactor00 = minor(1, 2, 1, 2);
-    double const cofactor10 = minor(2, 0, 1, 2);
-    double const cofactor20 = minor(0, 1, 1, 2);
-    double const determinant =
+    const double cofactor00 = minor(1, 2, 1, 2);
+    const double cofactor10 = minor(2, 0, 1, 2);
+    const double cofactor20 = minor(0, 1, 1, 2);
+    const double determinant =
         at(src, 0, 0) * cofactor00 + at(src, 1, 0) * cofactor10 + at(src, 2, 0) * cofactor20;
     if (determinant == 0.0) return;
 
-    double const reciprocal = 1.0 / determinant;
-    double const adjugate[3][3] = {{cofactor00, cofactor10, cofactor20},
+    const double reciprocal = 1.0 / determinant;
+    const double adjugate[3][3] = {{cofactor00, cofactor10, cofactor20},
                                    {minor(1, 2, 2, 0), minor(0, 2, 0, 2), minor(1, 0, 0, 2)},
                                    {minor(1, 2, 0, 1), minor(2, 0, 0, 1), minor(0, 1, 0, 1)}};
     for (int r = 0; r < 3; ++r) {
@@ -278,21 +278,21 @@ void GmMatrix::invertMatrix(double const* src, double* dst) {
 }
 
 void GmMatrix::invertMatrixGeneral(double const* src, double* dst) {
-    RowPairMinors const upper(src, 0, 1);
-    RowPairMinors const lower(src, 2, 3);
+    const RowPairMinors upper(src, 0, 1);
+    const RowPairMinors lower(src, 2, 3);
     double cofactors[4][4];
     rowCofactors(src, 1, lower, 1.0, cofactors[0]);
     rowCofactors(src, 0, lower, -1.0, cofactors[1]);
     rowCofactors(src, 3, upper, 1.0, cofactors[2]);
     rowCofactors(src, 2, upper, -1.0, cofactors[3]);
 
-    double const determinant = at(src, 0, 0) * cofactors[0][0] + at(src, 1, 0) * cofactors[1][0] +
+    const double determinant = at(src, 0, 0) * cofactors[0][0] + at(src, 1, 0) * cofactors[1][0] +
                                at(src, 2, 0) * cofactors[2][0] + at(src, 3, 0) * cofactors[3][0];
     if (determinant == 0.0) {
         std::copy(_identity, _identity + 16, dst);
         return;
     }
-    double const reciprocal = 1.0 / determinant;
+    const double reciprocal = 1.0 / determinant;
     for (int r = 0; r < 4; ++r) {
         for (int c = 0; c < 4; ++c) {
             dst[c + 4 * r] = cofactors[r][c] * reciprocal;

@@ -56,9 +56,9 @@ double GmPoint::Dist(GmPoint const& p) const {
 }
 
 double GmPoint::Dist2(GmPoint const& p) const {
-    double const dx = p.m_dX - m_dX;
-    double const dy = p.m_dY - m_dY;
-    double const dz = p.m_dZ - m_dZ;
+    const double dx = p.m_dX - m_dX;
+    const double dy = p.m_dY - m_dY;
+    const double dz = p.m_dZ - m_dZ;
     return (dy * dy + dx * dx) + dz * dz;
 }
 
@@ -67,12 +67,12 @@ GmDir GmPoint::Dir(GmPoint const& p) const {
 }
 
 double GmPoint::DirDist(GmPoint const& p, GmDir const& d) const {
-    double const dist = Dist(p);
+    const double dist = Dist(p);
     return Dir(p) == d ? dist : -dist;
 }
 
 double GmPoint::AngDist(GmPoint const& p, GmPoint const& c, GmBase::eRotDir rot) const {
-    double const angle = (*this - c).DAngle(p - c, rot);
+    const double angle = (*this - c).DAngle(p - c, rot);
     return rot == eRotCW ? -angle : angle;
 }
 

@@ -25,7 +25,7 @@ double polarAngle(double x, double y, double halfTurn, double factor, double div
     }
     if (nearZero(y)) return x > 0 ? 0.0 : halfTurn;
 
-    double const principal = std::atan(y / x) * factor / divisor;
+    const double principal = std::atan(y / x) * factor / divisor;
     if (x > 0) return principal;
     return y < 0 ? principal - halfTurn : principal + halfTurn;
 }
@@ -80,7 +80,7 @@ void GmVec::Undefine() {
 }
 
 void GmVec::Normalize(GmBase::eRotDir rot) {
-    double const x = m_dX;
+    const double x = m_dX;
     if (rot == eRotCCW) {
         m_dX = -m_dY;
         m_dY = x;
@@ -109,14 +109,14 @@ double GmVec::Norm() const {
 }
 
 GmAngle GmVec::Angle(GmVec const& w) const {
-    double const a = Length();
-    double const b = w.Length();
+    const double a = Length();
+    const double b = w.Length();
     if (a == 0.0 || b == 0.0) return GmAngle(0.0, true);
 
-    double const cosine = *this * w / a / b;
-    double const sine = (m_dX * w.m_dY - m_dY * w.m_dX) / a / b;
+    const double cosine = *this * w / a / b;
+    const double sine = (m_dX * w.m_dY - m_dY * w.m_dX) / a / b;
     if (std::fabs(cosine) - 1.0 < 0.0) {
-        double const angle = std::acos(cosine);
+        const double angle = std::acos(cosine);
         return GmAngle(sine < 0.0 ? -angle : angle, true);
     }
     // Parallel or opposite; rounding may have taken the cosine beyond the domain of acos.
@@ -128,7 +128,7 @@ GmAngle GmVec::Angle() const {
 }
 
 double GmVec::DAngle(GmVec const& w, GmBase::eRotDir rot) const {
-    double const d = DAngle(w);
+    const double d = DAngle(w);
     if (rot == eRotCW) return d > 0.0 ? d - 360.0 : d;
     return d < 0.0 ? d + 360.0 : d;
 }
@@ -241,12 +241,12 @@ bool GmVec::operator<(GmVec const& w) const {
 }
 
 void GmVec::Standardize() {
-    double const length = Length();
+    const double length = Length();
     if (length != 0.0) *this /= length;
 }
 
 GmVec GmVec::Standardized() const {
-    double const length = Length();
+    const double length = Length();
     if (length == 0.0) return GmVec(m_dX, m_dY, m_dZ);
     return GmVec(m_dX / length, m_dY / length, m_dZ / length);
 }
