@@ -1,6 +1,6 @@
-# What an installed copy consists of: library, headers, program, and the files by which CMake and
-# pkg-config find it. Both kinds of file name their places relative to themselves, so that an
-# installed tree can be moved.
+# What an installed copy of the library consists of: the shared library, its headers, and the files
+# by which CMake and pkg-config find it. Both kinds of file name their places relative to
+# themselves, so that an installed tree can be moved.
 include(CMakePackageConfigHelpers)
 
 install(TARGETS gmkernel EXPORT gmkernelTargets
@@ -9,13 +9,6 @@ install(TARGETS gmkernel EXPORT gmkernelTargets
 install(DIRECTORY "${PROJECT_SOURCE_DIR}/include/gmkernel"
                   "${PROJECT_BINARY_DIR}/include/gmkernel"
     DESTINATION "${CMAKE_INSTALL_INCLUDEDIR}" FILES_MATCHING PATTERN "*.h")
-if(TARGET gmpath)
-    file(RELATIVE_PATH bin_to_lib
-        "${CMAKE_INSTALL_FULL_BINDIR}" "${CMAKE_INSTALL_FULL_LIBDIR}")
-    set_target_properties(gmpath PROPERTIES INSTALL_RPATH "$ORIGIN/${bin_to_lib}")
-    install(TARGETS gmpath RUNTIME DESTINATION "${CMAKE_INSTALL_BINDIR}")
-endif()
-
 set(package_dir "${CMAKE_INSTALL_LIBDIR}/cmake/gmkernel")
 install(EXPORT gmkernelTargets NAMESPACE gmkernel:: DESTINATION "${package_dir}")
 configure_package_config_file("${CMAKE_CURRENT_LIST_DIR}/gmkernelConfig.cmake.in"

@@ -299,3 +299,51 @@ void GmRect::Move(GmVec const& v) {
     m_ptLT.Translation(v);
     m_ptRB.Translation(v);
 }
+
+double GmRect::Left() const {
+    return m_ptLT.X();
+}
+
+double GmRect::Right() const {
+    return m_ptRB.X();
+}
+
+double GmRect::Top() const {
+    return m_ptLT.Y();
+}
+
+double GmRect::Bottom() const {
+    return m_ptRB.Y();
+}
+
+void GmRect::Left(double x) {
+    m_ptLT.X(x);
+}
+
+void GmRect::Right(double x) {
+    m_ptRB.X(x);
+}
+
+void GmRect::Top(double y) {
+    m_ptLT.Y(y);
+}
+
+void GmRect::Bottom(double y) {
+    m_ptRB.Y(y);
+}
+
+GmPoint& GmRect::LTPoint() {
+    return m_ptLT;
+}
+
+GmPoint& GmRect::RBPoint() {
+    return m_ptRB;
+}
+
+GmPoint GmRect::LTPoint() const {
+    return m_ptLT;
+}
+
+GmPoint GmRect::RBPoint() const {
+    return m_ptRB;
+}

@@ -14,15 +14,21 @@ echo
 echo "== bracket: what the drawing holds"
 "$gmpath" info examples/parts/bracket.dxf
 echo
-echo "== bracket: paths of a 6 mm cutter around the part, and a second turn 3 mm further out"
-"$gmpath" offset examples/parts/bracket.dxf --distance 3 --count 2 --step 3 \
+echo "== bracket: paths of a 6 mm cutter, along the edges and 1.5 mm off them before that"
+"$gmpath" offset examples/parts/bracket.dxf --distance 3 --count 2 --step 1.5 \
     -o out/bracket.svg -o out/bracket.dxf
 echo
-echo "== hourglass: clearing the pocket from its rim inwards; the paths part at the neck"
-"$gmpath" offset examples/parts/hourglass-plate.dxf --side inside --distance 2 --count 7 --step 2.5 \
+echo "== hourglass plate: from the rim inwards; the paths part at the neck"
+"$gmpath" info examples/parts/hourglass-plate.dxf
+"$gmpath" offset examples/parts/hourglass-plate.dxf --side inside \
+    --distance 2 --count 6 --step 2.5 \
     -o out/hourglass-plate.svg -o out/hourglass-plate.dxf
+"$gmpath" info out/hourglass-plate.dxf
 echo
 echo "== gasket: one sixth drawn once and inserted six times"
+"$gmpath" info examples/parts/gasket.dxf
 "$gmpath" offset examples/parts/gasket.dxf --distance 2 -o out/gasket.svg -o out/gasket.dxf
+
 echo
-echo "Pictures: $PWD/out/bracket.svg, hourglass-plate.svg and gasket.svg beside it"
+echo "Pictures and drawings of the results:"
+ls -1 "$PWD"/out/*.svg "$PWD"/out/*.dxf

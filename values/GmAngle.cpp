@@ -117,3 +117,11 @@ void GmAngle::Standardize() {
     while (m_dAngle <= -180.0)
         m_dAngle += fullTurn;
 }
+
+double GmAngle::Degree() const {
+    return m_dAngle;
+}
+
+double GmAngle::Radiant() const {
+    return ToRadiant(m_dAngle);
+}

@@ -299,3 +299,39 @@ void GmMatrix::invertMatrixGeneral(double const* src, double* dst) {
         }
     }
 }
+
+double& GmMatrix::operator()(int r, int c) {
+    return element(r, c);
+}
+
+double GmMatrix::operator()(int r, int c) const {
+    return get(r, c);
+}
+
+double& GmMatrix::operator[](int i) {
+    return m_adValues[i];
+}
+
+double GmMatrix::operator[](int i) const {
+    return m_adValues[i];
+}
+
+GmMatrix::operator double*() {
+    return m_adValues;
+}
+
+GmMatrix::operator double const*() const {
+    return m_adValues;
+}
+
+double& GmMatrix::element(int r, int c) {
+    return m_adValues[r + 4 * c];
+}
+
+double GmMatrix::get(int r, int c) const {
+    return m_adValues[r + 4 * c];
+}
+
+void GmMatrix::set(int r, int c, double value) {
+    m_adValues[r + 4 * c] = value;
+}

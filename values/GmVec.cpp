@@ -315,3 +315,43 @@ void SetCoordByIndex(GmVec& v, int i, double value) {
             break;
     }
 }
+
+double& GmVec::X() {
+    return m_dX;
+}
+
+void GmVec::X(double x) {
+    m_dX = x;
+}
+
+double GmVec::X() const {
+    return m_dX;
+}
+
+double& GmVec::Y() {
+    return m_dY;
+}
+
+void GmVec::Y(double y) {
+    m_dY = y;
+}
+
+double GmVec::Y() const {
+    return m_dY;
+}
+
+double& GmVec::Z() {
+    return m_dZ;
+}
+
+void GmVec::Z(double z) {
+    m_dZ = z;
+}
+
+double GmVec::Z() const {
+    return m_dZ;
+}
+
+double GmVec::operator*(GmVec const& w) const {
+    return (m_dY * w.m_dY + m_dX * w.m_dX) + m_dZ * w.m_dZ;
+}

@@ -1,4 +1,5 @@
-#pragma once
+#ifndef GMKERNEL_GMANGLE_H
+#define GMKERNEL_GMANGLE_H
 
 #include <boost/operators.hpp>
 
@@ -32,9 +33,9 @@ public:
     GmAngle& operator=(GmAngle const& a);
 
     /// The value in degrees, in (-180, 180].
-    double Degree() const { return m_dAngle; }
+    double Degree() const;
     /// The value in radians, in (-pi, pi].
-    double Radiant() const { return ToRadiant(m_dAngle); }
+    double Radiant() const;
 
     /// The result is brought into the range; the creation flag does not change.
     GmAngle const& operator+=(GmAngle const& a);
@@ -70,3 +71,5 @@ protected:
 private:
     double m_dAngle;
 };
+
+#endif  // GMKERNEL_GMANGLE_H

@@ -1,6 +1,7 @@
 /// @file
 /// The circular arc.
-#pragma once
+#ifndef GMKERNEL_GMARC_H
+#define GMKERNEL_GMARC_H
 
 #include <boost/operators.hpp>
 #include <string>
@@ -168,3 +169,5 @@ private:
     GmAngle m_EAng;
     eRotDir m_eDir;
 };
+
+#endif  // GMKERNEL_GMARC_H

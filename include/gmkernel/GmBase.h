@@ -1,4 +1,5 @@
-#pragma once
+#ifndef GMKERNEL_GMBASE_H
+#define GMKERNEL_GMBASE_H
 
 #include <boost/operators.hpp>
 
@@ -69,30 +70,32 @@ public:
     /// Copies type tag and creation flag.
     GmBase& operator=(GmBase const& other);
     /// True when both objects are of the same class; values and flags are ignored.
-    bool operator==(GmBase const& other) const { return m_eType == other.m_eType; }
+    bool operator==(GmBase const& other) const;
 
-    eGmTypes GetType() const { return m_eType; }
+    eGmTypes GetType() const;
     /// True when the object was built from valid input.
-    bool CreationOK() const { return m_bCreationOK; }
+    bool CreationOK() const;
 
     /// Tests of the type tag for exactly one class: a stretch is not a line here, nor an arc a
     /// circle.
-    bool IsVec() const { return m_eType == eGmVec; }
-    bool IsDir() const { return m_eType == eGmDir; }
-    bool IsAngle() const { return m_eType == eGmAngle; }
-    bool IsPoint() const { return m_eType == eGmPoint; }
-    bool IsRect() const { return m_eType == eGmRect; }
-    bool IsLine() const { return m_eType == eGmLine; }
-    bool IsCircle() const { return m_eType == eGmCircle; }
-    bool IsStretch() const { return m_eType == eGmStretch; }
-    bool IsBeam() const { return m_eType == eGmBeam; }
-    bool IsArc() const { return m_eType == eGmArc; }
-    bool IsHelix() const { return m_eType == eGmHelix; }
-    bool IsContour() const { return m_eType == eGmContour; }
+    bool IsVec() const;
+    bool IsDir() const;
+    bool IsAngle() const;
+    bool IsPoint() const;
+    bool IsRect() const;
+    bool IsLine() const;
+    bool IsCircle() const;
+    bool IsStretch() const;
+    bool IsBeam() const;
+    bool IsArc() const;
+    bool IsHelix() const;
+    bool IsContour() const;
     /// True for every curve tag, 100 or more. A rectangle is no curve by its tag.
-    bool IsCurve() const { return m_eType >= eGmCurve; }
+    bool IsCurve() const;
 
 protected:
     bool m_bCreationOK;
     eGmTypes m_eType;
 };
+
+#endif  // GMKERNEL_GMBASE_H

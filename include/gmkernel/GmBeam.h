@@ -1,6 +1,7 @@
 /// @file
 /// The ray.
-#pragma once
+#ifndef GMKERNEL_GMBEAM_H
+#define GMKERNEL_GMBEAM_H
 
 #include <boost/operators.hpp>
 
@@ -50,3 +51,5 @@ public:
     /// Origin on this ray, the same direction and equal type tags.
     bool operator==(GmBeam const& beam) const;
 };
+
+#endif  // GMKERNEL_GMBEAM_H

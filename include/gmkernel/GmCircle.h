@@ -1,6 +1,7 @@
 /// @file
 /// The full circle.
-#pragma once
+#ifndef GMKERNEL_GMCIRCLE_H
+#define GMKERNEL_GMCIRCLE_H
 
 #include <boost/operators.hpp>
 #include <string>
@@ -122,3 +123,5 @@ protected:
     GmDir m_Axis;  ///< axis of the plane
     double m_dR;   ///< radius
 };
+
+#endif  // GMKERNEL_GMCIRCLE_H

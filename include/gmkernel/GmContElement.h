@@ -1,6 +1,7 @@
 /// @file
 /// The record of one contour element.
-#pragma once
+#ifndef GMKERNEL_GMCONTELEMENT_H
+#define GMKERNEL_GMCONTELEMENT_H
 
 class GmCurve;
 
@@ -23,3 +24,5 @@ struct GmContElement {
     /// True for an element that the contour made itself, false for one that the caller added.
     bool bInserted = false;
 };
+
+#endif  // GMKERNEL_GMCONTELEMENT_H

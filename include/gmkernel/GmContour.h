@@ -1,6 +1,7 @@
 /// @file
 /// The contour: a chain of segments and arcs.
-#pragma once
+#ifndef GMKERNEL_GMCONTOUR_H
+#define GMKERNEL_GMCONTOUR_H
 
 #include <boost/operators.hpp>
 #include <string>
@@ -282,3 +283,5 @@ private:
 /// Hook for diagnostics of a contour's elements; does nothing.
 GMKERNEL_EXPORT void GmTraceContourElements(GmContour const* contour, std::string const& title,
                                             std::string const& text);
+
+#endif  // GMKERNEL_GMCONTOUR_H

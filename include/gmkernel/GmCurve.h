@@ -1,6 +1,7 @@
 /// @file
 /// The curve interface, the solution list and two function objects over curves.
-#pragma once
+#ifndef GMKERNEL_GMCURVE_H
+#define GMKERNEL_GMCURVE_H
 
 #include <boost/operators.hpp>
 #include <functional>
@@ -180,16 +181,18 @@ private:
     GmCurve const* m_pCurve;
 };
 
-namespace gmkernel_detail {
-#if defined(__GLIBCXX__)
 // The standard's base for unary function objects is deprecated since C++11 and left the standard
-// with C++17, but this library still has it: keep it without its warning.
+// with C++17. Where the standard library still has it, it stays the base, without its warning.
+#if defined(__GLIBCXX__)
 #pragma GCC diagnostic push
 #pragma GCC diagnostic ignored "-Wdeprecated-declarations"
+#endif
+
+namespace gmkernel_detail {
+#if defined(__GLIBCXX__)
 using point_predicate_base = std::unary_function<GmPoint, bool>;
-#pragma GCC diagnostic pop
 #else
-/// Stands in for the function-object base that C++17 removed, with the same member types.
+/// Stands in for the removed base, with the same member types.
 struct point_predicate_base {
     typedef GmPoint argument_type;
     typedef bool result_type;
@@ -208,3 +211,9 @@ public:
 private:
     GmCurve const* m_pCurve;
 };
+
+#if defined(__GLIBCXX__)
+#pragma GCC diagnostic pop
+#endif
+
+#endif  // GMKERNEL_GMCURVE_H

@@ -1,4 +1,5 @@
-#pragma once
+#ifndef GMKERNEL_GMDIR_H
+#define GMKERNEL_GMDIR_H
 
 #include <boost/operators.hpp>
 #include <string>
@@ -110,3 +111,5 @@ private:
 
 /// True when a equals b or its opposite.
 GMKERNEL_EXPORT bool GmParallelDir(GmDir const& a, GmDir const& b);
+
+#endif  // GMKERNEL_GMDIR_H

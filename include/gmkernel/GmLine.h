@@ -1,6 +1,7 @@
 /// @file
 /// The infinite straight line.
-#pragma once
+#ifndef GMKERNEL_GMLINE_H
+#define GMKERNEL_GMLINE_H
 
 #include <boost/operators.hpp>
 #include <string>
@@ -130,3 +131,5 @@ protected:
     GmPoint m_SP;  ///< a point of the line; the start of beams and stretches
     GmDir m_Dir;   ///< unit direction
 };
+
+#endif  // GMKERNEL_GMLINE_H

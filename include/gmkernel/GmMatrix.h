@@ -1,4 +1,5 @@
-#pragma once
+#ifndef GMKERNEL_GMMATRIX_H
+#define GMKERNEL_GMMATRIX_H
 
 #include "gmkernel/export.h"
 
@@ -29,14 +30,14 @@ public:
     bool operator!=(GmMatrix const& m) const;
 
     /// The element in row r and column c, both 0 to 3.
-    double& operator()(int r, int c) { return element(r, c); }
-    double operator()(int r, int c) const { return get(r, c); }
+    double& operator()(int r, int c);
+    double operator()(int r, int c) const;
     /// The value at index i, 0 to 15.
-    double& operator[](int i) { return m_adValues[i]; }
-    double operator[](int i) const { return m_adValues[i]; }
+    double& operator[](int i);
+    double operator[](int i) const;
     /// The first of the 16 values; the matrix keeps the ownership.
-    operator double*() { return m_adValues; }
-    operator double const*() const { return m_adValues; }
+    operator double*();
+    operator double const*() const;
 
     /// The matrix product; applied to a point, b acts first.
     GmMatrix operator*(GmMatrix const& b) const;
@@ -79,9 +80,9 @@ public:
     GmMatrix transpose() const;
 
 private:
-    double& element(int r, int c) { return m_adValues[r + 4 * c]; }
-    double get(int r, int c) const { return m_adValues[r + 4 * c]; }
-    void set(int r, int c, double value) { m_adValues[r + 4 * c] = value; }
+    double& element(int r, int c);
+    double get(int r, int c) const;
+    void set(int r, int c, double value);
 
     static void invertMatrix(double const* src, double* dst);
     static void invertMatrixGeneral(double const* src, double* dst);
@@ -90,3 +91,5 @@ private:
 
     double m_adValues[16];
 };
+
+#endif  // GMKERNEL_GMMATRIX_H

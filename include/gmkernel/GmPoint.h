@@ -1,4 +1,5 @@
-#pragma once
+#ifndef GMKERNEL_GMPOINT_H
+#define GMKERNEL_GMPOINT_H
 
 #include <string>
 
@@ -59,3 +60,5 @@ public:
     /// Replaces the point by its image under m; it becomes defined.
     void Transform(GmMatrix const& m);
 };
+
+#endif  // GMKERNEL_GMPOINT_H

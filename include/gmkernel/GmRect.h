@@ -1,4 +1,5 @@
-#pragma once
+#ifndef GMKERNEL_GMRECT_H
+#define GMKERNEL_GMRECT_H
 
 #include <boost/operators.hpp>
 #include <string>
@@ -90,19 +91,19 @@ public:
     bool operator<(GmRect const& r) const;
 
     /// The coordinates of the edges. Setting one does not order the corners anew.
-    double Left() const { return m_ptLT.X(); }
-    double Right() const { return m_ptRB.X(); }
-    double Top() const { return m_ptLT.Y(); }
-    double Bottom() const { return m_ptRB.Y(); }
-    void Left(double x) { m_ptLT.X(x); }
-    void Right(double x) { m_ptRB.X(x); }
-    void Top(double y) { m_ptLT.Y(y); }
-    void Bottom(double y) { m_ptRB.Y(y); }
+    double Left() const;
+    double Right() const;
+    double Top() const;
+    double Bottom() const;
+    void Left(double x);
+    void Right(double x);
+    void Top(double y);
+    void Bottom(double y);
     /// The top-left and the bottom-right corner; the references live as long as the rectangle.
-    GmPoint& LTPoint() { return m_ptLT; }
-    GmPoint& RBPoint() { return m_ptRB; }
-    GmPoint LTPoint() const { return m_ptLT; }
-    GmPoint RBPoint() const { return m_ptRB; }
+    GmPoint& LTPoint();
+    GmPoint& RBPoint();
+    GmPoint LTPoint() const;
+    GmPoint RBPoint() const;
 
     /// Extents in length units, never negative.
     double Width() const;
@@ -148,3 +149,5 @@ private:
     GmPoint m_ptLT;
     GmPoint m_ptRB;
 };
+
+#endif  // GMKERNEL_GMRECT_H

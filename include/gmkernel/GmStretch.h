@@ -1,6 +1,7 @@
 /// @file
 /// The straight segment.
-#pragma once
+#ifndef GMKERNEL_GMSTRETCH_H
+#define GMKERNEL_GMSTRETCH_H
 
 #include <boost/operators.hpp>
 #include <string>
@@ -104,3 +105,5 @@ private:
 
     GmPoint m_EP;
 };
+
+#endif  // GMKERNEL_GMSTRETCH_H

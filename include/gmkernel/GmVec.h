@@ -1,4 +1,5 @@
-#pragma once
+#ifndef GMKERNEL_GMVEC_H
+#define GMKERNEL_GMVEC_H
 
 #include <boost/operators.hpp>
 #include <string>
@@ -50,15 +51,15 @@ public:
     virtual void Invert();
 
     /// Access to one coordinate: reference, setter, value.
-    virtual double& X() { return m_dX; }
-    virtual void X(double x) { m_dX = x; }
-    virtual double X() const { return m_dX; }
-    virtual double& Y() { return m_dY; }
-    virtual void Y(double y) { m_dY = y; }
-    virtual double Y() const { return m_dY; }
-    virtual double& Z() { return m_dZ; }
-    virtual void Z(double z) { m_dZ = z; }
-    virtual double Z() const { return m_dZ; }
+    virtual double& X();
+    virtual void X(double x);
+    virtual double X() const;
+    virtual double& Y();
+    virtual void Y(double y);
+    virtual double Y() const;
+    virtual double& Z();
+    virtual void Z(double z);
+    virtual double Z() const;
 
     /// The slope y / x, 0 when x is exactly 0.
     virtual double k() const;
@@ -97,9 +98,7 @@ public:
     double operator[](int i) const;
 
     /// Dot product.
-    double operator*(GmVec const& w) const {
-        return (m_dY * w.m_dY + m_dX * w.m_dX) + m_dZ * w.m_dZ;
-    }
+    double operator*(GmVec const& w) const;
     /// Cross product, always defined.
     GmVec operator%(GmVec const& w) const;
 
@@ -155,3 +154,5 @@ protected:
 
 /// Sets coordinate x, y, z for i = 0, 1, 2; does nothing for any other i.
 GMKERNEL_EXPORT void SetCoordByIndex(GmVec& v, int i, double value);
+
+#endif  // GMKERNEL_GMVEC_H

@@ -1,6 +1,7 @@
 /// @file
 /// The growable array of the contour's records.
-#pragma once
+#ifndef GMKERNEL_KXARRAY_H
+#define GMKERNEL_KXARRAY_H
 
 #include <algorithm>
 #include <limits>
@@ -129,3 +130,5 @@ void KxArray<TYPE, ARG_TYPE>::RemoveAt(int index, int count) {
     std::copy(m_pData + index + count, m_pData + m_nSize, m_pData + index);
     m_nSize -= count;
 }
+
+#endif  // GMKERNEL_KXARRAY_H

@@ -1,6 +1,7 @@
 /// @file
 /// The whole public interface of gmkernel in one include.
-#pragma once
+#ifndef GMKERNEL_GMKERNEL_H
+#define GMKERNEL_GMKERNEL_H
 
 #include "gmkernel/GmAngle.h"
 #include "gmkernel/GmArc.h"
@@ -19,3 +20,5 @@
 #include "gmkernel/GmVec.h"
 #include "gmkernel/KxArray.h"
 #include "gmkernel/export.h"
+
+#endif  // GMKERNEL_GMKERNEL_H

@@ -25,11 +25,21 @@ struct Xy {
     double y;
 };
 
-Xy At(GmPoint const& p) { return {p.X(), p.Y()}; }
-Xy operator-(Xy a, Xy b) { return {a.x - b.x, a.y - b.y}; }
-double Dot(Xy a, Xy b) { return a.x * b.x + a.y * b.y; }
-double Cross(Xy a, Xy b) { return a.x * b.y - a.y * b.x; }
-double Norm(Xy a) { return std::hypot(a.x, a.y); }
+Xy At(GmPoint const& p) {
+    return {p.X(), p.Y()};
+}
+Xy operator-(Xy a, Xy b) {
+    return {a.x - b.x, a.y - b.y};
+}
+double Dot(Xy a, Xy b) {
+    return a.x * b.x + a.y * b.y;
+}
+double Cross(Xy a, Xy b) {
+    return a.x * b.y - a.y * b.x;
+}
+double Norm(Xy a) {
+    return std::hypot(a.x, a.y);
+}
 
 GmArc const* AsArc(GmCurve const& curve) {
     return curve.IsArc() ? static_cast<GmArc const*>(&curve) : nullptr;
@@ -115,7 +125,8 @@ void AddOffset(GmCurve const& element, double d, std::vector<GmPoint>& points) {
 }
 
 /// Points of the arc about the joint of two elements, if the corner opens away from the side of d.
-void AddCorner(GmCurve const& before, GmCurve const& after, double d, std::vector<GmPoint>& points) {
+void AddCorner(GmCurve const& before, GmCurve const& after, double d,
+               std::vector<GmPoint>& points) {
     const Xy in = Heading(before, true);
     const Xy out = Heading(after, false);
     const double turn = std::atan2(Cross(in, out), Dot(in, out));

@@ -20,8 +20,8 @@ std::vector<GmContour const*> Results(GmContour const& source);
 
 /// How a law came out.
 struct Verdict {
-    std::string fault;    ///< the first point at which the law fails, empty when it holds
-    int checked = 0;      ///< the points that were looked at
+    std::string fault;  ///< the first point at which the law fails, empty when it holds
+    int checked = 0;    ///< the points that were looked at
     bool Holds() const { return fault.empty(); }
 };
 

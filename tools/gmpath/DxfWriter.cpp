@@ -14,6 +14,10 @@ namespace gmpath {
 
 namespace {
 
+/// The oldest version with layers and bulges, which every program reads: it needs neither handles
+/// nor objects.
+constexpr DL_Codes::version kVersion = DL_Codes::AC1009;
+
 constexpr int kBlack = 7;
 
 /// Colour numbers of the passes; further passes start again at the first.
@@ -29,17 +33,14 @@ std::string passLayer(std::size_t pass) {
 class DxfWriter {
 public:
     DxfWriter(const OffsetDrawing& drawing, const std::string& fileName)
-        : m_drawing(drawing), m_out(m_dxf.out(fileName.c_str(), DL_Codes::AC1015)) {}
+        : m_drawing(drawing), m_out(m_dxf.out(fileName.c_str(), kVersion)) {}
 
     bool run() {
         if (m_out == nullptr) return false;
         m_dxf.writeHeader(*m_out);
         m_out->sectionEnd();
         writeTables();
-        writeBlocks();
         writeEntities();
-        m_dxf.writeObjects(*m_out);
-        m_dxf.writeObjectsEnd(*m_out);
         m_out->dxfEOF();
         m_out->close();
         return true;
@@ -48,24 +49,10 @@ public:
 private:
     void writeTables() {
         m_out->sectionTables();
-        m_dxf.writeVPort(*m_out);
-        m_out->tableLinetypes(3);
-        for (const char* name : {"BYBLOCK", "BYLAYER", kLineType}) {
-            m_dxf.writeLinetype(*m_out, DL_LinetypeData(name, "", 0, 0, 0.0));
-        }
+        m_out->tableLinetypes(1);
+        m_dxf.writeLinetype(*m_out, DL_LinetypeData(kLineType, "", 0, 0, 0.0));
         m_out->tableEnd();
         writeLayers();
-        m_out->tableStyle(1);
-        m_dxf.writeStyle(*m_out, DL_StyleData("STANDARD", 0, 0.0, 1.0, 0.0, 0, 2.5, "", ""));
-        m_out->tableEnd();
-        m_dxf.writeView(*m_out);
-        m_dxf.writeUcs(*m_out);
-        m_out->tableAppid(1);
-        m_dxf.writeAppid(*m_out, "ACAD");
-        m_out->tableEnd();
-        m_dxf.writeDimStyle(*m_out, 1.0, 1.0, 1.0, 1.0, 1.0);
-        m_dxf.writeBlockRecord(*m_out);
-        m_out->tableEnd();
         m_out->sectionEnd();
     }
 
@@ -84,15 +71,6 @@ private:
         constexpr int kDefaultWidth = -3;
         m_dxf.writeLayer(*m_out, DL_LayerData(name, 0),
                          DL_Attributes(name, colour, kDefaultWidth, kLineType, 1.0));
-    }
-
-    void writeBlocks() {
-        m_out->sectionBlocks();
-        for (const char* name : {"*Model_Space", "*Paper_Space", "*Paper_Space0"}) {
-            m_dxf.writeBlock(*m_out, DL_BlockData(name, 0, 0.0, 0.0, 0.0));
-            m_dxf.writeEndBlock(*m_out, name);
-        }
-        m_out->sectionEnd();
     }
 
     void writeEntities() {

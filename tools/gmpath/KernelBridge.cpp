@@ -1,5 +1,6 @@
 #include "KernelBridge.h"
 
+#include <algorithm>
 #include <memory>
 
 #include "ShortElements.h"
@@ -16,13 +17,14 @@ constexpr double kPi = 3.14159265358979323846;
 /// Every element of the source stays in view, whatever its length.
 constexpr int kWholeContour = 1'000'000;
 
-/// Elements below this length are passed over.
-constexpr double kShortestForKernel = 10.0 * kKernelTolerance;
+/// Elements below this length are passed over at first, and when the first result is torn.
+constexpr double kShortestAtFirst = 3.0 * kKernelTolerance;
+constexpr double kShortestOfTorn = 10.0 * kKernelTolerance;
 
-/// The path without what is too short for the kernel; a path that small altogether stays as it is.
-Path simplified(const Path& path) {
+/// The path without its shortest elements; a path that small altogether stays as it is.
+Path simplified(const Path& path, double shortest) {
     Path result = path;
-    dropShortElements(result, kShortestForKernel);
+    dropShortElements(result, shortest);
     return result.elements.empty() ? path : result;
 }
 
@@ -84,11 +86,9 @@ Path pathFrom(const GmContour& contour, const std::string& layer) {
     return path;
 }
 
-}  // namespace
-
-KernelOffset offsetByKernel(const Path& path, double d) {
+KernelOffset offsetAsGiven(const Path& path, double d) {
     GmContour contour;
-    if (!fill(contour, simplified(path))) return {{}, false};
+    if (!fill(contour, path)) return {{}, false};
     const bool keepOpen = !path.closed;
     contour.Offsetting(d, kWholeContour, keepOpen);
     KernelOffset offset;
@@ -97,6 +97,25 @@ KernelOffset offsetByKernel(const Path& path, double d) {
         offset.results.push_back(pathFrom(*result, path.layer));
     }
     return offset;
+}
+
+/// True when closed results, at least one, came out.
+bool isWhole(const KernelOffset& offset) {
+    const auto isClosed = [](const Path& path) { return path.closed; };
+    return !offset.results.empty() &&
+           std::all_of(offset.results.begin(), offset.results.end(), isClosed);
+}
+
+}  // namespace
+
+KernelOffset offsetByKernel(const Path& path, double d) {
+    const Path first = simplified(path, kShortestAtFirst);
+    KernelOffset offset = offsetAsGiven(first, d);
+    if (!path.closed || isWhole(offset)) return offset;
+    const Path second = simplified(path, kShortestOfTorn);
+    if (second.elements.size() == first.elements.size()) return offset;
+    KernelOffset again = offsetAsGiven(second, d);
+    return isWhole(again) ? again : offset;
 }
 
 }  // namespace gmpath

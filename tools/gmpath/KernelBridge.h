@@ -17,9 +17,10 @@ struct KernelOffset {
 /// Offsets a path at the signed distance d, positive to the right of the direction of travel.
 /// Distances below the kernel's tolerance give the path itself.
 ///
-/// Elements shorter than 1e-3 are passed over, so there the offsets keep their distance within 1e-3
-/// only: the kernel joins pieces over such lengths, and one of these elements that turns back, as
-/// the rounding of a drawing leaves them, would tear its result apart. Cost: up to the square of
+/// Elements shorter than 3e-4, over which the kernel joins pieces, are passed over, so there the
+/// offsets keep their distance within 3e-4 only. When a closed path yields nothing or open pieces,
+/// as an element that turns back for such a length makes it, the offset is tried again without
+/// elements shorter than 1e-3. Cost: up to the square of
 /// the number of elements, and more where many offsets cross.
 KernelOffset offsetByKernel(const Path& path, double d);
 

@@ -49,7 +49,8 @@ private:
 
 GmContour Points(std::vector<std::pair<double, double>> const& points) {
     std::vector<GmPoint> corners;
-    for (auto const& p : points) corners.emplace_back(p.first, p.second);
+    for (auto const& p : points)
+        corners.emplace_back(p.first, p.second);
     return shapes::Polygon(corners);
 }
 
@@ -62,8 +63,15 @@ std::vector<Case> ConvexCases() {
          Chain(5, 0).Around(0, 0, kCcw, -5, 0).Around(0, 0, kCcw, 5, 0).Get(),
          {1, 7, -1, -4.5}},
         {"oval of four centres",
-         Chain(10, 0).Around(7, 0, kCcw, 9.4, 1.8).Around(3, -3, kCcw, 3, 5).Around(3, -3, kCcw, -3.4, 1.8)
-             .Around(-1, 0, kCcw, -4, 0).To(-4, -8).To(10, -8).To(10, 0).Get(),
+         Chain(10, 0)
+             .Around(7, 0, kCcw, 9.4, 1.8)
+             .Around(3, -3, kCcw, 3, 5)
+             .Around(3, -3, kCcw, -3.4, 1.8)
+             .Around(-1, 0, kCcw, -4, 0)
+             .To(-4, -8)
+             .To(10, -8)
+             .To(10, 0)
+             .Get(),
          {1, 6, -1, -2.7, -4}},
         {"nearly collinear",
          Points({{0, 0}, {5, -0.002}, {10, 0}, {10.4, 4}, {10.4, 8}, {5, 8.01}, {0, 8}}),
@@ -75,35 +83,71 @@ std::vector<Case> OtherCases() {
     return {
         {"L", Points({{0, 0}, {10, 0}, {10, 4}, {4, 4}, {4, 10}, {0, 10}}), {0.5, 3, -1, -1.9}},
         {"neck",
-         Points({{0, 0}, {8, 0}, {8, 3}, {12, 3}, {12, 0}, {20, 0}, {20, 8}, {12, 8}, {12, 5},
-                 {8, 5}, {8, 8}, {0, 8}}),
+         Points({{0, 0},
+                 {8, 0},
+                 {8, 3},
+                 {12, 3},
+                 {12, 0},
+                 {20, 0},
+                 {20, 8},
+                 {12, 8},
+                 {12, 5},
+                 {8, 5},
+                 {8, 8},
+                 {0, 8}}),
          {1, 2.5, -0.7, -1.5, -3.5}},
         {"mouth",
-         Points({{0, 0}, {12, 0}, {12, 5}, {9, 5}, {9, 3}, {3, 3}, {3, 9}, {9, 9}, {9, 7}, {12, 7},
-                 {12, 12}, {0, 12}}),
+         Points({{0, 0},
+                 {12, 0},
+                 {12, 5},
+                 {9, 5},
+                 {9, 3},
+                 {3, 3},
+                 {3, 9},
+                 {9, 9},
+                 {9, 7},
+                 {12, 7},
+                 {12, 12},
+                 {0, 12}}),
          {0.6, 1.7, 2.9, 4, -0.6, -1.2}},
         {"notch",
          Chain(0, 0).To(12, 0).To(12, 6).To(7, 6).Around(6, 6, kCw, 5, 6).To(0, 6).To(0, 0).Get(),
          {0.5, 1.5, 4, -0.5, -1.3, -2.2}},
         {"deep notch",
-         Chain(0, 0).To(12, 0).To(12, 9).To(7, 9).To(7, 6).Around(6, 6, kCw, 5, 6).To(5, 9).To(0, 9)
-             .To(0, 0).Get(),
+         Chain(0, 0)
+             .To(12, 0)
+             .To(12, 9)
+             .To(7, 9)
+             .To(7, 6)
+             .Around(6, 6, kCw, 5, 6)
+             .To(5, 9)
+             .To(0, 9)
+             .To(0, 0)
+             .Get(),
          {0.5, 0.9, 1.5, -0.5, -2.2}},
         {"kidney",
-         Chain(4, 0).Around(7, 0, kCcw, 10, 0).Around(0, 0, kCcw, -10, 0).Around(-7, 0, kCcw, -4, 0)
-             .Around(0, 0, kCw, 4, 0).Get(),
+         Chain(4, 0)
+             .Around(7, 0, kCcw, 10, 0)
+             .Around(0, 0, kCcw, -10, 0)
+             .Around(-7, 0, kCcw, -4, 0)
+             .Around(0, 0, kCw, 4, 0)
+             .Get(),
          {1, 3.5, 5, -1, -2.9}},
         {"star",
-         shapes::Star({{10, 0}, {4, 0}, {10, 0}, {4, 0}, {10, 0}, {4, 0}, {10, 0}, {4, 0}, {10, 0},
-                       {4, 0}}),
+         shapes::Star(
+             {{10, 0}, {4, 0}, {10, 0}, {4, 0}, {10, 0}, {4, 0}, {10, 0}, {4, 0}, {10, 0}, {4, 0}}),
          {0.8, 5, -0.8, -2}},
         {"zigzag",
          shapes::Polyline({GmPoint(0, 0), GmPoint(6, 1), GmPoint(7, 8), GmPoint(9, 2),
                            GmPoint(15, 3), GmPoint(16, 10), GmPoint(8, 12)}),
          {0.5, 2, -0.5, -2, 6, -6}},
         {"wave",
-         Chain(0, 0).Around(2, 0, kCw, 4, 0).Around(6.5, 0, kCcw, 9, 0).Around(10.5, 0, kCw, 12, 0)
-             .To(12, -5).Get(),
+         Chain(0, 0)
+             .Around(2, 0, kCw, 4, 0)
+             .Around(6.5, 0, kCcw, 9, 0)
+             .Around(10.5, 0, kCw, 12, 0)
+             .To(12, -5)
+             .Get(),
          {0.5, 1.8, 3, -0.5, -1.8, -3}},
         {"segment", shapes::Polyline({GmPoint(1, 2), GmPoint(7, 5)}), {1, -1, 9}},
         {"arc", Chain(3, 0).Around(0, 0, kCcw, 0, -3).Get(), {1, -1, -2.5, 4}},
@@ -175,10 +219,14 @@ int CheckLaws(std::vector<Case> const& cases) {
 
 }  // namespace
 
-TEST(OffsetLaws, HoldForConvexShapes) { EXPECT_GT(CheckLaws(ConvexCases()), 20000); }
+TEST(OffsetLaws, HoldForConvexShapes) {
+    EXPECT_GT(CheckLaws(ConvexCases()), 20000);
+}
 
 TEST(OffsetLaws, HoldForShapesWithInnerCornersAndOpenChains) {
     EXPECT_GT(CheckLaws(OtherCases()), 40000);
 }
 
-TEST(OffsetLaws, HoldForRandomStars) { EXPECT_GT(CheckLaws(RandomCases()), 50000); }
+TEST(OffsetLaws, HoldForRandomStars) {
+    EXPECT_GT(CheckLaws(RandomCases()), 50000);
+}

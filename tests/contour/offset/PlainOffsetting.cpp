@@ -40,9 +40,11 @@ void Insert(Pieces& active, GmOffsetElement const& added) {
         Points points;
         ::Intersection(added.curve(), old.curve(), points);
         all.insert(all.end(), points.begin(), points.end());
-        for (GmOffsetElement const& part : Split(old, points)) cut.push_back(part);
+        for (GmOffsetElement const& part : Split(old, points))
+            cut.push_back(part);
     }
-    for (GmOffsetElement const& part : Split(added, all)) cut.push_back(part);
+    for (GmOffsetElement const& part : Split(added, all))
+        cut.push_back(part);
     active.swap(cut);
 }
 
@@ -106,8 +108,8 @@ Pieces TakeChain(Pieces& pieces) {
     }
     Pieces chain{Take(pieces, first)};
     for (size_t i = 0; i < pieces.size();) {
-        const bool joins = pieces[i].id() == chain[0].id() &&
-                           pieces[i].curve().EP() == chain[0].curve().SP();
+        const bool joins =
+            pieces[i].id() == chain[0].id() && pieces[i].curve().EP() == chain[0].curve().SP();
         if (joins) {
             chain.insert(chain.begin(), Take(pieces, i));
         } else {
@@ -180,7 +182,8 @@ std::vector<std::unique_ptr<GmContour>> PlainOffsetting(GmContour& source, doubl
         auto contour = ContourOf(chain);
         const bool auxiliary = std::all_of(chain.begin(), chain.end(),
                                            [](GmOffsetElement const& p) { return p.auxiliary(); });
-        if (!auxiliary && !(insideOnly && !contour->IsClosed())) results.push_back(std::move(contour));
+        if (!auxiliary && !(insideOnly && !contour->IsClosed()))
+            results.push_back(std::move(contour));
     }
     return results;
 }

@@ -114,7 +114,8 @@ TEST(PlainOffsetting, GivesTheSameDigitsOnContours) {
         for (auto& variant : shapes::Variants(shapes::RandomStar(seed, seed % 3 != 0))) {
             for (const double d : {1.0, -0.4, -2.5, 7.0}) {
                 const int span = seed % 2 == 0 ? 1000000 : 3;
-                const int agreed = AgreedResults(variant.contour, variant.MapOffset(d), span, false);
+                const int agreed =
+                    AgreedResults(variant.contour, variant.MapOffset(d), span, false);
                 EXPECT_GE(agreed, 0) << "seed " << seed << ", " << variant.name << ", d " << d;
                 results += agreed;
             }

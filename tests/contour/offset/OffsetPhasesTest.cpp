@@ -1,0 +1,271 @@
+#include <gtest/gtest.h>
+#include <rapidcheck.h>
+
+#include <cmath>
+#include <vector>
+
+#include "contour/offset/BandPieces.h"
+#include "contour/offset/Chaining.h"
+#include "contour/offset/Insertion.h"
+#include "contour/offset/Removal.h"
+#include "contour/offset/ResultContour.h"
+#include "gmkernel/GmArc.h"
+#include "gmkernel/GmContElement.h"
+#include "gmkernel/GmStretch.h"
+
+namespace {
+
+using namespace gmkernel_detail;
+
+GmOffsetElement Segment(double x0, double y0, double x1, double y1, int id = 1,
+                        bool auxiliary = false) {
+    return {new GmStretch(GmPoint(x0, y0), GmPoint(x1, y1)), 0, id, true, auxiliary};
+}
+
+PieceList ListOf(std::vector<GmOffsetElement> const& elements) {
+    PieceList list;
+    for (GmOffsetElement const& element : elements)
+        list.emplace_back(element);
+    return list;
+}
+
+/// The start points of pieces along x, as a fingerprint of an order.
+std::vector<double> Starts(PieceList const& pieces) {
+    std::vector<double> starts;
+    for (Piece const& piece : pieces)
+        starts.push_back(piece.element.curve().SP().X());
+    return starts;
+}
+
+/// Is the band's boundary one closed walk? Offsets that vanish leave caps that meet.
+void ExpectClosedWalk(std::vector<GmOffsetElement> const& band) {
+    for (size_t i = 0; i < band.size(); ++i) {
+        const GmPoint next = band[(i + 1) % band.size()].curve().SP();
+        EXPECT_EQ(band[i].curve().EP(), next) << "after piece " << i;
+    }
+}
+
+}  // namespace
+
+TEST(BandPieces, EncloseTheElementWithFourPieces) {
+    const GmStretch segment(GmPoint(0, 0), GmPoint(4, 0));
+    const GmArc arc(GmPoint(5, 0), GmPoint(0, 5), GmPoint(0, 0), GmBase::eRotCCW);
+    for (const double d : {1.0, -1.0}) {
+        for (GmCurve const* element :
+             {static_cast<GmCurve const*>(&segment), static_cast<GmCurve const*>(&arc)}) {
+            const auto band = bandPieces(*element, 7, 42, d);
+            ASSERT_EQ(band.size(), 4u);
+            ExpectClosedWalk(band);
+            const bool kept[] = {false, true, true, false};
+            const bool auxiliary[] = {true, false, true, true};
+            for (size_t i = 0; i < 4; ++i) {
+                EXPECT_EQ(band[i].source(), 7);
+                EXPECT_EQ(band[i].id(), 42);
+                EXPECT_EQ(band[i].kept(), kept[i]);
+                EXPECT_EQ(band[i].auxiliary(), auxiliary[i]);
+            }
+            for (size_t cap : {0u, 2u}) {
+                GmArc const& round = static_cast<GmArc const&>(band[cap].curve());
+                EXPECT_NEAR(round.Length(), std::acos(-1.0), 1e-9);
+                EXPECT_EQ(round.Dir(), d > 0 ? GmBase::eRotCCW : GmBase::eRotCW);
+                EXPECT_NEAR(round.HP().Dist(cap == 0 ? element->SP() : element->EP()), 1, 1e-9);
+                EXPECT_FALSE(element->Element(round.HP())) << "outside around the end";
+            }
+        }
+    }
+    const auto band = bandPieces(segment, 0, 0, 1.0);
+    EXPECT_EQ(band[1].curve().SP(), GmPoint(0, -1)) << "positive is right";
+    EXPECT_EQ(static_cast<GmArc const&>(band[0].curve()).HP(), GmPoint(-1, 0));
+    EXPECT_EQ(static_cast<GmArc const&>(band[2].curve()).HP(), GmPoint(5, 0));
+    EXPECT_TRUE(bandPieces(GmLine(GmPoint(0, 0), GmPoint(1, 0)), 0, 0, 1.0).empty());
+}
+
+TEST(BandPieces, CapsOfATightArcMeetWhereTheirCirclesCross) {
+    const GmPoint start(2, 0);
+    const GmPoint end(0, 2);
+    for (const GmBase::eRotDir rot : {GmBase::eRotCCW, GmBase::eRotCW}) {
+        const GmPoint sp = rot == GmBase::eRotCCW ? start : end;
+        const GmPoint ep = rot == GmBase::eRotCCW ? end : start;
+        const GmArc arc(sp, ep, GmPoint(0, 0), rot);
+        for (const double d : {3.0, -3.0, 2.0, -2.0}) {
+            const auto band = bandPieces(arc, 0, 0, d);
+            ASSERT_EQ(band.size(), 3u);
+            ExpectClosedWalk(band);
+            const bool awayFromCentre = d > 0 ? rot == GmBase::eRotCCW : rot == GmBase::eRotCW;
+            EXPECT_EQ(band[1].auxiliary(), !awayFromCentre);
+            const GmPoint x = awayFromCentre ? band[0].curve().SP() : band[0].curve().EP();
+            EXPECT_NEAR(x.Dist(sp), std::fabs(d), 1e-9);
+            EXPECT_NEAR(x.Dist(ep), std::fabs(d), 1e-9);
+            EXPECT_LT(x.X() + x.Y(), 1e-9) << "beyond the centre, or on it";
+        }
+        EXPECT_EQ(bandPieces(arc, 0, 0, 1.99995).size(), rot == GmBase::eRotCCW ? 4u - 1u : 3u)
+            << "an offset below the length tolerance vanishes";
+        EXPECT_EQ(bandPieces(arc, 0, 0, 1.9).size(), 4u);
+    }
+}
+
+TEST(Insertion, CutsBothPiecesAtTheirCrossings) {
+    PieceList active = ListOf({Segment(0, 0, 10, 0, 1), Segment(0, 1, 10, 1, 2)});
+    active.front().keepsDistance = true;
+    active.back().keepsDistance = true;
+    insertPiece(active, Segment(4, -1, 4, 0.5, 3));
+    EXPECT_EQ(Starts(active), (std::vector<double>{0, 4, 0, 4, 4}));
+    auto piece = active.begin();
+    EXPECT_FALSE(piece->keepsDistance) << "the halves are judged anew";
+    EXPECT_EQ(piece->halving, GmPoint(2, 0));
+    EXPECT_FALSE((++piece)->keepsDistance);
+    EXPECT_EQ(piece->halving, GmPoint(7, 0));
+    EXPECT_EQ(piece->element.id(), 1);
+    EXPECT_TRUE((++piece)->keepsDistance) << "not cut";
+}
+
+TEST(Insertion, DoesNotCutAtEnds) {
+    PieceList active = ListOf({Segment(0, 0, 10, 0)});
+    insertPiece(active, Segment(10.00005, 0, 15, 5));
+    insertPiece(active, Segment(5, 5, 5, 0));
+    EXPECT_EQ(active.size(), 4u) << "the second one ends on the first, which alone is cut";
+}
+
+TEST(Insertion, CutsAPieceAtSeveralPointsInOrder) {
+    PieceList active;
+    for (const double x : {6.0, 2.0, 8.0, 4.0})
+        insertPiece(active, Segment(x, -1, x, 1));
+    insertPiece(active, Segment(0, 0, 10, 0, 2));
+    EXPECT_EQ(Starts(active), (std::vector<double>{6, 6, 2, 2, 8, 8, 4, 4, 0, 2, 4, 6, 8}));
+
+    // A clockwise arc from the left to the right crosses two of the verticals.
+    auto* arc = new GmArc(GmPoint(1, 0), GmPoint(7, 0), GmPoint(4, 0), GmBase::eRotCW);
+    PieceList verticals = ListOf({Segment(6, 0.5, 6, 9), Segment(2, 0.5, 2, 9)});
+    insertPiece(verticals, {arc, 0, 1, true, false});
+    EXPECT_EQ(verticals.size(), 7u);
+    const auto starts = Starts(verticals);
+    EXPECT_NEAR(starts[4], 1, 1e-9);
+    EXPECT_NEAR(starts[5], 2, 1e-9);
+    EXPECT_NEAR(starts[6], 6, 1e-9);
+}
+
+TEST(Insertion, BoxesCoverEveryPointThatAMembershipTestAccepts) {
+    int accepted = 0;
+    EXPECT_TRUE(rc::check([&accepted](unsigned seed) {
+        // Ends anywhere about the axes, by angles down to the snapping of directions.
+        const double r = std::pow(10.0, seed % 7 - 2.0);
+        const auto nearAxis = [](unsigned s) {
+            return (s % 4) * std::acos(0.0) +
+                   std::pow(10.0, -double(s % 7)) * ((s / 7) % 21 - 10.0);
+        };
+        const auto on = [r](double angle) {
+            return GmPoint(3 + r * std::cos(angle), 4 + r * std::sin(angle));
+        };
+        GmArc arc(on(nearAxis(seed)), on(nearAxis(seed / 3)), GmPoint(3, 4),
+                  seed % 2 == 0 ? GmBase::eRotCW : GmBase::eRotCCW);
+        if (seed % 5 < 2) arc.SetSP(on(nearAxis(seed / 5)));
+        if (seed % 5 < 3) arc.SetEP(on(nearAxis(seed / 11)));
+        const PieceBox box = reachOf(arc);
+        for (int k = 0; k < 720; ++k) {
+            const double angle = k < 360 ? k * 0.0174533 : nearAxis(static_cast<unsigned>(k));
+            const GmPoint p = on(angle);
+            if (!arc.Element(p)) continue;
+            ++accepted;
+            RC_ASSERT(box.overlaps({p.X(), p.X(), p.Y(), p.Y()}));
+        }
+    }));
+    EXPECT_GT(accepted, 1000);
+}
+
+TEST(Removal, DropsWhatComesNearerThanTheDistance) {
+    GmContour span;
+    span.AddElement(GmStretch(GmPoint(0, 0), GmPoint(10, 0)), false, 0);
+    span.AddElement(GmStretch(GmPoint(10, 0), GmPoint(10, 10)), false, 0);
+    const std::vector<GmOffsetElement> pieces{
+        Segment(1, -1, 2, -1), Segment(2, -0.9, 3, -0.9), Segment(3, -0.99999995, 4, -0.99999995),
+        Segment(9.05, 2, 9.05, 3), Segment(4, -0.9999998, 5, -0.9999998)};
+    PieceList active = ListOf(pieces);
+    removeNearPieces(active, span, true, -1);
+    EXPECT_EQ(Starts(active), (std::vector<double>{1, 3}));
+
+    PieceList passed = ListOf(pieces);
+    for (Piece& piece : passed)
+        piece.keepsDistance = true;
+    PieceList untested = passed;
+    removeNearPieces(untested, span, false, 1);
+    EXPECT_EQ(untested.size(), 5u) << "a span that has not grown is not asked again";
+    removeNearPieces(passed, span, true, 1);
+    EXPECT_EQ(passed.size(), 4u) << "only the last element of the span is asked";
+
+    PieceList all = ListOf(pieces);
+    removeNearPieces(all, GmContour(), false, 1);
+    EXPECT_EQ(all.size(), 5u);
+}
+
+TEST(Chaining, BeginsWithTheSmallestIdentifierAndGoesBackAlongItInOneWalk) {
+    PieceList pieces =
+        ListOf({Segment(2, 0, 3, 0, 5), Segment(4, 0, 5, 0, 3), Segment(3, 0, 4, 0, 3),
+                Segment(2, 0, 3, 0, 3), Segment(1, 0, 2, 0, 4)});
+    EXPECT_EQ(Starts(takeChain(pieces)), (std::vector<double>{2, 3, 4}));
+    EXPECT_EQ(Starts(pieces), (std::vector<double>{2, 1}))
+        << "other identifiers do not go in front";
+
+    // The piece before the one found stands earlier in the list and is passed by.
+    pieces = ListOf({Segment(4, 0, 5, 0, 3), Segment(2, 0, 3, 0, 3), Segment(3, 0, 4, 0, 3)});
+    EXPECT_EQ(Starts(takeChain(pieces)), (std::vector<double>{3, 4}));
+    EXPECT_EQ(Starts(pieces), (std::vector<double>{2}));
+}
+
+TEST(Chaining, GoesOnOverGapsBelowThreeTolerances) {
+    PieceList pieces = ListOf(
+        {Segment(0, 0, 1, 0, 1), Segment(1.00029, 0, 2, 0, 9), Segment(2.00031, 0, 3, 0, 9)});
+    EXPECT_EQ(takeChain(pieces).size(), 2u);
+    EXPECT_EQ(pieces.size(), 1u);
+}
+
+TEST(Chaining, PrefersCandidatesThatLeadOn) {
+    PieceList pieces =
+        ListOf({Segment(0, 0, 1, 0, 1), Segment(1, 0, 1, 5, 2), Segment(1, 0, 2, 0, 3),
+                Segment(1, 0, 2, 1, 4), Segment(2, 0, 3, 0, 5), Segment(2, 1, 3, 1, 6)});
+    PieceList chain = takeChain(pieces);
+    EXPECT_EQ(Starts(chain), (std::vector<double>{0, 1, 2}));
+    EXPECT_EQ(chain.back().element.id(), 5) << "the first that leads on";
+
+    pieces = ListOf({Segment(0, 0, 1, 0, 1), Segment(1, 0, 1, 5, 2), Segment(1, 0, 2, 0, 3)});
+    chain = takeChain(pieces);
+    EXPECT_EQ(chain.back().element.id(), 2) << "the first where none leads on";
+}
+
+TEST(Chaining, LeavesShortPiecesOutAtLast) {
+    PieceList pieces = ListOf({Segment(0, 0, 1, 0, 1), Segment(1, 0, 1.0009, 0, 2),
+                               Segment(1.0009, 0, 2, 0, 3), Segment(2, 0, 2.0011, 0, 4)});
+    EXPECT_EQ(Starts(takeChain(pieces)), (std::vector<double>{0, 1.0009, 2}));
+    pieces = ListOf({Segment(0, 0, 0.0009, 0, 1, true)});
+    const PieceList nothing = takeChain(pieces);
+    EXPECT_TRUE(nothing.empty());
+    EXPECT_FALSE(hasOffset(nothing));
+}
+
+TEST(ResultContour, BridgesGapsAndTellsWhatIsMade) {
+    const auto contour = resultContour(ListOf(
+        {Segment(0, 0, 4, 0, 1), Segment(4, 0.0002, 4, 3, 2), Segment(4, 3.00005, 0, 0, 3, true)}));
+    ASSERT_EQ(contour->ElementCount(), 4) << "one gap is bridged, the other within tolerance";
+    const bool made[] = {false, true, false, true};
+    const long ids[] = {1, 2, 2, 3};
+    for (int i = 0; i < 4; ++i) {
+        EXPECT_EQ(contour->GetContElement(i)->bInserted, made[i]);
+        EXPECT_EQ(contour->GetContElement(i)->lId, ids[i]);
+        EXPECT_EQ(contour->GetContElement(i)->lIndex, i);
+    }
+    EXPECT_TRUE(contour->IsClosed());
+    EXPECT_TRUE(hasOffset(ListOf({Segment(0, 0, 1, 0, 1, true), Segment(1, 0, 2, 0)})));
+    EXPECT_FALSE(hasOffset(ListOf({Segment(0, 0, 1, 0, 1, true)})));
+}
+
+TEST(OffsetElement, CopiesOwnTheirCurves) {
+    GmOffsetElement first = Segment(0, 0, 1, 0, 1);
+    GmOffsetElement second(first);
+    second.curve().SetEP(GmPoint(5, 5));
+    EXPECT_EQ(first.curve().EP(), GmPoint(1, 0));
+    first = second;
+    GmOffsetElement const& itself = first;
+    first = itself;
+    EXPECT_EQ(first.curve().EP(), GmPoint(5, 5));
+    EXPECT_NE(&first.curve(), &second.curve());
+    first.Trace();
+}

@@ -1,0 +1,139 @@
+#include "OffsetJob.h"
+
+#include <gtest/gtest.h>
+
+#include "KernelBridge.h"
+#include "Measure.h"
+#include "PathShapes.h"
+
+using namespace gmpath;
+using path_shapes::circle;
+using path_shapes::kPi;
+using path_shapes::polygon;
+using path_shapes::rectangle;
+
+namespace {
+
+using Distances = std::vector<double>;
+
+const ProgressCall kNoProgress = [](std::size_t, std::size_t) {};
+
+double totalArea(const ContourOffsets& offsets) {
+    double area = 0.0;
+    for (const OffsetPath& offset : offsets.paths)
+        area += std::abs(signedArea(offset.path));
+    return area;
+}
+
+/// Largest difference between the offset's distance from its source and d, sampled.
+double deviation(const Path& offset, const Path& source, double d) {
+    double worst = 0.0;
+    for (const Element& e : offset.elements) {
+        worst = std::max(worst, std::abs(distance(source, e.sp) - std::abs(d)));
+        worst = std::max(worst, std::abs(distance(source, halvingPoint(e)) - std::abs(d)));
+    }
+    return worst;
+}
+
+}  // namespace
+
+TEST(OffsetJob, SideByDepthAndSense) {
+    const Path ccw = rectangle({0, 0}, {10, 10});
+    const Path cw = reversed(ccw);
+    EXPECT_EQ(signedDistances(ccw, 0, Side::kWaste, 2), Distances({2}));
+    EXPECT_EQ(signedDistances(cw, 0, Side::kWaste, 2), Distances({-2}));
+    EXPECT_EQ(signedDistances(ccw, 1, Side::kWaste, 2), Distances({-2}));
+    EXPECT_EQ(signedDistances(cw, 3, Side::kWaste, 2), Distances({2}));
+    EXPECT_EQ(signedDistances(ccw, 1, Side::kOutside, 2), Distances({2}));
+    EXPECT_EQ(signedDistances(cw, 0, Side::kInside, 2), Distances({2}));
+    EXPECT_EQ(signedDistances(cw, 0, Side::kRight, 2), Distances({2}));
+    EXPECT_EQ(signedDistances(cw, 0, Side::kLeft, 2), Distances({-2}));
+    EXPECT_EQ(signedDistances(ccw, 0, Side::kBoth, 2), Distances({2, -2}));
+    const Path open = polygon({{0, 0}, {5, 0}}, false);
+    EXPECT_EQ(signedDistances(open, 0, Side::kWaste, 2), Distances({2, -2}));
+    EXPECT_EQ(signedDistances(open, 0, Side::kInside, 2), Distances({2, -2}));
+    EXPECT_EQ(signedDistances(open, 0, Side::kLeft, 2), Distances({-2}));
+    EXPECT_EQ(signedDistances(open, 0, Side::kWaste, 0).size(), 1U);
+}
+
+TEST(OffsetJob, PlateWithHoles) {
+    // The plate grows, the holes shrink; the small one vanishes.
+    const std::vector<Path> part = {rectangle({0, 0}, {40, 20}), reversed(circle({10, 10}, 5)),
+                                    circle({30, 10}, 1), polygon({{50, 0}, {60, 0}}, false)};
+    const auto offsets = offsetContours(part, {Side::kWaste, {2}}, kNoProgress);
+    ASSERT_EQ(offsets.size(), 4U);
+    ASSERT_EQ(offsets[0].paths.size(), 1U);
+    EXPECT_NEAR(totalArea(offsets[0]), 800 + 2 * 120 + 4 * kPi, 1e-3);
+    EXPECT_NEAR(totalArea(offsets[1]), 9 * kPi, 1e-3);
+    EXPECT_TRUE(offsets[2].paths.empty());
+    EXPECT_EQ(offsets[2].emptyPasses, std::vector<std::size_t>({0}));
+    EXPECT_EQ(offsets[3].paths.size(), 2U);
+    EXPECT_TRUE(offsets[0].paths[0].path.closed);
+}
+
+TEST(OffsetJob, PassesAndProgress) {
+    std::size_t calls = 0;
+    std::size_t last = 0;
+    const auto offsets = offsetContours({rectangle({0, 0}, {10, 10})}, {Side::kInside, {1, 3, 6}},
+                                        [&](std::size_t done, std::size_t total) {
+                                            ++calls;
+                                            last = done;
+                                            EXPECT_EQ(total, 3U);
+                                        });
+    EXPECT_EQ(calls, 3U);
+    EXPECT_EQ(last, 3U);
+    ASSERT_EQ(offsets[0].paths.size(), 2U);
+    EXPECT_NEAR(signedArea(offsets[0].paths[0].path), 64, 1e-6);
+    EXPECT_NEAR(signedArea(offsets[0].paths[1].path), 16, 1e-6);
+    EXPECT_EQ(offsets[0].paths[1].pass, 1U);
+    EXPECT_EQ(offsets[0].emptyPasses, std::vector<std::size_t>({2}));
+}
+
+TEST(KernelBridge, OffsetsKeepTheirDistance) {
+    Path slot{{{{0, 0}, {20, 0}},
+               {{20, 0}, {20, 8}, 1.0},
+               {{20, 8}, {12, 8}},
+               {{12, 8}, {8, 8}, -0.6},
+               {{8, 8}, {0, 8}},
+               {{0, 8}, {0, 0}, 1.0}},
+              true,
+              "0"};
+    std::size_t checked = 0;
+    for (const Path& source : {slot, reversed(slot)}) {
+        for (const double d : {0.5, -0.5, 2.0, -2.0, 6.0}) {
+            for (const Path& result : offsetByKernel(source, d).results) {
+                EXPECT_TRUE(result.closed);
+                EXPECT_LT(deviation(result, source, d), 2e-4) << d;
+                ++checked;
+            }
+        }
+    }
+    EXPECT_GE(checked, 9U);
+}
+
+TEST(KernelBridge, TinyElementsDoNotTearTheResult) {
+    // A hook of 4e-4 against the direction of travel, as rounding in a drawing leaves it.
+    const Path hooked = polygon({{0, 0}, {10, 0}, {10, 10}, {5, 11}, {5.0004, 11}, {0, 10}});
+    const KernelOffset offset = offsetByKernel(hooked, 1.0);
+    ASSERT_EQ(offset.results.size(), 1U);
+    EXPECT_TRUE(offset.results[0].closed);
+    EXPECT_LT(deviation(offset.results[0], hooked, 1.0), 1e-3);
+}
+
+TEST(KernelBridge, StrangeContoursDoNoHarm) {
+    const std::vector<Path> strange = {
+        polygon({{0, 0}, {10, 0}}),                                   // there and back
+        polygon({{0, 0}, {10, 10}, {10, 0}, {0, 10}}),                // crosses itself
+        polygon({{0, 0}, {4, 0}, {4, 4}, {2, 0}, {0, 4}}),            // touches itself
+        polygon({{0, 0}, {10, 0}, {5, 0}, {10, 0}, {10, 5}}, false),  // folds back
+        circle({0, 0}, 2e-4),
+        circle({1e8, 1e8}, 1e8),
+        {{{{0, 0}, {1000, 0}, 1e-6}, {{1000, 0}, {0, 0}, 1e-6}}, true, "0"}};
+    for (const Path& path : strange) {
+        for (const double d : {0.0, 1e-5, 1.0, -1.0, 1e3, -1e9}) {
+            for (const Path& result : offsetByKernel(path, d).results) {
+                EXPECT_TRUE(std::isfinite(length(result)));
+            }
+        }
+    }
+}

@@ -1,0 +1,142 @@
+#include <gtest/gtest.h>
+#include <sys/wait.h>
+
+#include <algorithm>
+#include <cstdio>
+#include <cstdlib>
+#include <filesystem>
+#include <fstream>
+#include <sstream>
+
+namespace {
+
+struct Outcome {
+    int exitCode;
+    std::string out;
+    std::string err;
+};
+
+class Program : public testing::Test {
+protected:
+    void SetUp() override {
+        std::string pattern = (std::filesystem::temp_directory_path() / "gmpath-XXXXXX").string();
+        m_directory = mkdtemp(pattern.data());
+    }
+    void TearDown() override { std::filesystem::remove_all(m_directory); }
+
+    std::string path(const std::string& name) const { return (m_directory / name).string(); }
+
+    void store(const std::string& name, const std::string& text) const {
+        std::ofstream(path(name), std::ios::binary) << text;
+    }
+
+    Outcome run(const std::string& arguments) const {
+        const std::string command = "cd " + m_directory.string() + " && " + GMPATH_PROGRAM + " " +
+                                    arguments + " >out.txt 2>err.txt";
+        const int status = std::system(command.c_str());
+        Outcome outcome{WIFEXITED(status) ? WEXITSTATUS(status) : -1, text("out.txt"),
+                        text("err.txt")};
+        std::filesystem::remove(path("out.txt"));
+        std::filesystem::remove(path("err.txt"));
+        return outcome;
+    }
+
+    std::string text(const std::string& name) const {
+        std::ifstream stream(path(name));
+        return {std::istreambuf_iterator<char>(stream), {}};
+    }
+
+    std::size_t files() const {
+        return static_cast<std::size_t>(
+            std::distance(std::filesystem::directory_iterator(m_directory), {}));
+    }
+
+private:
+    std::filesystem::path m_directory;
+};
+
+const std::string kBracket = std::string(GMPATH_TEST_DATA) + "/bracket.dxf";
+
+bool isOneLine(const std::string& text) {
+    return std::count(text.begin(), text.end(), '\n') == 1 && text.back() == '\n';
+}
+
+}  // namespace
+
+TEST_F(Program, InfoListsContoursAndWhatWasSkipped) {
+    const Outcome info = run("info " + kBracket);
+    EXPECT_EQ(info.exitCode, 0);
+    EXPECT_EQ(std::count(info.out.begin(), info.out.end(), '\n'), 1 + 4 + 2);
+    EXPECT_NE(info.out.find("skipped: 1 TEXT on layer NOTES"), std::string::npos);
+    EXPECT_NE(info.out.find("dropped: 1 duplicate\n"), std::string::npos);
+    EXPECT_NE(info.err.find("1 TEXT on layer NOTES"), std::string::npos);
+    EXPECT_EQ(run("info --strict " + kBracket).exitCode, 2);
+}
+
+TEST_F(Program, OffsetWritesEveryOutput) {
+    const Outcome offset =
+        run("offset " + kBracket + " --distance 2 --count 3 --step 1.5 -o a.svg -o a.dxf");
+    EXPECT_EQ(offset.exitCode, 0);
+    EXPECT_EQ(files(), 2U);
+    EXPECT_NE(text("a.svg").find("pass-3"), std::string::npos);
+    EXPECT_NE(offset.err.find("nothing left at distance 5"), std::string::npos);
+    const Outcome back = run("info a.dxf");
+    EXPECT_EQ(back.exitCode, 0);
+    EXPECT_NE(back.out.find("OFFSET_3"), std::string::npos);
+    EXPECT_EQ(run("offset " + kBracket + " --distance -1 --side both -o b.svg").exitCode, 0);
+}
+
+TEST_F(Program, BadInputIsOneLineAndExitCodeTwo) {
+    store("empty.dxf", "");
+    store("prose.dxf", "This is no drawing.\nNot at all.\n");
+    store("cut.dxf", "0\nSECTION\n2\nENTITIES\n0\nLINE\n8\n0\n10\n");
+    store("binary.dxf", std::string("\x7F"
+                                    "ELF\0\0\1\2",
+                                    8));
+    store("bare.dxf", "0\nSECTION\n2\nENTITIES\n0\nENDSEC\n0\nEOF\n");
+    std::filesystem::create_directory(path("folder.dxf"));
+    const std::size_t before = files();
+    const std::vector<std::pair<std::string, std::string>> cases = {
+        {"info none.dxf", "none.dxf"},
+        {"info folder.dxf", "folder.dxf"},
+        {"info empty.dxf", "empty"},
+        {"info prose.dxf", "no DXF file"},
+        {"info cut.dxf", "truncated"},
+        {"info binary.dxf", "binary"},
+        {"info bare.dxf", "no contours"},
+        {"info " + kBracket + " --join nan", "--join"},
+        {"info " + kBracket + " --scale 0", "--scale"},
+        {"offset bare.dxf --distance 1 -o a.svg", "no contours"},
+        {"offset " + kBracket + " --distance nan -o a.svg", "--distance"},
+        {"offset " + kBracket + " --distance 1e999 -o a.svg", "--distance"},
+        {"offset " + kBracket + " --distance abc -o a.svg", "--distance"},
+        {"offset " + kBracket + " --distance 1 --count 0 -o a.svg", "--count"},
+        {"offset " + kBracket + " --distance 1 --count 9 --step inf -o a.svg", "--step"},
+        {"offset " + kBracket + " --distance 1 --side up -o a.svg", "--side"},
+        {"offset " + kBracket + " --distance 1 -o no/a.svg", "no/a.svg"},
+        {"offset " + kBracket + " --distance 1 -o folder.dxf", "folder.dxf"},
+        {"offset " + kBracket + " --distance 1 -o a.svg -o a.pdf", "a.pdf"},
+        {"offset " + kBracket + " --distance 1 --strict -o a.svg", "TEXT"},
+        {"offset " + kBracket + " -o a.svg", "--distance"},
+        {"offset " + kBracket + " --distance 1", "--output"},
+        {"", "subcommand"},
+        {"melt " + kBracket, ""},
+    };
+    for (const auto& [arguments, cause] : cases) {
+        SCOPED_TRACE(arguments);
+        const Outcome outcome = run(arguments);
+        EXPECT_EQ(outcome.exitCode, 2);
+        EXPECT_TRUE(isOneLine(outcome.err)) << outcome.err;
+        EXPECT_NE(outcome.err.find(cause), std::string::npos) << outcome.err;
+        EXPECT_EQ(outcome.out, "");
+        EXPECT_EQ(files(), before);
+    }
+}
+
+TEST_F(Program, HelpHasAnExamplePerSubcommand) {
+    EXPECT_NE(run("info --help").out.find("Example: gmpath info"), std::string::npos);
+    EXPECT_NE(run("offset --help").out.find("Example: gmpath offset"), std::string::npos);
+    const Outcome version = run("--version");
+    EXPECT_EQ(version.exitCode, 0);
+    EXPECT_EQ(version.out.find("gmpath "), 0U);
+}
