@@ -3,7 +3,8 @@
 ///
 /// A cap is a half circle around an end. Where an arc's radius is not greater than |d|, the offset
 /// towards its centre vanishes and the caps meet: each ends at the point in which the circles about
-/// both ends of the arc cross.
+/// both ends of the arc cross. An arc wider by less than the length tolerance loses that offset
+/// too, but keeps its full caps, which then end at most that tolerance apart.
 #include "contour/offset/BandPieces.h"
 
 #include <algorithm>
@@ -75,23 +76,23 @@ std::vector<GmOffsetElement> bandPieces(GmCurve const& element, int source, int 
     std::vector<GmOffsetElement> pieces;
     if (!element.IsStretch() && !element.IsArc()) return pieces;
 
-    const auto add = [&](GmCurve* curve, bool kept, bool auxiliary) {
-        pieces.emplace_back(curve, source, id, kept, auxiliary);
+    const auto add = [&](std::unique_ptr<GmCurve> curve, bool kept, bool auxiliary) {
+        pieces.emplace_back(std::move(curve), source, id, kept, auxiliary);
     };
     const GmBase::eRotDir rot = d > 0.0 ? GmBase::eRotCCW : GmBase::eRotCW;
     const auto arcOf = [rot](Cap const& cap) {
-        return new GmArc(cap.from, cap.to, cap.centre, rot);
+        return std::make_unique<GmArc>(cap.from, cap.to, cap.centre, rot);
     };
     Cap start = startCap(element, d);
     Cap end = endCap(element, d);
     if (element.IsArc()) shortenCaps(static_cast<GmArc const&>(element), d, start, end);
 
     add(arcOf(start), false, true);
-    if (auto offset = offsetOf(element, d)) add(offset.release(), true, false);
+    if (auto offset = offsetOf(element, d)) add(std::move(offset), true, false);
     add(arcOf(end), true, true);
     if (auto other = offsetOf(element, -d)) {
         other->Invert();
-        add(other.release(), false, true);
+        add(std::move(other), false, true);
     }
     return pieces;
 }

@@ -2,8 +2,11 @@
 
 #include <wx/string.h>
 
-GmOffsetElement::GmOffsetElement(GmCurve* curve, int source, int id, bool kept, bool auxiliary)
-    : m_curve(curve), m_source(source), m_id(id), m_kept(kept), m_auxiliary(auxiliary) {}
+#include <utility>
+
+GmOffsetElement::GmOffsetElement(std::unique_ptr<GmCurve> curve, int source, int id, bool kept,
+                                 bool auxiliary)
+    : m_curve(std::move(curve)), m_source(source), m_id(id), m_kept(kept), m_auxiliary(auxiliary) {}
 
 GmOffsetElement::GmOffsetElement(GmOffsetElement const& other)
     : m_curve(other.m_curve->Clone()),

@@ -9,14 +9,14 @@
 /// Pieces made by splitting keep everything but the curve from the piece they came from.
 class GmOffsetElement final {
 public:
-    /// @param curve the piece, taken over
+    /// @param curve the piece
     /// @param source index of the source element whose band the piece belongs to
     /// @param id identifier of the source element, carried to the results
-    /// @param kept true for the offset on the chosen side and for the end cap; the other pieces
-    /// only
-    ///        serve to cut
+    /// @param kept true for the offset on the chosen side and for the end cap, which may end up in
+    /// a
+    ///        result; the other pieces only serve to cut
     /// @param auxiliary false only for the offset on the chosen side
-    GmOffsetElement(GmCurve* curve, int source, int id, bool kept, bool auxiliary);
+    GmOffsetElement(std::unique_ptr<GmCurve> curve, int source, int id, bool kept, bool auxiliary);
     /// Clones the curve.
     GmOffsetElement(GmOffsetElement const& other);
     /// Clones the other's curve and deletes the own one; nothing when assigned to itself.

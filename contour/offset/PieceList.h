@@ -25,7 +25,7 @@ struct Piece {
     PieceBox reach{};
     /// The point that stands for the piece when its distance from the source is judged.
     GmPoint halving;
-    /// The piece keeps its distance from every element of the span but the newest one. A split
+    /// At its last test the piece kept its distance from every element then in the span. A split
     /// takes this back, since the halves are judged by other points.
     bool keepsDistance = false;
 };

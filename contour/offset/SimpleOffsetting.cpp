@@ -47,7 +47,7 @@ int GmContour::SimpleOffsetting(double d) {
         return m_pSubConts->GetCount();
     }
     OffsetCurves offsets = offsetElements(*this, d);
-    const bool success = trimNeighbours(offsets);
+    const bool success = std::isfinite(d) && trimNeighbours(offsets);
     RemoveAllSubConts();
     if (!success) return 0;
 
@@ -55,6 +55,7 @@ int GmContour::SimpleOffsetting(double d) {
     for (OffsetCurve const& offset : offsets) {
         result->AddElement(*offset.curve, false, offset.id);
     }
-    m_pSubConts->Add(result.release());
+    m_pSubConts->Add(result.get());
+    static_cast<void>(result.release());
     return 1;
 }

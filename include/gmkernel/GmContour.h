@@ -225,9 +225,10 @@ public:
     ///
     /// Corners that open away from the offset side are rounded by arcs of radius |d|; what would
     /// come closer than |d| to the contour is cut away, so that one contour may yield several
-    /// results or none. A distance below m_scdPrec in magnitude stores a copy. The elements of this
-    /// contour are not changed. Cost: the number of elements times the number of pieces in the
-    /// span, twice.
+    /// results or none. A corner carries the identifier of the element that ends there. The result
+    /// of an open contour goes on with the half circle around its end. A distance below m_scdPrec
+    /// in magnitude stores a copy, one that is not finite nothing. The elements of this contour are
+    /// not changed. Cost: the number of elements times the number of pieces in the span, twice.
     /// @param d the distance in length units
     /// @param nSpan how many of the most recent elements a piece is cut by and tested against
     /// @param bKeepOpen keeps open results of a closed contour that is offset to its inside;
@@ -238,8 +239,9 @@ public:
     int ParallelContours(double d, bool, bool, bool);
     /// Offsets element by element and trims neighbours to their crossing, without any test for
     /// distance; elements that vanish are left out, and the joint of last and first element is not
-    /// trimmed. The result replaces the sub-contours, also when there is none.
-    /// @return 1, or 0 with no sub-contour when neighbours do not cross
+    /// trimmed. The result replaces the sub-contours, also when there is none; it is an empty
+    /// contour when every element vanishes.
+    /// @return 1, or 0 with no sub-contour when neighbours do not cross or `d` is not finite
     int SimpleOffsetting(double d);
 
 protected:

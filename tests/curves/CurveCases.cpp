@@ -2,13 +2,16 @@
 
 #include <algorithm>
 #include <cmath>
-#include <limits>
+#include <sstream>
 
 namespace cases {
 
 namespace {
 
-double constexpr window = 100.0;
+/// Without the noise of the last digits and the sign of zero.
+double rounded(double v) {
+    return std::round(v * 1e9) / 1e9 + 0.0;
+}
 
 double gridValue(int from, int to) {
     return *rc::gen::inRange(from, to + 1) / 4.0;
@@ -18,34 +21,53 @@ double polarAngle(GmPoint const& m, GmPoint const& p) {
     return std::atan2(p.Y() - m.Y(), p.X() - m.X());
 }
 
-/// The turn from one angle to another in the sense of the arc, in [0, 2 pi).
+/// The turn from one angle to another in a sense, in [0, 2 pi).
 double turn(double from, double to, GmBase::eRotDir rot) {
-    double const t = std::fmod(rot == GmBase::eRotCW ? from - to : to - from, 2 * M_PI);
+    double const t = std::fmod(rot == CW ? from - to : to - from, 2 * M_PI);
     return t < 0 ? t + 2 * M_PI : t;
 }
 
+double startAngle(GmArc const& arc) {
+    return polarAngle(arc.M(), arc.SP());
+}
+
 double sweep(GmArc const& arc) {
-    if (arc.SP().Dist(arc.EP()) < 1e-7) return 2 * M_PI;
-    return turn(polarAngle(arc.M(), arc.SP()), polarAngle(arc.M(), arc.EP()), arc.Dir());
-}
-
-double distToArc(GmArc const& arc, GmPoint const& p) {
-    double const start = polarAngle(arc.M(), arc.SP());
-    if (turn(start, polarAngle(arc.M(), p), arc.Dir()) <= sweep(arc)) {
-        return std::fabs(p.Dist(arc.M()) - arc.R());
-    }
-    return std::min(p.Dist(arc.SP()), p.Dist(arc.EP()));
-}
-
-double distToStraight(GmLine const& line, GmPoint const& p) {
-    GmVec const dir(line.Dir());
-    double t = (p - line.SP()) * dir;
-    if (!line.IsLine()) t = std::max(t, 0.0);
-    if (line.IsStretch()) t = std::min(t, line.SP().Dist(line.EP()));
-    return p.Dist(GmPoint(line.SP() + t * dir));
+    return turn(startAngle(arc), polarAngle(arc.M(), arc.EP()), arc.Dir());
 }
 
 }  // namespace
+
+std::string Text(GmPoint const& p) {
+    if (!p.CreationOK()) return "none";
+    std::ostringstream text;
+    text.precision(9);
+    text << rounded(p.X()) << "," << rounded(p.Y());
+    if (rounded(p.Z()) != 0) text << "," << rounded(p.Z());
+    return text.str();
+}
+
+std::string Text(GmDir const& d) {
+    return Text(GmPoint(GmVec(d)));
+}
+
+std::string TextOf(std::vector<GmPoint> const& points) {
+    std::string text;
+    for (GmPoint const& p : points)
+        text += (text.empty() ? "" : " ") + Text(p);
+    return text;
+}
+
+GmStretch Stretch(double x1, double y1, double x2, double y2) {
+    return GmStretch(GmPoint(x1, y1), GmPoint(x2, y2));
+}
+
+GmCircle Circle(double x, double y, double r) {
+    return GmCircle(GmPoint(x, y), r, true);
+}
+
+GmArc Arc(double x, double y, double r, double start, double end, GmBase::eRotDir rot) {
+    return GmArc(GmPoint(x, y), r, start * M_PI / 180, end * M_PI / 180, rot);
+}
 
 std::vector<GmBase::eGmTypes> const& Kinds() {
     static std::vector<GmBase::eGmTypes> const kinds = {
@@ -53,39 +75,13 @@ std::vector<GmBase::eGmTypes> const& Kinds() {
     return kinds;
 }
 
-char const* NameOf(GmBase::eGmTypes kind) {
-    switch (kind) {
-        case GmBase::eGmLine:
-            return "line";
-        case GmBase::eGmBeam:
-            return "beam";
-        case GmBase::eGmStretch:
-            return "stretch";
-        case GmBase::eGmCircle:
-            return "circle";
-        default:
-            return "arc";
-    }
-}
-
-::testing::AssertionResult IsAt(GmPoint const& p, double x, double y, double z, double eps) {
-    bool const there = p.CreationOK() && p.equals(GmPoint(x, y, z), eps);
-    return (there ? ::testing::AssertionSuccess() : ::testing::AssertionFailure())
-           << (p.CreationOK() ? "" : "undefined ") << p.GetTraceString();
-}
-
-::testing::AssertionResult Points(GmDir const& d, double x, double y) {
-    return IsAt(GmPoint(GmVec(d)), x, y);
+std::string PairName(GmBase::eGmTypes first, GmBase::eGmTypes second) {
+    return "type tags " + std::to_string(first) + ", " + std::to_string(second);
 }
 
 GmPoint AnyGridPoint() {
     double const x = gridValue(-32, 32);
-    double const y = gridValue(-32, 32);
-    return GmPoint(x, y);
-}
-
-GmLine AnyLine() {
-    return GmLine(AnyStretch());
+    return GmPoint(x, gridValue(-32, 32));
 }
 
 GmStretch AnyStretch() {
@@ -95,21 +91,11 @@ GmStretch AnyStretch() {
     return GmStretch(p, q);
 }
 
-GmCircle AnyCircle() {
-    GmPoint const m = AnyGridPoint();
-    return GmCircle(m, gridValue(1, 24), true);
-}
-
 GmArc AnyArc() {
-    double constexpr step = M_PI / 12;
-    int const start = *rc::gen::inRange(-12, 13);
-    int const steps = *rc::gen::inRange(1, 24);
-    GmCircle const circle = AnyCircle();
-    return GmArc(circle, start * step, (start + steps) * step, AnySense());
-}
-
-GmBase::eRotDir AnySense() {
-    return *rc::gen::element(GmBase::eRotCW, GmBase::eRotCCW);
+    GmPoint const m = AnyGridPoint();
+    int const start = *rc::gen::inRange(-12, 13) * 15;
+    int const angle = *rc::gen::inRange(1, 24) * 15;
+    return Arc(m.X(), m.Y(), gridValue(1, 24), start, start + angle, *rc::gen::element(CW, CCW));
 }
 
 double AnyOffset() {
@@ -117,56 +103,43 @@ double AnyOffset() {
 }
 
 std::unique_ptr<GmCurve> AnyCurve(GmBase::eGmTypes kind) {
-    switch (kind) {
-        case GmBase::eGmLine:
-            return std::make_unique<GmLine>(AnyLine());
-        case GmBase::eGmBeam: {
-            GmLine const line = AnyLine();
-            return std::make_unique<GmBeam>(line.SP(), line.Dir());
-        }
-        case GmBase::eGmStretch:
-            return std::make_unique<GmStretch>(AnyStretch());
-        case GmBase::eGmCircle:
-            return std::make_unique<GmCircle>(AnyCircle());
-        default:
-            return std::make_unique<GmArc>(AnyArc());
-    }
+    if (kind == GmBase::eGmArc) return std::make_unique<GmArc>(AnyArc());
+    if (kind == GmBase::eGmCircle) return std::make_unique<GmCircle>(AnyArc());
+    GmStretch const stretch = AnyStretch();
+    if (kind == GmBase::eGmStretch) return std::make_unique<GmStretch>(stretch);
+    if (kind == GmBase::eGmLine) return std::make_unique<GmLine>(stretch);
+    return std::make_unique<GmBeam>(stretch.SP(), stretch.Dir());
 }
 
 GmPoint Along(GmCurve const& curve, double t) {
-    if (curve.IsCircle() || curve.IsArc()) {
-        auto const& circle = static_cast<GmCircle const&>(curve);
-        double angle = 2 * M_PI * t;
-        if (curve.IsArc()) {
-            auto const& arc = static_cast<GmArc const&>(curve);
-            double const travelled = t * sweep(arc);
-            angle = polarAngle(arc.M(), arc.SP()) +
-                    (arc.Dir() == GmBase::eRotCW ? -travelled : travelled);
-        }
-        return GmPoint(circle.M() + circle.R() * GmVec(std::cos(angle), std::sin(angle), 0));
+    if (!curve.IsCircle() && !curve.IsArc()) {
+        auto const& line = static_cast<GmLine const&>(curve);
+        double const length = line.IsStretch() ? line.SP().Dist(line.EP()) : 100.0;
+        return GmPoint(line.SP() + (line.IsLine() ? t - 0.5 : t) * length * GmVec(line.Dir()));
     }
-    auto const& line = static_cast<GmLine const&>(curve);
-    double const length = line.IsStretch() ? line.SP().Dist(line.EP()) : window;
-    return GmPoint(line.SP() + (line.IsLine() ? t - 0.5 : t) * length * GmVec(line.Dir()));
+    double angle = 2 * M_PI * t;
+    if (curve.IsArc()) {
+        auto const& arc = static_cast<GmArc const&>(curve);
+        angle = startAngle(arc) + (arc.Dir() == CW ? -t : t) * sweep(arc);
+    }
+    auto const& circle = static_cast<GmCircle const&>(curve);
+    return GmPoint(circle.M() + circle.R() * GmVec(std::cos(angle), std::sin(angle), 0));
 }
 
 double ExactDist(GmCurve const& curve, GmPoint const& p) {
-    if (curve.IsArc()) return distToArc(static_cast<GmArc const&>(curve), p);
-    if (curve.IsCircle()) {
+    if (curve.IsCircle() || curve.IsArc()) {
         auto const& circle = static_cast<GmCircle const&>(curve);
-        return std::fabs(p.Dist(circle.M()) - circle.R());
+        double const toRim = std::fabs(p.Dist(circle.M()) - circle.R());
+        if (curve.IsCircle()) return toRim;
+        auto const& arc = static_cast<GmArc const&>(curve);
+        double const reached = turn(startAngle(arc), polarAngle(arc.M(), p), arc.Dir());
+        return reached <= sweep(arc) ? toRim : std::min(p.Dist(arc.SP()), p.Dist(arc.EP()));
     }
-    return distToStraight(static_cast<GmLine const&>(curve), p);
-}
-
-Sampled SampledDist(GmCurve const& sampled, GmCurve const& other) {
-    int constexpr n = 500;
-    double nearest = std::numeric_limits<double>::max();
-    for (int i = 0; i <= n; ++i) {
-        nearest = std::min(nearest, ExactDist(other, Along(sampled, i / double(n))));
-    }
-    bool const unbounded = sampled.IsLine() || sampled.IsBeam();
-    return {nearest, (unbounded ? window : sampled.Length()) / n};
+    auto const& line = static_cast<GmLine const&>(curve);
+    double t = (p - line.SP()) * GmVec(line.Dir());
+    if (!line.IsLine()) t = std::max(t, 0.0);
+    if (line.IsStretch()) t = std::min(t, line.SP().Dist(line.EP()));
+    return p.Dist(GmPoint(line.SP() + t * GmVec(line.Dir())));
 }
 
 }  // namespace cases

@@ -1,4 +1,3 @@
-#include <cmath>
 #include <stdexcept>
 
 #include "curves/CurveCases.h"
@@ -8,154 +7,141 @@ using namespace cases;
 
 namespace {
 
-GmBase::eRotDir constexpr CW = GmBase::eRotCW;
-GmBase::eRotDir constexpr CCW = GmBase::eRotCCW;
+using Curve = std::shared_ptr<GmCurve>;
 
-GmStretch stretch(double x1, double y1, double x2, double y2) {
-    return GmStretch(GmPoint(x1, y1), GmPoint(x2, y2));
+template <class C>
+Curve hold(C const& curve) {
+    return Curve(curve.Clone());
 }
 
-GmArc arc(double x, double y, double r, double startDeg, double endDeg, GmBase::eRotDir rot) {
-    return GmArc(GmPoint(x, y), r, startDeg * M_PI / 180, endDeg * M_PI / 180, rot);
-}
-
+/// Two curves and the point where they are expected to be joined, empty when they are not.
 struct Case {
     char const* name;
-    std::shared_ptr<GmCurve> first;
-    std::shared_ptr<GmCurve> next;
-    bool joined;
-    GmPoint joint;
+    Curve first, next;
+    std::string joint;
 };
 
-template <class A, class B>
-Case joining(char const* name, A const& first, B const& next, GmPoint const& joint) {
-    return {name, std::make_shared<A>(first), std::make_shared<B>(next), true, joint};
-}
-
-template <class A, class B>
-Case failing(char const* name, A const& first, B const& next) {
-    return {name, std::make_shared<A>(first), std::make_shared<B>(next), false, GmPoint()};
-}
-
-/// Both curves end and start at the joint, or neither has moved.
 template <class Join>
 void expectJoint(Case const& c, Join const& join) {
-    SCOPED_TRACE(c.name);
-    GmPoint const end = c.joined ? c.joint : c.first->EP();
-    GmPoint const start = c.joined ? c.joint : c.next->SP();
-    EXPECT_EQ(join(*c.first, *c.next), c.joined);
-    EXPECT_TRUE(IsAt(c.first->EP(), end.X(), end.Y()));
-    EXPECT_EQ(c.next->SP(), start) << c.next->SP().GetTraceString();
+    bool const joined = !c.joint.empty();
+    std::string const end = joined ? c.joint : Text(c.first->EP());
+    std::string const start = joined ? c.joint : Text(c.next->SP());
+    EXPECT_EQ(join(*c.first, *c.next), joined) << c.name;
+    EXPECT_EQ(Text(c.first->EP()), end) << c.name;
+    EXPECT_EQ(Text(c.next->SP()), start) << c.name;
 }
 
-GmStretch const flat = stretch(0, 0, 10, 0);
+Curve flat() {
+    return hold(Stretch(0, 0, 10, 0));
+}
+
+Curve above() {
+    return hold(Stretch(-10, 3, 10, 3));
+}
 
 }  // namespace
 
 TEST(Joining, TrimCutsBothCurvesToTheirCrossing) {
-    GmStretch const across = stretch(-10, 3, 10, 3);
     Case const table[] = {
-        joining("stretches", flat, stretch(5, -5, 5, 5), GmPoint(5, 0)),
-        joining("already meeting", flat, stretch(10, 0.00005, 5, 5), GmPoint(10, 0)),
-        failing("apart", flat, stretch(20, -5, 20, 5)),
-        joining("the farther of two", flat, arc(5, 0, 2, -10, 190, CCW), GmPoint(7, 0)),
-        joining("from the right", arc(0, 0, 5, -80, 170, CCW), across, GmPoint(-4, 3)),
-        joining("from the left", arc(0, 0, 5, -100, 170, CCW), across, GmPoint(4, 3)),
-        joining("a tie takes the first", arc(0, 0, 5, -90, 170, CCW), across, GmPoint(-4, 3)),
-        joining("arcs", arc(0, 0, 5, -90, 90, CCW), arc(8, 0, 5, 200, 90, CW), GmPoint(4, 3)),
-        failing("arcs whose circles cross elsewhere", arc(0, 0, 5, 90, 180, CCW),
-                arc(8, 0, 5, 200, 90, CW)),
+        {"stretches", flat(), hold(Stretch(5, -5, 5, 5)), "5,0"},
+        {"apart", flat(), hold(Stretch(20, -5, 20, 5)), ""},
+        {"the farther of two", flat(), hold(Arc(5, 0, 2, -10, 190, CCW)), "7,0"},
+        {"from the right", hold(Arc(0, 0, 5, -80, 170, CCW)), above(), "-4,3"},
+        {"from the left", hold(Arc(0, 0, 5, -100, 170, CCW)), above(), "4,3"},
+        {"a tie takes the first", hold(Arc(0, 0, 5, -90, 170, CCW)), above(), "-4,3"},
+        {"arcs", hold(Arc(0, 0, 5, -90, 90, CCW)), hold(Arc(8, 0, 5, 200, 90, CW)), "4,3"},
+        {"circles alone", hold(Arc(0, 0, 5, 90, 180, CCW)), hold(Arc(8, 0, 5, 200, 90, CW)), ""},
+        {"no end", hold(GmLine(Stretch(0, 0, 10, 0))), hold(Stretch(5, -5, 5, 5)), ""},
     };
     for (Case const& c : table) {
         expectJoint(c, [](GmCurve& a, GmCurve& b) { return a.Trim(&b); });
     }
-    GmRect rect(0, 0, 1, 1);
-    GmStretch s = flat;
-    EXPECT_THROW(s.Trim(&rect), std::runtime_error);
+    GmStretch s = Stretch(0, 0, 10, 0), meeting = Stretch(10, 0.00005, 5, 5);
+    EXPECT_TRUE(s.Trim(&meeting));
+    EXPECT_EQ(Text(meeting.SP()), "10,5e-05") << "curves that meet already are left alone";
     EXPECT_FALSE(s.Trim(nullptr));
-    GmLine line(flat);
-    EXPECT_FALSE(line.Trim(&s)) << "lines have no end";
+    GmRect rect(0, 0, 1, 1);
+    EXPECT_THROW(s.Trim(&rect), std::runtime_error);
 }
 
 TEST(Joining, ConcatMeetsOnTheCarriers) {
+    Curve const other = hold(Circle(5, 0, 2));
+    auto const left = [] { return hold(Arc(0, 0, 5, 180, 80, CW)); };
     Case const table[] = {
-        joining("extended", flat, stretch(20, -5, 20, 5), GmPoint(20, 0)),
-        joining("shortened", flat, stretch(4, 1, 4, 5), GmPoint(4, 0)),
-        failing("parallel", flat, stretch(20, 1, 30, 1)),
-        joining("onto an arc's circle", flat, arc(15, 0, 3, 90, 0, CW), GmPoint(12, 0)),
-        joining("at the smaller angle, not distance", stretch(0, 4, 10, 4),
-                arc(12, 0, 5, 0, 90, CCW), GmPoint(9, 4)),
-        failing("past an arc", flat, arc(15, 9, 3, 90, 0, CW)),
-        failing("other kinds", flat, GmCircle(GmPoint(5, 0), 2, true)),
-        joining("arc to stretch", arc(0, 0, 5, 180, 80, CW), stretch(4, 9, 4, 5), GmPoint(4, 3)),
-        failing("arc past stretch", arc(0, 0, 5, 180, 80, CW), stretch(6, 9, 6, 5)),
-        joining("arc to arc", arc(0, 0, 5, 180, 10, CW), arc(8, 0, 5, 170, 90, CW), GmPoint(4, 3)),
-        failing("arcs apart", arc(0, 0, 5, 180, 10, CW), arc(20, 0, 5, 170, 90, CW)),
-        joining("concentric arcs that meet", arc(0, 0, 5, 180, 90, CW), arc(0, 0, 5, 90, 0, CW),
-                GmPoint(0, 5)),
-        failing("arc to other kinds", arc(0, 0, 5, 180, 80, CW), GmCircle(GmPoint(5, 0), 2, true)),
+        {"extended", flat(), hold(Stretch(20, -5, 20, 5)), "20,0"},
+        {"shortened", flat(), hold(Stretch(4, 1, 4, 5)), "4,0"},
+        {"parallel", flat(), hold(Stretch(20, 1, 30, 1)), ""},
+        {"onto an arc's circle", flat(), hold(Arc(15, 0, 3, 90, 0, CW)), "12,0"},
+        {"at the smaller angle", hold(Stretch(0, 4, 13, 4)), hold(Arc(12, 0, 5, 0, 9, CCW)),
+         "15,4"},
+        {"past an arc", flat(), hold(Arc(15, 9, 3, 90, 0, CW)), ""},
+        {"other kinds", flat(), other, ""},
+        {"arc to stretch", left(), hold(Stretch(4, 9, 4, 5)), "4,3"},
+        {"arc past stretch", left(), hold(Stretch(6, 9, 6, 5)), ""},
+        {"arc to arc", left(), hold(Arc(8, 0, 5, 170, 90, CW)), "4,3"},
+        {"arc to arc below", hold(Arc(0, 0, 5, 180, 260, CCW)), hold(Arc(8, 0, 5, 9, 90, CW)),
+         "4,-3"},
+        {"arcs apart", left(), hold(Arc(20, 0, 5, 170, 90, CW)), ""},
+        {"arc to other kinds", left(), other, ""},
     };
     for (Case const& c : table) {
         expectJoint(c, [](GmCurve& a, GmCurve const& b) { return a.Concat(b); });
     }
+    EXPECT_TRUE(Arc(0, 0, 5, 180, 90, CW).Concat(Arc(0, 0, 5, 90, 0, CW))) << "meeting, concentric";
 }
 
 TEST(Joining, ConnectsWithAStretchOrAnArc) {
-    GmStretch s = flat;
-    GmArc a = arc(10, -3, 3, 180, 90, CW);
     struct Row {
         char const* name;
         GmStretch next;
-        bool round;
-        GmPoint centre;
+        std::string centre;
     };
     Row const table[] = {
-        {"quarter", stretch(12, 2, 12, 10), true, GmPoint(10, 2)},
-        {"half circle, coincident normals", stretch(10, 4, 0, 4), true, GmPoint(10, 2)},
-        {"unequal distances", stretch(13, 2, 13, 10), false, GmPoint()},
-        {"parallel normals", stretch(15, 2, 20, 2), false, GmPoint()},
+        {"quarter", Stretch(12, 2, 12, 10), "10,2"},
+        {"half circle, coincident normals", Stretch(10, 4, 0, 4), "10,2"},
+        {"unequal distances", Stretch(13, 2, 13, 10), "none"},
+        {"slightly unequal distances", Stretch(12.0002, 2, 12.0002, 10), "none"},
+        {"parallel normals", Stretch(15, 2, 20, 2), "none"},
     };
-    for (Row const& row : table) {
-        SCOPED_TRACE(row.name);
-        // Stretch and arc end alike, at (10, 0) in the direction of x.
-        for (GmCurve* first : {static_cast<GmCurve*>(&s), static_cast<GmCurve*>(&a)}) {
+    // Both end at (10, 0) in the direction of x.
+    for (Curve const& first : {flat(), hold(Arc(10, -3, 3, 180, 90, CW))}) {
+        for (Row const& row : table) {
+            SCOPED_TRACE(row.name);
             std::unique_ptr<GmCurve> const link(first->Concat(row.next, 1));
-            ASSERT_TRUE(link && link->CreationOK());
-            EXPECT_EQ(link->SP(), first->EP());
-            EXPECT_EQ(link->EP(), row.next.SP());
-            EXPECT_EQ(link->IsArc(), row.round);
-            if (!row.round) continue;
-            EXPECT_EQ(static_cast<GmArc&>(*link).M(), row.centre);
-            EXPECT_EQ(static_cast<GmArc&>(*link).Dir(), CCW);
+            EXPECT_EQ(TextOf({link->SP(), link->EP()}), TextOf({first->EP(), row.next.SP()}));
+            auto const* arc = dynamic_cast<GmArc const*>(link.get());
+            EXPECT_EQ(arc ? Text(arc->M()) : "none", row.centre);
+            EXPECT_TRUE(arc == nullptr || (arc->CreationOK() && arc->Dir() == CCW));
         }
+        std::unique_ptr<GmCurve> const straight(first->Concat(table[0].next, 0));
+        EXPECT_TRUE(straight->IsStretch());
+        EXPECT_EQ(first->Concat(table[0].next, 2), nullptr);
+        EXPECT_EQ(first->Concat(GmLine(table[0].next), 1), nullptr);
     }
-    std::unique_ptr<GmCurve> const straight(a.Concat(stretch(12, 2, 12, 10), 0));
-    EXPECT_TRUE(straight->IsStretch());
-    GmLine const line(GmPoint(0, 9), GmDir(1, 0));
-    for (GmCurve* first : {static_cast<GmCurve*>(&s), static_cast<GmCurve*>(&a)}) {
-        EXPECT_EQ(first->Concat(stretch(12, 2, 12, 10), 2), nullptr);
-        EXPECT_EQ(first->Concat(line, 1), nullptr);
-    }
-    EXPECT_EQ(GmCircle(GmPoint(0, 0), 1, true).Concat(line, 0), nullptr);
 }
 
 TEST(Joining, ConnectingArcsAreTangential) {
-    EXPECT_TRUE(rc::check("the arc that was taken out comes back", [] {
+    EXPECT_TRUE(rc::check("an arc taken out between tangential neighbours comes back", [] {
         GmArc const link = AnyArc();
-        GmStretch before(GmPoint(link.SP() - 2.0 * GmVec(link.TangSP())), link.SP());
-        GmStretch const after(link.EP(), link.TangEP(), 2.0);
-        GmBase::eRotDir const rot = link.Dir();
-        GmArc around(GmArc(link, 0.25));
-        around.Invert();
-        GmArc const beyond(GmCircle(GmPoint(2.0 * link.EP() - link.M()), link.R(), true), link.EP(),
-                           GmPoint(3.0 * link.EP() - 2.0 * link.M()), rot == CW ? CCW : CW);
-        for (GmCurve const* next :
-             {static_cast<GmCurve const*>(&after), static_cast<GmCurve const*>(&beyond)}) {
-            std::unique_ptr<GmCurve> const found(before.Concat(*next, 1));
-            RC_ASSERT(found && found->CreationOK() && found->IsArc());
-            auto const& back = static_cast<GmArc const&>(*found);
-            RC_ASSERT(back.SP() == link.SP() && back.EP() == link.EP());
-            RC_ASSERT(back.M().Dist(link.M()) < 1e-6 && back.Dir() == rot);
+        GmBase::eRotDir const turned = link.Dir() == CW ? CCW : CW;
+        auto const beside = [&](GmPoint const& end, double sAng, double eAng) {
+            GmPoint const m(2.0 * end - link.M());
+            return GmArc(m, link.R(), sAng + M_PI, eAng + M_PI, turned);
+        };
+        double const s = link.SAng(), e = link.EAng(), bend = link.Dir() == CW ? -1.0 : 1.0;
+        Curve const before[] = {
+            hold(GmStretch(GmPoint(link.SP() - GmVec(link.TangSP())), link.SP())),
+            hold(beside(link.SP(), s + bend, s))};
+        Curve const after[] = {hold(GmStretch(link.EP(), link.TangEP(), 2.0)),
+                               hold(beside(link.EP(), e, e - bend))};
+        for (Curve const& from : before) {
+            for (Curve const& to : after) {
+                std::unique_ptr<GmCurve> const found(from->Concat(*to, 1));
+                auto const* back = dynamic_cast<GmArc const*>(found.get());
+                RC_ASSERT(back != nullptr && back->CreationOK());
+                RC_ASSERT(back->SP() == link.SP() && back->EP() == link.EP());
+                RC_ASSERT(back->M().Dist(link.M()) < 1e-6 && back->Dir() == link.Dir());
+            }
         }
     }));
 }

@@ -219,6 +219,10 @@ Verdict IsChained(GmContour const& source) {
     for (GmContour const* result : Results(source)) {
         ++verdict.checked;
         const int n = static_cast<int>(result->ElementCount());
+        if (n == 0) {
+            verdict.fault = "a result without elements";
+            return verdict;
+        }
         const GmPoint start = result->GetElement(0)->SP();
         for (int i = 1; i < n; ++i) {
             const GmPoint joint = result->GetElement(i)->SP();

@@ -68,7 +68,7 @@ std::vector<EntityCase> entityCases() {
         {"vertices miscounted", lightPolyline(slot, true, 2), true, 4, 20 + 4 * kPi},
         {"vertices overcounted", lightPolyline(slot, true, 2'000'000'000), true, 4, 20 + 4 * kPi},
         {"huge bulge", lightPolyline({{{0, 0}, {}, 1e4}, {{1e-2, 0}, {}, 0}}, true), true, 3,
-         100 * kPi},
+         50 * kPi},
     };
 }
 

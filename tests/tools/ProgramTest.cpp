@@ -2,11 +2,13 @@
 #include <sys/wait.h>
 
 #include <algorithm>
-#include <cstdio>
 #include <cstdlib>
 #include <filesystem>
-#include <fstream>
-#include <sstream>
+#include <string>
+#include <utility>
+#include <vector>
+
+#include "Scratch.h"
 
 namespace {
 
@@ -18,41 +20,18 @@ struct Outcome {
 
 class Program : public testing::Test {
 protected:
-    void SetUp() override {
-        std::string pattern = (std::filesystem::temp_directory_path() / "gmpath-XXXXXX").string();
-        m_directory = mkdtemp(pattern.data());
-    }
-    void TearDown() override { std::filesystem::remove_all(m_directory); }
-
-    std::string path(const std::string& name) const { return (m_directory / name).string(); }
-
-    void store(const std::string& name, const std::string& text) const {
-        std::ofstream(path(name), std::ios::binary) << text;
-    }
-
     Outcome run(const std::string& arguments) const {
-        const std::string command = "cd " + m_directory.string() + " && " + GMPATH_PROGRAM + " " +
+        const std::string command = "cd " + m_scratch.directory() + " && " + GMPATH_PROGRAM + " " +
                                     arguments + " >out.txt 2>err.txt";
         const int status = std::system(command.c_str());
-        Outcome outcome{WIFEXITED(status) ? WEXITSTATUS(status) : -1, text("out.txt"),
-                        text("err.txt")};
-        std::filesystem::remove(path("out.txt"));
-        std::filesystem::remove(path("err.txt"));
+        Outcome outcome{WIFEXITED(status) ? WEXITSTATUS(status) : -1, m_scratch.content("out.txt"),
+                        m_scratch.content("err.txt")};
+        std::filesystem::remove(m_scratch.file("out.txt"));
+        std::filesystem::remove(m_scratch.file("err.txt"));
         return outcome;
     }
 
-    std::string text(const std::string& name) const {
-        std::ifstream stream(path(name));
-        return {std::istreambuf_iterator<char>(stream), {}};
-    }
-
-    std::size_t files() const {
-        return static_cast<std::size_t>(
-            std::distance(std::filesystem::directory_iterator(m_directory), {}));
-    }
-
-private:
-    std::filesystem::path m_directory;
+    const Scratch m_scratch;
 };
 
 const std::string kBracket = std::string(GMPATH_TEST_DATA) + "/bracket.dxf";
@@ -75,11 +54,11 @@ TEST_F(Program, InfoListsContoursAndWhatWasSkipped) {
 
 TEST_F(Program, OffsetWritesEveryOutput) {
     const Outcome offset =
-        run("offset " + kBracket + " --distance 2 --count 3 --step 1.5 -o a.svg -o a.dxf");
+        run("offset " + kBracket + " --distance 2 --count 3 --step 2.5 -o a.svg -o a.dxf");
     EXPECT_EQ(offset.exitCode, 0);
-    EXPECT_EQ(files(), 2U);
-    EXPECT_NE(text("a.svg").find("pass-3"), std::string::npos);
-    EXPECT_NE(offset.err.find("nothing left at distance 5"), std::string::npos);
+    EXPECT_EQ(m_scratch.files(), 2U);
+    EXPECT_NE(m_scratch.content("a.svg").find("pass-3"), std::string::npos);
+    EXPECT_NE(offset.err.find("nothing left at distance 7"), std::string::npos);
     const Outcome back = run("info a.dxf");
     EXPECT_EQ(back.exitCode, 0);
     EXPECT_NE(back.out.find("OFFSET_3"), std::string::npos);
@@ -87,15 +66,15 @@ TEST_F(Program, OffsetWritesEveryOutput) {
 }
 
 TEST_F(Program, BadInputIsOneLineAndExitCodeTwo) {
-    store("empty.dxf", "");
-    store("prose.dxf", "This is no drawing.\nNot at all.\n");
-    store("cut.dxf", "0\nSECTION\n2\nENTITIES\n0\nLINE\n8\n0\n10\n");
-    store("binary.dxf", std::string("\x7F"
-                                    "ELF\0\0\1\2",
-                                    8));
-    store("bare.dxf", "0\nSECTION\n2\nENTITIES\n0\nENDSEC\n0\nEOF\n");
-    std::filesystem::create_directory(path("folder.dxf"));
-    const std::size_t before = files();
+    m_scratch.store("empty.dxf", "");
+    m_scratch.store("prose.dxf", "This is no drawing.\nNot at all.\n");
+    m_scratch.store("cut.dxf", "0\nSECTION\n2\nENTITIES\n0\nLINE\n8\n0\n10\n");
+    m_scratch.store("binary.dxf", std::string("\x7F"
+                                              "ELF\0\0\1\2",
+                                              8));
+    m_scratch.store("bare.dxf", "0\nSECTION\n2\nENTITIES\n0\nENDSEC\n0\nEOF\n");
+    std::filesystem::create_directory(m_scratch.file("folder.dxf"));
+    const std::size_t before = m_scratch.files();
     const std::vector<std::pair<std::string, std::string>> cases = {
         {"info none.dxf", "none.dxf"},
         {"info folder.dxf", "folder.dxf"},
@@ -129,7 +108,7 @@ TEST_F(Program, BadInputIsOneLineAndExitCodeTwo) {
         EXPECT_TRUE(isOneLine(outcome.err)) << outcome.err;
         EXPECT_NE(outcome.err.find(cause), std::string::npos) << outcome.err;
         EXPECT_EQ(outcome.out, "");
-        EXPECT_EQ(files(), before);
+        EXPECT_EQ(m_scratch.files(), before);
     }
 }
 

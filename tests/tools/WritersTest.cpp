@@ -1,9 +1,6 @@
 #include <gtest/gtest.h>
 
-#include <cstdlib>
 #include <filesystem>
-#include <fstream>
-#include <locale>
 #include <regex>
 
 #include "AtomicFile.h"
@@ -13,6 +10,7 @@
 #include "OutputFiles.h"
 #include "PartReader.h"
 #include "PathShapes.h"
+#include "Scratch.h"
 #include "SvgWriter.h"
 
 using namespace gmpath;
@@ -22,29 +20,6 @@ using path_shapes::polygon;
 using path_shapes::rectangle;
 
 namespace {
-
-/// A directory that is removed with everything in it.
-class Scratch {
-public:
-    Scratch() {
-        std::string pattern = (std::filesystem::temp_directory_path() / "gmpath-XXXXXX").string();
-        m_directory = mkdtemp(pattern.data());
-    }
-    ~Scratch() { std::filesystem::remove_all(m_directory); }
-    std::string file(const std::string& name) const { return (m_directory / name).string(); }
-    std::size_t files() const {
-        const std::filesystem::directory_iterator begin(m_directory);
-        return static_cast<std::size_t>(std::distance(begin, {}));
-    }
-
-private:
-    std::filesystem::path m_directory;
-};
-
-std::string content(const std::string& name) {
-    std::ifstream stream(name);
-    return {std::istreambuf_iterator<char>(stream), {}};
-}
 
 std::vector<Path> someContours() {
     Path named = rectangle({-3.25, 1.0 / 3.0}, {123456.789, 40});
@@ -160,12 +135,12 @@ TEST(AtomicFile, NothingIsLeftUnlessCommitted) {
         EXPECT_EQ(scratch.files(), 1U);
     }
     EXPECT_EQ(scratch.files(), 0U);
-    std::ofstream(scratch.file("a.svg")) << "old";
+    scratch.store("a.svg", "old");
     AtomicFile file(scratch.file("a.svg"));
     file.write("new");
-    EXPECT_EQ(content(scratch.file("a.svg")), "old");
+    EXPECT_EQ(scratch.content("a.svg"), "old");
     file.commit();
-    EXPECT_EQ(content(scratch.file("a.svg")), "new");
+    EXPECT_EQ(scratch.content("a.svg"), "new");
     EXPECT_EQ(scratch.files(), 1U);
 }
 

@@ -71,7 +71,9 @@ std::string numberLabel(const Path& path, const std::string& number, bool inside
     const Element& first = path.elements.front();
     const bool leftIsInside = sense(path) == Sense::kCounterClockwise;
     const double toTheRight = sense(path) == Sense::kNone || leftIsInside != inside ? 1.0 : -1.0;
-    const Vec2 at = first.sp + toTheRight * size * rightNormal(tangentStart(first));
+    // A little ahead of the start as well, so that no other element of a corner crosses the text.
+    const Vec2 along = tangentStart(first);
+    const Vec2 at = first.sp + size * along + toTheRight * size * rightNormal(along);
     constexpr double kHalfCapital = 0.35;  // lowers the text so that it centres on the point
     return "<text class=\"source-mark\" text-anchor=\"middle\" font-size=\"" + formatReal(size) +
            "\" x=\"" + formatReal(at.x) + "\" y=\"" + formatReal(-at.y + kHalfCapital * size) +

@@ -1,5 +1,4 @@
 #include <gtest/gtest.h>
-#include <rapidcheck.h>
 
 #include <cmath>
 #include <string>
@@ -14,7 +13,6 @@ namespace {
 
 using namespace offset_laws;
 
-constexpr double kPi = 3.14159265358979323846;
 constexpr int kWholeContour = 1000000;
 constexpr auto kCcw = GmBase::eRotCCW;
 constexpr auto kCw = GmBase::eRotCW;

@@ -1,7 +1,7 @@
 #include <gtest/gtest.h>
-#include <rapidcheck.h>
 
 #include <cmath>
+#include <random>
 #include <vector>
 
 #include "contour/offset/BandPieces.h"
@@ -98,7 +98,7 @@ TEST(BandPieces, CapsOfATightArcMeetWhereTheirCirclesCross) {
             EXPECT_NEAR(x.Dist(ep), std::fabs(d), 1e-9);
             EXPECT_LT(x.X() + x.Y(), 1e-9) << "beyond the centre, or on it";
         }
-        EXPECT_EQ(bandPieces(arc, 0, 0, 1.99995).size(), rot == GmBase::eRotCCW ? 4u - 1u : 3u)
+        EXPECT_EQ(bandPieces(arc, 0, 0, 1.99995).size(), 3u)
             << "an offset below the length tolerance vanishes";
         EXPECT_EQ(bandPieces(arc, 0, 0, 1.9).size(), 4u);
     }
@@ -146,30 +146,30 @@ TEST(Insertion, CutsAPieceAtSeveralPointsInOrder) {
 
 TEST(Insertion, BoxesCoverEveryPointThatAMembershipTestAccepts) {
     int accepted = 0;
-    EXPECT_TRUE(rc::check([&accepted](unsigned seed) {
-        // Ends anywhere about the axes, by angles down to the snapping of directions.
-        const double r = std::pow(10.0, seed % 7 - 2.0);
-        const auto nearAxis = [](unsigned s) {
-            return (s % 4) * std::acos(0.0) +
-                   std::pow(10.0, -double(s % 7)) * ((s / 7) % 21 - 10.0);
-        };
+    std::mt19937 engine(7);
+    const auto below = [&engine](int n) { return static_cast<int>(engine() % unsigned(n)); };
+    // Next to the axes, where directions snap, and anywhere.
+    const auto anyAngle = [&] {
+        return below(4) * std::acos(0.0) + std::pow(10.0, -below(7)) * (below(21) - 10);
+    };
+    for (int i = 0; i < 3000; ++i) {
+        const double r = std::pow(10.0, below(7) - 2);
         const auto on = [r](double angle) {
             return GmPoint(3 + r * std::cos(angle), 4 + r * std::sin(angle));
         };
-        GmArc arc(on(nearAxis(seed)), on(nearAxis(seed / 3)), GmPoint(3, 4),
-                  seed % 2 == 0 ? GmBase::eRotCW : GmBase::eRotCCW);
-        if (seed % 5 < 2) arc.SetSP(on(nearAxis(seed / 5)));
-        if (seed % 5 < 3) arc.SetEP(on(nearAxis(seed / 11)));
+        GmArc arc(on(anyAngle()), on(anyAngle()), GmPoint(3, 4),
+                  below(2) == 0 ? GmBase::eRotCW : GmBase::eRotCCW);
+        if (below(2) == 0) arc.SetSP(on(anyAngle()));
+        if (below(2) == 0) arc.SetEP(on(anyAngle()));
         const PieceBox box = reachOf(arc);
-        for (int k = 0; k < 720; ++k) {
-            const double angle = k < 360 ? k * 0.0174533 : nearAxis(static_cast<unsigned>(k));
-            const GmPoint p = on(angle);
+        for (int k = 0; k < 100; ++k) {
+            const GmPoint p = on(anyAngle());
             if (!arc.Element(p)) continue;
             ++accepted;
-            RC_ASSERT(box.overlaps({p.X(), p.X(), p.Y(), p.Y()}));
+            ASSERT_TRUE(box.overlaps({p.X(), p.X(), p.Y(), p.Y()})) << arc.GetTraceString();
         }
-    }));
-    EXPECT_GT(accepted, 1000);
+    }
+    EXPECT_GT(accepted, 50000);
 }
 
 TEST(Removal, DropsWhatComesNearerThanTheDistance) {

@@ -77,18 +77,17 @@ TEST(Offsetting, ASquareGrowsWithRoundedCornersAndShrinksWithSharpOnes) {
 
 TEST(Offsetting, ElementsOfResultsCarryTheIdentifierOfTheirSource) {
     GmContour square = Numbered(shapes::Square(10));
-    square.Offsetting(1, kWholeContour, false);
-    // The corner belongs to the element that ends there. The chain starts with the corner before
-    // the smallest identifier only if that has the same identifier.
+    ASSERT_EQ(square.Offsetting(1, kWholeContour, false), 1);
+    // A corner belongs to the element that ends there.
     EXPECT_EQ(Identifiers(*square.GetSubContour(0)),
               (std::vector<long>{10, 10, 20, 20, 30, 30, 40, 40}));
-    square.Offsetting(-1, kWholeContour, false);
+    ASSERT_EQ(square.Offsetting(-1, kWholeContour, false), 1);
     EXPECT_EQ(Identifiers(*square.GetSubContour(0)), (std::vector<long>{10, 20, 30, 40}));
 
     GmContour descending;
     for (int i = 0; i < 4; ++i)
         descending.AddElement(square.GetElement(i), false, 4 - i);
-    descending.Offsetting(-1, kWholeContour, false);
+    ASSERT_EQ(descending.Offsetting(-1, kWholeContour, false), 1);
     EXPECT_EQ(Identifiers(*descending.GetSubContour(0)), (std::vector<long>{1, 4, 3, 2}));
 }
 
@@ -217,7 +216,7 @@ TEST(Offsetting, OpenResultsToTheInsideAreKeptOnDemand) {
     ASSERT_EQ(square.Offsetting(-1, 1, true), 4);
     for (GmContour const* result : Results(square))
         EXPECT_FALSE(result->IsClosed());
-    EXPECT_EQ(square.Offsetting(-1, 1, false), 1);
+    ASSERT_EQ(square.Offsetting(-1, 1, false), 1);
     EXPECT_TRUE(square.GetSubContour(0)->IsClosed());
 }
 
@@ -226,6 +225,7 @@ TEST(Offsetting, OpenChainsKeepTheCapAtTheirEnd) {
     for (const double d : {1.0, -1.0}) {
         ASSERT_EQ(wave.Offsetting(d, kWholeContour, false), 1);
         GmContour const& result = *wave.GetSubContour(0);
+        ASSERT_EQ(result.ElementCount(), 4);
         EXPECT_FALSE(result.IsClosed());
         EXPECT_EQ(Identifiers(result), (std::vector<long>{1, 2, 3, 3}));
         EXPECT_EQ(result.GetElement(0)->SP(), GmPoint(-5, -d));
@@ -240,11 +240,11 @@ TEST(Offsetting, ResultsBelongToTheContour) {
         square.SimpleOffsetting(-1);
         square.Offsetting(0, kWholeContour, false);
         // An offset may be offset in turn, and so may a copy that outlives its source.
-        square.Offsetting(2, kWholeContour, false);
+        ASSERT_EQ(square.Offsetting(2, kWholeContour, false), 1);
         GmContour grown(*square.GetSubContour(0));
         EXPECT_EQ(square.GetSubContour(0)->Offsetting(-1, kWholeContour, false), 1);
         square.Offsetting(-20, kWholeContour, false);
-        EXPECT_EQ(grown.Offsetting(-3, kWholeContour, false), 1);
+        ASSERT_EQ(grown.Offsetting(-3, kWholeContour, false), 1);
         EXPECT_NEAR(Area(*grown.GetSubContour(0)), 64, 1e-6);
     }
 }

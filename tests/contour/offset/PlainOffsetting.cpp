@@ -4,7 +4,8 @@
 #include <cmath>
 #include <limits>
 
-#include "contour/offset/OffsetElement.h"
+#include "contour/offset/BandPieces.h"
+#include "contour/offset/ResultContour.h"
 #include "curves/dispatch/Distance.h"
 #include "gmkernel/GmArc.h"
 #include "gmkernel/GmContElement.h"
@@ -46,37 +47,6 @@ void Insert(Pieces& active, GmOffsetElement const& added) {
     for (GmOffsetElement const& part : Split(added, all))
         cut.push_back(part);
     active.swap(cut);
-}
-
-void InsertBand(Pieces& active, GmCurve const& element, int source, int id, double d) {
-    const GmPoint sp = element.SP();
-    const GmPoint ep = element.EP();
-    const GmVec atStart = d * GmVec(element.TangSP().Normalized(GmBase::eRotCW));
-    const GmVec atEnd = d * GmVec(element.TangEP().Normalized(GmBase::eRotCW));
-    const GmBase::eRotDir rot = d > 0 ? GmBase::eRotCCW : GmBase::eRotCW;
-    GmPoint startFrom(sp - atStart);
-    GmPoint startTo(sp + atStart);
-    GmPoint endFrom(ep + atEnd);
-    GmPoint endTo(ep - atEnd);
-    if (element.IsArc() && static_cast<GmArc const&>(element).R() <= std::fabs(d)) {
-        const GmBase::eRotDir turn = static_cast<GmArc const&>(element).Dir();
-        const GmVec chord = ep - sp;
-        GmDir normal(chord);
-        normal.Normalize(turn);
-        const double h = std::sqrt(std::max(0.0, d * d - chord.Norm() / 4));
-        const GmPoint x(sp + chord / 2.0 + h * GmVec(normal));
-        const bool away = d > 0 ? turn == GmBase::eRotCCW : turn == GmBase::eRotCW;
-        (away ? startFrom : startTo) = x;
-        (away ? endTo : endFrom) = x;
-    }
-    std::unique_ptr<GmCurve> offset(element.GetParallel(d));
-    std::unique_ptr<GmCurve> other(element.GetParallel(-d));
-    other->Invert();
-
-    Insert(active, {new GmArc(startFrom, startTo, sp, rot), source, id, false, true});
-    if (offset->CreationOK()) Insert(active, {offset.release(), source, id, true, false});
-    Insert(active, {new GmArc(endFrom, endTo, ep, rot), source, id, true, true});
-    if (other->CreationOK()) Insert(active, {other.release(), source, id, false, true});
 }
 
 bool ComesTooNear(GmOffsetElement const& piece, GmContour const& span, double d) {
@@ -128,21 +98,6 @@ Pieces TakeChain(Pieces& pieces) {
     return chain;
 }
 
-std::unique_ptr<GmContour> ContourOf(Pieces const& chain) {
-    auto contour = std::make_unique<GmContour>();
-    const auto append = [&](GmCurve* curve, int id, bool inserted) {
-        contour->AddElement(new GmContElement{curve, id, contour->ElementCount(), inserted}, false);
-    };
-    for (GmOffsetElement const& piece : chain) {
-        const long n = contour->ElementCount();
-        const GmPoint end = n > 0 ? contour->GetElement(static_cast<int>(n) - 1)->EP() : GmPoint();
-        const GmPoint start = piece.curve().SP();
-        if (n > 0 && end != start) append(new GmStretch(end, start), piece.id(), true);
-        append(piece.curve().Clone(), piece.id(), piece.auxiliary());
-    }
-    return contour;
-}
-
 /// The pieces of the kept side that keep their distance, in the order in which they leave the span.
 Pieces Sweep(GmContour const& source, double d, int span) {
     Pieces active;
@@ -152,7 +107,9 @@ Pieces Sweep(GmContour const& source, double d, int span) {
         GmContElement const& record = *source.GetContElement(i);
         recent.AddElement(record.pCurve, false, 0);
         if (i >= span) recent.RemoveElement(0);
-        InsertBand(active, *record.pCurve, i, static_cast<int>(record.lId), d);
+        const int id = static_cast<int>(record.lId);
+        for (GmOffsetElement const& piece : gmkernel_detail::bandPieces(*record.pCurve, i, id, d))
+            Insert(active, piece);
         Pieces staying;
         for (GmOffsetElement const& piece : active) {
             if (ComesTooNear(piece, recent, d)) continue;
@@ -179,11 +136,10 @@ std::vector<std::unique_ptr<GmContour>> PlainOffsetting(GmContour& source, doubl
         Pieces chain = TakeChain(pieces);
         const auto tooShort = [](GmOffsetElement const& p) { return p.curve().Length() < 0.001; };
         chain.erase(std::remove_if(chain.begin(), chain.end(), tooShort), chain.end());
-        auto contour = ContourOf(chain);
-        const bool auxiliary = std::all_of(chain.begin(), chain.end(),
-                                           [](GmOffsetElement const& p) { return p.auxiliary(); });
-        if (!auxiliary && !(insideOnly && !contour->IsClosed()))
-            results.push_back(std::move(contour));
+        gmkernel_detail::PieceList ofResult(chain.begin(), chain.end());
+        auto contour = gmkernel_detail::resultContour(ofResult);
+        const bool dropped = insideOnly && !contour->IsClosed();
+        if (gmkernel_detail::hasOffset(ofResult) && !dropped) results.push_back(std::move(contour));
     }
     return results;
 }
