@@ -84,8 +84,10 @@ TEST(GmCircle, TellsInsideOutsideAndRim) {
     EXPECT_FALSE(circle.Tangent(GmPoint(5.1, 0)).CreationOK());
     EXPECT_EQ(Text(circle.TangDir(GmPoint(5.1, 0))), "none");
     // The radial direction turned by exchanging its components, not normalised anew.
-    GmPoint const p = Along(circle, 0.3);
-    EXPECT_EQ(circle.TangDir(p).X(), GmDir(circle.M(), p).Y());
+    for (int i = 0; i < 40; ++i) {
+        GmPoint const p = Along(circle, i / 40.0);
+        EXPECT_EQ(circle.TangDir(p).X(), GmDir(circle.M(), p).Y()) << i;
+    }
 }
 
 TEST(GmCircle, MeasuresGapsAndTouchingPoints) {

@@ -159,6 +159,7 @@ TEST(Offsetting, TinyDistancesCopyAndOthersThatAreNoNumbersGiveNothing) {
         wave.SimpleOffsetting(1);
         EXPECT_EQ(wave.Offsetting(d, kWholeContour, true), 0);
         EXPECT_EQ(wave.GetSubContour(0), nullptr);
+        EXPECT_EQ(shapes::Polyline({GmPoint(0, 0), GmPoint(9, 0)}).SimpleOffsetting(d), 0);
     }
     GmContour empty;
     EXPECT_EQ(empty.Offsetting(1, kWholeContour, false), 0);
