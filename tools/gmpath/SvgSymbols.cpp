@@ -49,6 +49,13 @@ std::string coordinates(Vec2 p) {
 
 }  // namespace
 
+std::string textTag(Vec2 at, double size, const std::string& attributes, const std::string& text) {
+    constexpr double kFontSize = 10.0;
+    return "<text transform=\"translate(" + coordinates(at) + ") scale(" +
+           formatReal(size / kFontSize) + ")\" font-size=\"" + formatReal(kFontSize) + "\" " +
+           attributes + ">" + text + "</text>\n";
+}
+
 std::string startMark(const Path& path, const std::string& styleClass, double diagonal) {
     if (path.elements.empty()) return {};
     const Element& first = path.elements.front();
@@ -75,9 +82,8 @@ std::string numberLabel(const Path& path, const std::string& number, bool inside
     const Vec2 along = tangentStart(first);
     const Vec2 at = first.sp + size * along + toTheRight * size * rightNormal(along);
     constexpr double kHalfCapital = 0.35;  // lowers the text so that it centres on the point
-    return "<text class=\"source-mark\" text-anchor=\"middle\" font-size=\"" + formatReal(size) +
-           "\" x=\"" + formatReal(at.x) + "\" y=\"" + formatReal(-at.y + kHalfCapital * size) +
-           "\">" + number + "</text>\n";
+    return textTag({at.x, at.y - kHalfCapital * size}, size,
+                   "class=\"source-mark\" text-anchor=\"middle\"", number);
 }
 
 }  // namespace gmpath

@@ -147,7 +147,7 @@ private:
         constexpr double kEntryWidth = 9.0;  // in text sizes
         const double perLine = m_box.size().x / (kEntryWidth * size);
         const std::size_t entries = m_drawing.distances.size() + 1;
-        m_svg += "<g id=\"legend\" font-size=\"" + formatReal(size) + "\">\n";
+        m_svg += "<g id=\"legend\">\n";
         for (std::size_t i = 0; i < entries && static_cast<double>(i) <= perLine; ++i) {
             const Vec2 at{m_box.low.x + static_cast<double>(i) * kEntryWidth * size,
                           m_box.low.y - kMarginFraction * m_diagonal - size};
@@ -161,9 +161,8 @@ private:
         const std::size_t pass = source ? 0 : entry - 1;
         const std::string text =
             source ? "source" : "offset " + formatReal(m_drawing.distances[pass], 6);
-        m_svg += std::string("<text x=\"") + formatReal(at.x) + "\" y=\"" + formatReal(-at.y) +
-                 "\" fill=\"" + (source ? kSourceColour : passColour(pass)) + "\">" + text +
-                 "</text>\n";
+        const std::string colour = source ? kSourceColour : passColour(pass);
+        m_svg += textTag(at, legendSize(), "fill=\"" + colour + "\"", text);
     }
 
     const OffsetDrawing& m_drawing;
