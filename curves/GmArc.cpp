@@ -146,7 +146,8 @@ GmPoint GmArc::EP() const {
 }
 
 GmDir GmArc::TangentAt(GmDir const& radial) const {
-    GmDir tangent = radial.Normalized(eRotCW);
+    GmDir tangent(radial);
+    tangent.Normalize(eRotCW);
     if (m_eDir != eRotCW) tangent.Invert();
     return tangent;
 }

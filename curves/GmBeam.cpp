@@ -33,7 +33,7 @@ GmBeam* GmBeam::Clone() const {
 }
 
 void GmBeam::Invert() {
-    GmLine::Invert();
+    m_Dir.Invert();
 }
 
 bool GmBeam::Element(GmPoint const& p, double eps) const {

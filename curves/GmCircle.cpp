@@ -125,7 +125,10 @@ GmDir const& GmCircle::Axis() const {
 }
 
 GmDir GmCircle::TangDir(GmPoint const& p) const {
-    return Element(p) ? GmDir(m_M, p).Normalized(eRotCW) : GmDir();
+    if (!Element(p)) return GmDir();
+    GmDir tangent(m_M, p);
+    tangent.Normalize(eRotCW);
+    return tangent;
 }
 
 double GmCircle::Dist(GmLine const& line) const {

@@ -22,6 +22,7 @@ TEST(GmCircle, IntersectsLinesInFixedOrder) {
         {"touching a slope", Stretch(3, 4, 7, 1), "3,4,2"},
         {"passing just outside", Stretch(9, 5.00009, 10, 5.00009), "0,5,2"},
         {"passing outside", Stretch(9, 5.00011, 10, 5.00011), ""},
+        {"dipping in by less than the tolerance", Stretch(9, 5 - 1e-10, 8, 5 - 1e-10), "0,5,2"},
         {"vertical, upper first", Stretch(3, 9, 3, 1), "3,4,2 3,-4,2"},
         {"vertical, touching", Stretch(5, 9, 5, 10), "5,0,2"},
         {"vertical, just outside", Stretch(5.00005, 9, 5.00005, 10), ""},
@@ -30,6 +31,8 @@ TEST(GmCircle, IntersectsLinesInFixedOrder) {
         circle.IntersectionWithLine(c.line);
         EXPECT_EQ(TextOf(circle.GetPtSol()), c.hits) << c.name;
     }
+    EXPECT_EQ(circle.IntersectionWithLine(Stretch(4.999999, 9, 4.999999, 8)), 2)
+        << "a vertical line merges its points only when they are as good as one";
     GmStretch const beside = Stretch(7, 5, 9, 5);
     EXPECT_EQ(circle.IntersectionWithLine(beside), 0) << "a stretch is touched only where it is";
 }

@@ -128,7 +128,7 @@ TEST(Joining, ConnectingArcsAreTangential) {
             GmPoint const m(2.0 * end - link.M());
             return GmArc(m, link.R(), sAng + M_PI, eAng + M_PI, turned);
         };
-        double const s = link.SAng(), e = link.EAng(), bend = link.Dir() == CW ? -1.0 : 1.0;
+        double const s = link.SAng(), e = link.EAng(), bend = link.Dir() == CW ? -2.0 : 2.0;
         Curve const before[] = {
             hold(GmStretch(GmPoint(link.SP() - GmVec(link.TangSP())), link.SP())),
             hold(beside(link.SP(), s + bend, s))};

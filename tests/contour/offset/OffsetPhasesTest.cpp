@@ -19,7 +19,7 @@ using namespace gmkernel_detail;
 
 GmOffsetElement Segment(double x0, double y0, double x1, double y1, int id = 1,
                         bool auxiliary = false) {
-    return {new GmStretch(GmPoint(x0, y0), GmPoint(x1, y1)), 0, id, true, auxiliary};
+    return {std::make_unique<GmStretch>(GmPoint(x0, y0), GmPoint(x1, y1)), 0, id, true, auxiliary};
 }
 
 PieceList ListOf(std::vector<GmOffsetElement> const& elements) {
@@ -134,9 +134,9 @@ TEST(Insertion, CutsAPieceAtSeveralPointsInOrder) {
     EXPECT_EQ(Starts(active), (std::vector<double>{6, 6, 2, 2, 8, 8, 4, 4, 0, 2, 4, 6, 8}));
 
     // A clockwise arc from the left to the right crosses two of the verticals.
-    auto* arc = new GmArc(GmPoint(1, 0), GmPoint(7, 0), GmPoint(4, 0), GmBase::eRotCW);
+    auto arc = std::make_unique<GmArc>(GmPoint(1, 0), GmPoint(7, 0), GmPoint(4, 0), GmBase::eRotCW);
     PieceList verticals = ListOf({Segment(6, 0.5, 6, 9), Segment(2, 0.5, 2, 9)});
-    insertPiece(verticals, {arc, 0, 1, true, false});
+    insertPiece(verticals, {std::move(arc), 0, 1, true, false});
     EXPECT_EQ(verticals.size(), 7u);
     const auto starts = Starts(verticals);
     EXPECT_NEAR(starts[4], 1, 1e-9);
