@@ -31,13 +31,6 @@ GmArc FullCircle() {
     return GmArc(GmPoint(1, 0), GmPoint(1, 0), GmPoint(0, 0), GmBase::eRotCCW);
 }
 
-std::vector<long> Identifiers(GmContour const& contour) {
-    std::vector<long> ids;
-    for (int i = 0; i < contour.ElementCount(); ++i)
-        ids.push_back(contour.GetContElement(i)->lId);
-    return ids;
-}
-
 // (0,0) to (10,0) to (10,10), identifiers 1 and 2.
 OpenContour Angle() {
     OpenContour contour;
@@ -97,18 +90,6 @@ TEST(ContourBuilding, ValidationAllowsContactOnlyAtTheJointAndTheClosingEnd) {
     }
 }
 
-TEST(ContourBuilding, ValidationRefusesWhatMeetsTheChainOnceMoreThanAtTheJoint) {
-    // Straight on into the first element: the collinear joint gives no point, the end does.
-    GmContour straightOn =
-        shapes::Polyline({GmPoint(0, 0), GmPoint(0, 10), GmPoint(10, 5), GmPoint(5, 5)});
-    EXPECT_FALSE(straightOn.AddElement(Segment(5, 5, 0, 5), true, 0));
-    EXPECT_TRUE(straightOn.AddElement(Segment(5, 5, 1, 5), true, 0));
-    // The joint itself lies on the first element and is found twice.
-    GmContour touching =
-        shapes::Polyline({GmPoint(0, 0), GmPoint(10, 0), GmPoint(10, 5), GmPoint(5, 0)});
-    EXPECT_FALSE(touching.AddElement(Segment(5, 0, 5, -5), true, 0));
-}
-
 TEST(ContourBuilding, AClosingElementMustNotCrossTheChain) {
     GmContour zigzag = shapes::Polyline(
         {GmPoint(0, 0), GmPoint(4, 4), GmPoint(6, -4), GmPoint(8, 4), GmPoint(10, 0)});
@@ -131,20 +112,6 @@ TEST(ContourBuilding, SimpleContoursPassTheValidation) {
             RC_ASSERT(rebuilt == variant.contour);
         }
     }));
-}
-
-TEST(ContourBuilding, ATakenRecordKeepsItsFieldsAndARefusedOneItsOwner) {
-    OpenContour contour = Angle();
-    GmContElement* const taken =
-        OpenContour::CreateContElement(new GmStretch(GmPoint(10, 10), GmPoint(0, 10)), 5, 42, true);
-    ASSERT_TRUE(contour.AddElement(taken, false));
-    EXPECT_EQ(contour.GetContElement(2), taken);
-    EXPECT_EQ(taken->lId, 5);
-    EXPECT_EQ(taken->lIndex, 42);
-    EXPECT_TRUE(taken->bInserted);
-    const auto refusedCurve = std::make_unique<GmStretch>(GmPoint(7, 7), GmPoint(0, 0));
-    GmContElement refused{refusedCurve.get(), 0, 0, false};
-    EXPECT_FALSE(contour.AddElement(&refused, false));
 }
 
 TEST(ContourBuilding, InsertingMarksTheElementAndReevaluatesTheClosedFlag) {
@@ -211,32 +178,6 @@ TEST(ContourBuilding, CloseJoinsTheEndsUnlessTheyMeet) {
     GmContour empty;
     empty.Close(true);
     EXPECT_EQ(empty.ElementCount(), 0);
-}
-
-TEST(ContourBuilding, ChecksTheChain) {
-    OpenContour contour;
-    EXPECT_TRUE(contour.CheckContour());
-    contour = shapes::Square(10);
-    EXPECT_TRUE(contour.CheckContour());
-    contour.RemoveElement(3);
-    EXPECT_FALSE(contour.CheckContour()) << "still flagged as closed";
-    OpenContour angle = Angle();
-    EXPECT_TRUE(angle.CheckContour());
-    angle.GetElement(1)->SetSP(GmPoint(10, 0.5));
-    EXPECT_FALSE(angle.CheckContour());
-}
-
-TEST(ContourBuilding, RealElementsHaveEndsApart) {
-    OpenContour contour;
-    GmStretch tiny = Segment(0, 0, 5e-5, 0);
-    GmArc circle = FullCircle();
-    GmStretch real = Segment(0, 0, 2, 2);
-    EXPECT_FALSE(contour.AddRealElem(&tiny) || contour.AddRealElem(&circle, 3));
-    EXPECT_FALSE(contour.AddRealElem(nullptr));
-    EXPECT_TRUE(contour.AddRealElem(&real, 3));
-    EXPECT_EQ(Identifiers(contour), std::vector<long>{3});
-    EXPECT_EQ(contour.GetHP(0), GmPoint(1, 1));
-    EXPECT_FALSE(contour.GetHP(1).CreationOK());
 }
 
 TEST(ContourBuilding, SurvivesCurvesWithoutGeometry) {

@@ -105,18 +105,6 @@ TEST(ContourIntersection, CrossingsOfTwoStarsAreTheSameFromBothSides) {
     }));
 }
 
-TEST(ContourIntersection, AContourMeetsItselfAtItsJoints) {
-    // Each joint comes from both of its elements; the list under construction is this contour's
-    // own.
-    const GmContour square = shapes::Square(10);
-    square.IntersectionWithCurve(&square);
-    EXPECT_FALSE(square.GetPtSol().empty());
-    for (GmPoint const& p : square.GetPtSol()) {
-        EXPECT_TRUE((p.X() == 0 || p.X() == 10) && (p.Y() == 0 || p.Y() == 10));
-    }
-    EXPECT_EQ(square.Intersection(&square, false), 0);
-}
-
 TEST(ContourIntersection, ACurveThatCannotBeIntersectedThrowsAndLeavesNoPoints) {
     const GmContour square = shapes::Square(10);
     Hits(square, GmStretch(GmPoint(5, -5), GmPoint(5, 15)));

@@ -30,19 +30,6 @@ GmContour SquareAt(double x, double side) {
 
 }  // namespace
 
-TEST(ContourModel, AnEmptyContourAnswersTheDefaults) {
-    GmContour empty;
-    EXPECT_TRUE(empty.IsContour() && empty.CreationOK() && !empty.IsClosed());
-    EXPECT_FALSE(empty.SP().CreationOK() || empty.GetLastInsertPoint().CreationOK());
-    for (const int index : {-1, 0}) {
-        EXPECT_TRUE(empty.GetSubContour(index) == nullptr && empty.GetElement(index) == nullptr);
-        EXPECT_EQ(empty.GetContElement(index), nullptr);
-        EXPECT_EQ(empty.GetNewElement(index), nullptr);
-    }
-    EXPECT_EQ(empty.GetMaxSubContour(), nullptr);
-    EXPECT_EQ(empty.GetNearSubContour(GmPoint(0, 0)), nullptr);
-}
-
 TEST(ContourModel, CopiesAreEqualIndependentAndWithoutIdentifiers) {
     EXPECT_TRUE(rc::check([](unsigned seed) {
         OpenContour source;
@@ -109,18 +96,6 @@ TEST(ContourModel, AContourCanBecomeItsOwnSubContour) {
     EXPECT_EQ(contour.GetSubContour(0), nullptr);
 }
 
-TEST(ContourModel, HandsOutNewElementsOfBothKindsOnly) {
-    GmContour contour = shapes::Slot(5, 2);
-    contour.AddElement(GmLine(GmPoint(0, 0), GmPoint(1, 0)), false, 0);
-    ASSERT_EQ(contour.ElementCount(), 5) << "a line from the end of the chain passes the tests";
-    const std::unique_ptr<GmCurve> segment(contour.GetNewElement(0));
-    const std::unique_ptr<GmCurve> arc(contour.GetNewElement(1));
-    EXPECT_TRUE(segment->IsStretch() && arc->IsArc());
-    EXPECT_EQ(static_cast<GmArc&>(*arc), static_cast<GmArc&>(*contour.GetElement(1)));
-    EXPECT_NE(arc.get(), contour.GetElement(1));
-    EXPECT_EQ(contour.GetNewElement(4), nullptr);
-}
-
 TEST(ContourModel, FindsTheEnclosingSubContourInAnyOrder) {
     const GmContour inner = SquareAt(4, 2);
     const GmContour middle = SquareAt(2, 6);
@@ -139,34 +114,4 @@ TEST(ContourModel, FindsTheEnclosingSubContourInAnyOrder) {
         contour.AddSub(SquareAt(5, 10));
         EXPECT_EQ(contour.GetMaxSubContour(), nullptr);
     }
-}
-
-TEST(ContourModel, FindsTheNearSubContourByItsStart) {
-    OpenContour contour;
-    for (GmContour const& sub : {GmContour(), SquareAt(0, 9), SquareAt(4, 1), SquareAt(4, 2)}) {
-        contour.AddSub(sub);
-    }
-    EXPECT_EQ(contour.GetNearSubContour(GmPoint(1, 1)), contour.GetSubContour(1));
-    EXPECT_EQ(contour.GetNearSubContour(GmPoint(9, 9)), contour.GetSubContour(2));
-    EXPECT_EQ(contour.GetNearSubContour(GmPoint(2, 2)), contour.GetSubContour(1));
-    EXPECT_EQ(contour.GetSubContour(4), nullptr);
-    EXPECT_EQ(contour.GetSubContour(-1), nullptr);
-}
-
-TEST(ContourModel, AnOffsetByNothingLeavesOneCopyWithItsIdentifiers) {
-    OpenContour contour;
-    contour.AddSub(GmContour());
-    contour.AddSub(GmContour());
-    for (int i = 0; i < 3; ++i) {
-        contour.AddElement(GmStretch(GmPoint(i, 0), GmPoint(i + 1, 0)), false, 10 + i);
-    }
-    EXPECT_EQ(contour.SimpleOffsetting(0.0), 1);
-    ASSERT_EQ(contour.GetSubContour(1), nullptr);
-    EXPECT_EQ(*contour.GetSubContour(0), contour);
-    for (int i = 0; i < 3; ++i) {
-        EXPECT_EQ(contour.GetSubContour(0)->GetContElement(i)->lId, 10 + i);
-    }
-    contour.InitAll();
-    EXPECT_EQ(contour.GetSubContour(0), nullptr);
-    EXPECT_EQ(contour.ElementCount(), 0);
 }

@@ -30,27 +30,6 @@ double NearestSample(GmContour const& contour, GmPoint const& p) {
 
 }  // namespace
 
-TEST(ContourQueries, AnEmptyContourAnswersTheDefaults) {
-    GmContour empty;
-    const GmPoint p(1, 2);
-    double d = 0;
-    EXPECT_EQ(empty.Dist(p), 1e30);
-    EXPECT_FALSE(empty.MinDist(d, p, false).CreationOK());
-    EXPECT_EQ(d, kLargest);
-    EXPECT_FALSE(empty.MinDist(d, &empty, false).CreationOK());
-    EXPECT_EQ(d, kLargest);
-    EXPECT_FALSE(empty.MinDist(d, p, p, false).CreationOK());
-    EXPECT_EQ(d, -1.0);
-    EXPECT_FALSE(empty.NearPoint(p).CreationOK() || empty.FarPoint(p).CreationOK());
-    EXPECT_EQ(empty.NearPointElem(p), -1);
-    EXPECT_EQ(empty.NearPointElem(p, p), -1);
-    EXPECT_EQ(empty.LastPointElem(p), -1);
-    EXPECT_FALSE(empty.Element(p) || empty.In(p));
-    EXPECT_TRUE(empty.Out(p));
-    EXPECT_EQ(empty.Dir(p), GmBase::eRotNone);
-    EXPECT_FALSE(empty.BoundingRect().CreationOK() || empty.Tangent(p).CreationOK());
-}
-
 TEST(ContourQueries, MinDistIsTheDistanceOfAPointOfTheContour) {
     EXPECT_TRUE(rc::check([](unsigned seed) {
         const GmPoint p = RandomPoint();
@@ -67,27 +46,6 @@ TEST(ContourQueries, MinDistIsTheDistanceOfAPointOfTheContour) {
             RC_ASSERT(sampled * sampled <= d * d + 2 * d * reach + 4 * reach * reach);
         }
     }));
-}
-
-TEST(ContourQueries, DistOfASquare) {
-    const GmContour square = shapes::Square(10);
-    EXPECT_DOUBLE_EQ(square.Dist(GmPoint(5, -3)), 3);
-    double d = 0;
-    EXPECT_EQ(square.MinDist(d, GmPoint(5, -3), false), GmPoint(5, 0));
-    EXPECT_DOUBLE_EQ(d, 3);
-    EXPECT_EQ(square.MinDist(d, GmPoint(5, 5), false), GmPoint(5, 0)) << "the first of equal ones";
-    EXPECT_FALSE(square.MinDist(GmPoint(5, -3), false).CreationOK());
-    EXPECT_FALSE(square.NP(GmPoint(5, -3)).CreationOK());
-}
-
-TEST(ContourQueries, MinDistPrefersThePointNearerToASecondOne) {
-    GmContour square = shapes::Square(10);
-    double d = 0;
-    EXPECT_EQ(square.MinDist(d, GmPoint(5, 5), GmPoint(5, 20), false), GmPoint(5, 10));
-    EXPECT_DOUBLE_EQ(d, 5);
-    EXPECT_EQ(square.MinDist(d, GmPoint(5, 5), GmPoint(20, 5), false), GmPoint(10, 5));
-    EXPECT_EQ(square.MinDist(d, GmPoint(5, 5), GmPoint(5, 5), false), GmPoint(5, 0));
-    EXPECT_EQ(square.MinDist(d, GmPoint(5, 4.9), GmPoint(5, 20), false), GmPoint(5, 0));
 }
 
 TEST(ContourQueries, MinDistToACurveIsTheSameFromBothContours) {
@@ -205,18 +163,4 @@ TEST(ContourQueries, TheSenseOfArcsCountsWhereTheJointsEncloseNothing) {
     const double inf = std::numeric_limits<double>::infinity();
     noHeight.AddElement(GmStretch(GmPoint(0, 0, inf), GmPoint(1, 0, inf)), false, 0);
     EXPECT_EQ(noHeight.Dir(GmPoint(0, 0)), GmBase::eRotNone) << "the start equals no point";
-}
-
-TEST(ContourQueries, TheBoxIsTheSmallestAroundTheContour) {
-    EXPECT_TRUE(rc::check([](unsigned seed) {
-        for (auto const& variant : shapes::Variants(shapes::RandomStar(seed, true))) {
-            const GmRect box = variant.contour.BoundingRect();
-            GmRect sampled;
-            for (GmPoint const& p : shapes::Samples(variant.contour, 60))
-                sampled.Include(p);
-            RC_ASSERT(box.Or(sampled) == box);
-            RC_ASSERT(box.Width() - sampled.Width() < 0.01 * variant.scale);
-            RC_ASSERT(box.Height() - sampled.Height() < 0.01 * variant.scale);
-        }
-    }));
 }

@@ -40,34 +40,6 @@ TEST(KxArray, GrowsByTheStepOrToTheSizeNeeded) {
     }
 }
 
-TEST(KxArray, NewEntriesAreNullAlsoWhereAShrunkArrayHadValues) {
-    OpenArray array;
-    array.SetSize(3);
-    for (int i = 0; i < 3; ++i)
-        array[i] = &g_values[i];
-    array.SetSize(1);
-    array.SetSize(3);
-    EXPECT_EQ(Content(array), (std::vector<int*>{&g_values[0], nullptr, nullptr}));
-    array.InsertAt(5, &g_values[5]);
-    EXPECT_EQ(Content(array),
-              (std::vector<int*>{&g_values[0], nullptr, nullptr, nullptr, nullptr, &g_values[5]}));
-    array.SetSize(0);
-    EXPECT_EQ(array.Capacity(), 0);
-}
-
-TEST(KxArray, IgnoresNegativeAndOutsideArguments) {
-    OpenArray array;
-    array.SetAtGrow(0, &g_values[0]);
-    array.SetSize(-1);
-    array.SetAtGrow(-1, &g_values[1]);
-    array.InsertAt(-1, &g_values[1]);
-    array.InsertAt(0, &g_values[1], -2);
-    array.RemoveAt(0, 2);
-    array.RemoveAt(1, 1);
-    array.RemoveAt(-1, 1);
-    EXPECT_EQ(Content(array), std::vector<int*>{&g_values[0]});
-}
-
 TEST(KxArray, FollowsAModelThroughRandomEdits) {
     EXPECT_TRUE(rc::check([] {
         OpenArray array;

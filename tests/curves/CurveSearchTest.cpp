@@ -83,17 +83,6 @@ TEST(CurveSearch, FindsTheApproachOfTwoCurves) {
     }
 }
 
-TEST(CurveSearch, SortsAndFiltersPoints) {
-    GmArc const arc = Arc(0, 0, 5, 0, 180, CW);
-    GmPoint const low(0, -5), farEnd(-5, 0), beside(0, -7), above(0, 5);
-    less_than_curve const before(&arc);
-    EXPECT_TRUE(before(low, farEnd) && !before(farEnd, low)) << "along the arc";
-    EXPECT_FALSE(before(low, beside) || before(beside, low)) << "only the direction counts";
-    point_is_element const on(&arc);
-    EXPECT_TRUE(on(low) && !on(above) && !on(beside));
-    EXPECT_EQ(GmCircle(arc).DistSP(low), std::numeric_limits<double>::max());
-}
-
 TEST(CurveSearch, ComparesBareCurvesByTheirLists) {
     GmLine const a(Stretch(0, 0, 1, 0)), b(Stretch(3, 0, 3, 1)), c(Stretch(4, 0, 4, 1));
     GmCurve const &bareA = a, &bareB = b;

@@ -44,24 +44,6 @@ TEST(GmRect, OrdersItsCornersAndDropsZ) {
     }
 }
 
-TEST(GmRect, MeasuresCrossedCornersToo) {
-    GmRect r(0, 0, 4, 3);
-    EXPECT_DOUBLE_EQ(r.Diagonal(), 5);
-    EXPECT_EQ(r.Center(), GmPoint(2, 1.5));
-    r.Left(10);
-    r.Bottom(9);
-    EXPECT_EQ(r.Width(), 6);
-    EXPECT_EQ(r.Height(), 6);
-    EXPECT_EQ(r.PMin(), GmPoint(4, 3));
-    EXPECT_EQ(r.PMax(), GmPoint(10, 9));
-    GmRect const flat(0, 0, 1, 3);
-    EXPECT_EQ(flat.MinDim(), 1);
-    EXPECT_EQ(flat.MaxDim(), 3);
-    EXPECT_FALSE(flat < GmRect(0, 0, 2, 2));
-    EXPECT_FALSE(GmRect(0, 0, 2, 2) < flat);
-    EXPECT_TRUE(flat < GmRect(5, 5, 7, 9));
-}
-
 TEST(GmRect, IntersectsUnitesAndIncludes) {
     GmRect const a(0, 0, 1, 1);
     EXPECT_EQ(GmRect(0, 0, 2, 2).And(GmRect(1, 1, 3, 3)), GmRect(1, 1, 2, 2));
@@ -145,18 +127,4 @@ TEST(GmRect, ScalesAboutReferencePoints) {
     own.Shrink(GmPoint(0, 2), 2);
     own.Move(GmVec(1, 2, 0));
     EXPECT_EQ(own, GmRect(1, 2, 3, 4));
-}
-
-TEST(GmRect, HasTrivialCurveOperations) {
-    GmRect const r(0, 0, 1, 1);
-    GmPoint const p(5, 5);
-    EXPECT_EQ(r.Dist(p), 0);
-    EXPECT_FALSE(r.NP(p).CreationOK());
-    EXPECT_FALSE(r.MinDist(p, false).CreationOK());
-    EXPECT_FALSE(r.Tangent(p).CreationOK());
-    EXPECT_EQ(r.GetTraceString(), "");
-    EXPECT_EQ(r.BoundingRect(), r);
-    GmRect copy;
-    copy = r;
-    EXPECT_TRUE(copy.CreationOK() && copy == r);
 }

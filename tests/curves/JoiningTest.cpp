@@ -138,7 +138,8 @@ TEST(Joining, ConnectingArcsAreTangential) {
             for (Curve const& to : after) {
                 std::unique_ptr<GmCurve> const found(from->Concat(*to, 1));
                 auto const* back = dynamic_cast<GmArc const*>(found.get());
-                RC_ASSERT(back != nullptr && back->CreationOK());
+                RC_ASSERT(back != nullptr);
+                RC_ASSERT(back->CreationOK());
                 RC_ASSERT(back->SP() == link.SP() && back->EP() == link.EP());
                 RC_ASSERT(back->M().Dist(link.M()) < 1e-6 && back->Dir() == link.Dir());
             }

@@ -171,11 +171,3 @@ TEST(ChainBuilder, LayersAndNearlyClosedPieces) {
     // A short line does not close upon itself, however wide the tolerance.
     EXPECT_FALSE(buildChains({loose({{0, 0}, {0.5, 0}})}, 1.0).contours[0].closed);
 }
-
-TEST(ChainBuilder, AnAbsurdToleranceIsRefused) {
-    std::vector<Path> lines;
-    for (int i = 0; i < 5000; ++i)
-        lines.push_back(loose({{0.1 * i, 0}, {0.1 * i, 1}}));
-    EXPECT_THROW(buildChains(lines, 1e6), InputError);
-    EXPECT_EQ(buildChains(lines, 1e-300).contours.size(), lines.size());
-}

@@ -108,23 +108,6 @@ TEST(Measure, WindingAtTheHeightOfVerticesAndTangents) {
     EXPECT_EQ(windingNumber(rectangle({0, 0}, {2, 2}), {1, -1e-9}), 0);
 }
 
-TEST(Measure, SenseOfDegeneratePaths) {
-    EXPECT_EQ(sense(rectangle({0, 0}, {1, 1})), Sense::kCounterClockwise);
-    EXPECT_EQ(sense(reversed(circle({0, 0}, 1))), Sense::kClockwise);
-    EXPECT_EQ(sense(polygon({{0, 0}, {1e5, 3e4}})), Sense::kNone);              // there and back
-    EXPECT_EQ(sense(polygon({{0, 0}, {1, 1}, {1, 0}, {0, 1}})), Sense::kNone);  // equal lobes
-    EXPECT_EQ(sense(polygon({{0, 0}, {1, 0}, {1, 1}}, false)), Sense::kNone);
-}
-
-TEST(Element, MovedEndsKeepTheHalvingPoint) {
-    const Element halfCircle{{10, 0}, {-10, 0}, 1.0};
-    const Element moved = withEnds(halfCircle, {10.001, 0}, {-10, 0.001});
-    EXPECT_NEAR(distance(moved, halvingPoint(halfCircle)), 0, 1e-12);
-    EXPECT_NEAR(radius(moved), 10, 1e-3);
-    EXPECT_EQ(arcThrough({0, 0}, {1, 1e-6}, {2, 0}).bulge, 0.0);
-    EXPECT_NEAR(arcThrough({1, 0}, {0, -1}, {0, 1}).bulge, -std::tan(3 * kPi / 8), 1e-12);
-}
-
 RC_GTEST_PROP(MeasureLaws, ReversingNegatesAreaAndWinding, ()) {
     const Path path = *anyClosedPath();
     RC_PRE(!path.elements.empty());

@@ -43,9 +43,3 @@ TEST(Nesting, TouchingCrossingAndEqualPaths) {
     EXPECT_EQ(equal[0], 0);
     EXPECT_EQ(equal[1], 0);
 }
-
-TEST(Nesting, SenseOfTheOuterPathDoesNotMatter) {
-    const auto depths =
-        nestingDepths({reversed(rectangle({0, 0}, {10, 10})), reversed(circle({5, 5}, 1))});
-    EXPECT_EQ(depths[1], 1);
-}

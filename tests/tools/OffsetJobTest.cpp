@@ -71,24 +71,6 @@ TEST(OffsetJob, PlateWithHoles) {
     EXPECT_TRUE(offsets[0].paths[0].path.closed);
 }
 
-TEST(OffsetJob, PassesAndProgress) {
-    std::size_t calls = 0;
-    std::size_t last = 0;
-    const auto offsets = offsetContours({rectangle({0, 0}, {10, 10})}, {Side::kInside, {1, 3, 6}},
-                                        [&](std::size_t done, std::size_t total) {
-                                            ++calls;
-                                            last = done;
-                                            EXPECT_EQ(total, 3U);
-                                        });
-    EXPECT_EQ(calls, 3U);
-    EXPECT_EQ(last, 3U);
-    ASSERT_EQ(offsets[0].paths.size(), 2U);
-    EXPECT_NEAR(signedArea(offsets[0].paths[0].path), 64, 1e-6);
-    EXPECT_NEAR(signedArea(offsets[0].paths[1].path), 16, 1e-6);
-    EXPECT_EQ(offsets[0].paths[1].pass, 1U);
-    EXPECT_EQ(offsets[0].emptyPasses, std::vector<std::size_t>({2}));
-}
-
 TEST(KernelBridge, OffsetsKeepTheirDistance) {
     Path slot{{{{0, 0}, {20, 0}},
                {{20, 0}, {20, 8}, 1.0},
@@ -118,22 +100,4 @@ TEST(KernelBridge, TinyElementsDoNotTearTheResult) {
     ASSERT_EQ(offset.results.size(), 1U);
     EXPECT_TRUE(offset.results[0].closed);
     EXPECT_LT(deviation(offset.results[0], hooked, 1.0), 1e-3);
-}
-
-TEST(KernelBridge, StrangeContoursDoNoHarm) {
-    const std::vector<Path> strange = {
-        polygon({{0, 0}, {10, 0}}),                                   // there and back
-        polygon({{0, 0}, {10, 10}, {10, 0}, {0, 10}}),                // crosses itself
-        polygon({{0, 0}, {4, 0}, {4, 4}, {2, 0}, {0, 4}}),            // touches itself
-        polygon({{0, 0}, {10, 0}, {5, 0}, {10, 0}, {10, 5}}, false),  // folds back
-        circle({0, 0}, 2e-4),
-        circle({1e8, 1e8}, 1e8),
-        {{{{0, 0}, {1000, 0}, 1e-6}, {{1000, 0}, {0, 0}, 1e-6}}, true, "0"}};
-    for (const Path& path : strange) {
-        for (const double d : {0.0, 1e-5, 1.0, -1.0, 1e3, -1e9}) {
-            for (const Path& result : offsetByKernel(path, d).results) {
-                EXPECT_TRUE(std::isfinite(length(result)));
-            }
-        }
-    }
 }

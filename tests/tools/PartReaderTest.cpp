@@ -207,14 +207,6 @@ TEST(PartReader, DamagedTextsNameTheirCause) {
     EXPECT_GT(cuts, 50U);
 }
 
-TEST(PartReader, LineEndsByteOrderMarkAndScale) {
-    std::string text;
-    for (const char c : "\xEF\xBB\xBF" + drawing(circle({1, 1}, 0.5))) {
-        text += c == '\n' ? std::string("\r\n") : std::string(1, c);
-    }
-    expectBox(partFromText(text, {1e-3, 25.4}).contours[0], {12.7, 12.7}, {38.1, 38.1});
-}
-
 TEST(PartReader, TheLocaleDoesNotMatter) {
     struct CommaPoint : std::numpunct<char> {
         char do_decimal_point() const override { return ','; }
@@ -226,14 +218,4 @@ TEST(PartReader, TheLocaleDoesNotMatter) {
     const Part part = partFromText(text, {});
     std::locale::global(before);
     expectBox(part.contours[0], {1.375, 0.125}, {1.625, 0.375});
-}
-
-TEST(PartReader, LooseElementsOfAFileBecomeContours) {
-    const Part part = readPart(std::string(GMPATH_TEST_DATA) + "/bracket.dxf", {});
-    ASSERT_EQ(part.contours.size(), 4U);
-    EXPECT_TRUE(part.contours[0].closed);
-    // A plate of 80 by 50 with two corners rounded by 10 and one cut by 10.
-    EXPECT_NEAR(signedArea(part.contours[0]), 4000 - 2 * (100 - 25 * kPi) - 50, 1e-2);
-    EXPECT_EQ(part.skipped.duplicates, 1U);
-    EXPECT_EQ(part.skipped.unusableCount(), 1U);
 }

@@ -23,12 +23,3 @@ TEST(Text, NumbersAreWrittenShortAndReadBack) {
     EXPECT_EQ(parseReal(formatReal(1.0 / 3.0, 17)), 1.0 / 3.0);
     EXPECT_EQ(formatFixed(std::numeric_limits<double>::max(), 4).size(), 309U + 5U);
 }
-
-TEST(Text, NamesFromDrawingsAreMadePrintable) {
-    EXPECT_EQ(printable("Fr\xC3\xA4se"), "Fr\xC3\xA4se");
-    EXPECT_EQ(printable("Fr\xE4se\x1B[2J"), "Fr?se?[2J");
-    EXPECT_EQ(printable("\xED\xA0\x80\xC0\x80\xEF\xBF\xBE\xF4\x90\x80\x80\xE2\x82"),
-              "??????????????");
-    EXPECT_EQ(characterCount("\xC3\xA4\xE2\x82\xAC."), 3U);
-    EXPECT_EQ(xmlEscaped("<a&\"b\">"), "&lt;a&amp;&quot;b&quot;&gt;");
-}

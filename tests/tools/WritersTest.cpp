@@ -75,11 +75,6 @@ TEST(DxfWriter, GeometryIsReadBack) {
     }
 }
 
-TEST(DxfWriter, AFullDiskIsNoticed) {
-    if (!std::filesystem::exists("/dev/full")) GTEST_SKIP();
-    EXPECT_FALSE(writeDxf(Sample().drawing(), "/dev/full"));
-}
-
 TEST(SvgWriter, PathDataEndsWhereTheElementsEnd) {
     for (const Path& path : someContours()) {
         const std::string data = svgPathData(path);
@@ -125,23 +120,6 @@ TEST(SvgWriter, PictureIsWellFormedAndFits) {
         }
     }
     EXPECT_NE(svg.find("id=\"contour-3\""), std::string::npos);
-}
-
-TEST(AtomicFile, NothingIsLeftUnlessCommitted) {
-    const Scratch scratch;
-    {
-        AtomicFile file(scratch.file("a.svg"));
-        file.write("half");
-        EXPECT_EQ(scratch.files(), 1U);
-    }
-    EXPECT_EQ(scratch.files(), 0U);
-    scratch.store("a.svg", "old");
-    AtomicFile file(scratch.file("a.svg"));
-    file.write("new");
-    EXPECT_EQ(scratch.content("a.svg"), "old");
-    file.commit();
-    EXPECT_EQ(scratch.content("a.svg"), "new");
-    EXPECT_EQ(scratch.files(), 1U);
 }
 
 TEST(OutputFiles, AllOrNoneAreWritten) {

@@ -65,15 +65,3 @@ TEST(GmAngle, DecidesTheSenseOfRotation) {
     EXPECT_EQ(degrees(10).Rotation(degrees(10)), GmBase::eRotNone);
     EXPECT_EQ(degrees(10).Rotation(GmAngle()), GmBase::eRotNone) << "undefined: zero direction";
 }
-
-TEST(GmAngle, CountsQuadrantsFromTheirLowerLimit) {
-    struct {
-        double degrees;
-        int quadrant;
-    } const rows[] = {{0, 0},     {89.9, 0},   {90, 1},  {179.9, 1},  {180, 2},         {-90, 3},
-                      {-90.1, 2}, {-179.9, 2}, {-45, 3}, {-1e-12, 3}, {std::nan(""), 3}};
-    for (auto const& row : rows) {
-        EXPECT_EQ(degrees(row.degrees).QuadrantInt(), row.quadrant) << row.degrees;
-        EXPECT_EQ(degrees(row.degrees).Quadrant(), row.quadrant + 1) << row.degrees;
-    }
-}

@@ -50,27 +50,6 @@ TEST(GmBase, TagTestsAnswerForExactlyOneClass) {
     EXPECT_TRUE(object.IsCurve());
 }
 
-TEST(GmBase, DefaultObjectsAreUndefinedAndCloneToTheirOwnClass) {
-    GmVec const vec;
-    GmDir const dir;
-    GmAngle const angle;
-    GmPoint const point;
-    GmRect const rect;
-    GmBase const* const objects[] = {&vec, &dir, &angle, &point, &rect};
-    for (GmBase const* a : objects) {
-        EXPECT_FALSE(a->CreationOK());
-        EXPECT_FALSE(a->BoundingRect().CreationOK());
-        std::unique_ptr<GmBase> const copy(a->Clone());
-        GmBase const& cloned = *copy;
-        EXPECT_EQ(typeid(cloned), typeid(*a));
-        EXPECT_EQ(copy->GetType(), a->GetType());
-        for (GmBase const* b : objects) {
-            EXPECT_EQ(*a == *b, a == b);
-            EXPECT_EQ(*a != *b, a != b);
-        }
-    }
-}
-
 TEST(GmBase, AssignmentKeepsOrCopiesTheTagAsTheClassDemands) {
     GmVec vec;
     vec = GmPoint(1, 2, 3);

@@ -57,21 +57,6 @@ TEST(GmDir, ComparesAHundredTimesFinerThanPoints) {
     EXPECT_FALSE(GmParallelDir(x, GmDir(0, 1)));
 }
 
-TEST(GmDir, SettersBringTheLengthBack) {
-    double const half = std::sqrt(0.5);
-    GmDir d(1, 0, 0);
-    d.Y(1);
-    EXPECT_EQ(d, GmVec(half, half, 0));
-    d.Z(1);
-    d.X(0);
-    EXPECT_NEAR(lengthOf(d), 1, 1e-15);
-    EXPECT_EQ(GmDir(1, 0).Sym(GmDir(0, 1)), GmVec(half, half, 0));
-    GmDir copy;
-    copy = GmDir(0, 0, 3);
-    EXPECT_TRUE(copy.CreationOK());
-    EXPECT_EQ(GmDir(copy).Z(), 1);
-}
-
 TEST(GmDir, FollowsTheLawsOfDirections) {
     EXPECT_EQ(GmDir(1, 0, 0) % GmDir(0, 1, 0), GmDir(0, 0, 1));
     EXPECT_TRUE(rc::check("turns and products have length 1", [] {

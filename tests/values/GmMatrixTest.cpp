@@ -24,18 +24,6 @@ double largestDifference(GmMatrix const& a, GmMatrix const& b) {
 
 }  // namespace
 
-TEST(GmMatrix, StoresColumnByColumn) {
-    GmMatrix const m = GmMatrix::matrixTranslate(1, 2, 3);
-    for (int i = 0; i < 3; ++i) {
-        EXPECT_EQ(m[12 + i], i + 1);
-        EXPECT_EQ(m(i, 3), i + 1);
-        EXPECT_EQ(m.transpose()[3 + 4 * i], i + 1);
-    }
-    GmMatrix const copy(static_cast<double const*>(m));
-    EXPECT_EQ(copy, m);
-    EXPECT_EQ(m * GmVec(0, 0, 0), GmVec(1, 2, 3));
-}
-
 TEST(GmMatrix, ComparesBitwise) {
     GmMatrix m;
     EXPECT_TRUE(m.isIdentity());
@@ -80,19 +68,6 @@ TEST(GmMatrix, RotatesAboutAnAxis) {
         RC_ASSERT(m * axis == axis);
         RC_ASSERT(std::fabs((m * v).Length() - v.Length()) < 1e-9);
     }));
-}
-
-TEST(GmMatrix, OrientsTheAxes) {
-    GmVec const a(1, 2, 3);
-    GmVec const b(4, 5, 6);
-    GmVec const c(7, 8, 10);
-    GmMatrix const m = GmMatrix().Orient(a, b, c);
-    EXPECT_EQ(m * GmVec(1, 0, 0), a);
-    EXPECT_EQ(m * GmVec(0, 1, 0), b);
-    EXPECT_EQ(m * GmVec(0, 0, 1), c);
-
-    GmMatrix const turned = GmMatrix::matrixOrient(GmVec(0, 0, 1), GmVec(1, 0, 0));
-    EXPECT_EQ(turned * GmVec(1, 2, 3), GmVec(-1, -2, 3));
 }
 
 TEST(GmMatrix, InvertsAffineAndGeneralMatrices) {

@@ -58,20 +58,3 @@ TEST(GmPoint, MeasuresSweptAngles) {
         RC_ASSERT(std::fabs(a.AngDist(b, o) - std::fmin(ccw, cw)) < 1e-9);
     }));
 }
-
-TEST(GmPoint, MovesAndKeepsItsClass) {
-    GmPoint p(1, 2, 3);
-    p.Translation(GmVec(1, 1, 1));
-    EXPECT_EQ(p, GmPoint(2, 3, 4));
-    p.Transform(GmMatrix().Translate(-2, -3, -4));
-    EXPECT_EQ(p, GmPoint(0, 0, 0));
-    EXPECT_EQ(p.GetTraceString(), "point (0.00000, 0.00000, 0.00000)");
-
-    GmPoint undefined;
-    undefined.Translation(GmVec(1, 1, 1));
-    EXPECT_FALSE(undefined.CreationOK());
-    undefined.Rotate(GmAngle(90, false));
-    EXPECT_TRUE(undefined.CreationOK());
-    EXPECT_EQ(undefined, GmPoint(-1, 1, 1));
-    EXPECT_EQ(undefined.BoundingRect(), GmRect(-1, 1, -1, 1));
-}

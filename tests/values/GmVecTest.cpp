@@ -40,41 +40,6 @@ TEST(GmVec, OrdersByLengthWithinTheTolerance) {
     EXPECT_TRUE(GmVec(0, 0, 5.0002) > v);
 }
 
-TEST(GmVec, ReachesCoordinatesByNameAndByIndex) {
-    GmVec v(1, 2, 3);
-    v.X() += 10;
-    v.Y(20);
-    SetCoordByIndex(v, 2, 30);
-    SetCoordByIndex(v, 3, 99);
-    SetCoordByIndex(v, -1, 99);
-    double const expected[] = {0, 11, 20, 30, 0};
-    for (int i = -1; i < 4; ++i) {
-        EXPECT_EQ(v[i], expected[i + 1]);
-    }
-    EXPECT_EQ(v.k(), 20.0 / 11.0);
-    EXPECT_EQ(GmVec(0, 5, 0).k(), 0);
-    EXPECT_EQ(v.GetTraceString(), "vec (11.00000, 20.00000, 30.00000)");
-}
-
-TEST(GmVec, KeepsTheFlagsOfItsSources) {
-    GmPoint const defined(1, 2, 3);
-    GmVec const undefined(GmPoint(), defined);
-    EXPECT_FALSE(undefined.CreationOK());
-    EXPECT_EQ(undefined, GmVec(0, 0, 0));
-    EXPECT_FALSE(GmVec(defined, GmPoint()).CreationOK());
-    EXPECT_EQ(GmVec(defined, GmPoint(5, 5, 5)), GmVec(4, 3, 2));
-
-    EXPECT_FALSE(GmVec(GmDir()).CreationOK());
-    EXPECT_FALSE((GmVec() + defined).CreationOK()) << "the left operand decides";
-    EXPECT_TRUE((defined + GmVec()).CreationOK());
-    EXPECT_TRUE((defined + GmVec()).IsVec());
-    EXPECT_TRUE((GmVec() % GmVec()).CreationOK());
-    EXPECT_TRUE(GmVec().Standardized().CreationOK());
-    GmVec transformed;
-    transformed.Transform(GmMatrix());
-    EXPECT_TRUE(transformed.CreationOK());
-}
-
 TEST(GmVec, SnapsPolarAnglesToTheAxes) {
     struct {
         double x, y, degrees;
@@ -119,21 +84,6 @@ TEST(GmVec, CountsQuadrantsWithThreeTreatmentsOfTheAxes) {
         EXPECT_EQ(v.Quadrant13(), row.to13) << v.GetTraceString();
         EXPECT_EQ(v.Quadrant24(), row.to24) << v.GetTraceString();
     }
-}
-
-TEST(GmVec, TurnsIntoNormals) {
-    GmVec const v(1, 0, 5);
-    EXPECT_EQ(v.Normalized(GmBase::eRotCCW), GmVec(0, 1, 5));
-    EXPECT_EQ(v.Normalized(GmBase::eRotCW), GmVec(0, -1, 5));
-    EXPECT_EQ(v.Normalized(GmBase::eRotNone), GmVec(0, -1, 5));
-    EXPECT_EQ(GmVec(0, 0, 0).Standardized(), GmVec(0, 0, 0));
-    EXPECT_TRUE(rc::check("a normal keeps the length and four quarter turns close", [] {
-        GmVec const v = anyVec();
-        GmVec n = v.Normalized(GmBase::eRotCCW);
-        RC_ASSERT(n.Norm() == v.Norm());
-        RC_ASSERT(n.Normalized(GmBase::eRotCW) == v);
-        RC_ASSERT(n.Normalized(GmBase::eRotCCW) == GmVec(-v[0], -v[1], v[2]));
-    }));
 }
 
 TEST(GmVec, FollowsTheLawsOfVectorAlgebra) {

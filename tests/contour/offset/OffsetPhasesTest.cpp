@@ -104,46 +104,6 @@ TEST(BandPieces, CapsOfATightArcMeetWhereTheirCirclesCross) {
     }
 }
 
-TEST(Insertion, CutsBothPiecesAtTheirCrossings) {
-    PieceList active = ListOf({Segment(0, 0, 10, 0, 1), Segment(0, 1, 10, 1, 2)});
-    active.front().keepsDistance = true;
-    active.back().keepsDistance = true;
-    insertPiece(active, Segment(4, -1, 4, 0.5, 3));
-    EXPECT_EQ(Starts(active), (std::vector<double>{0, 4, 0, 4, 4}));
-    auto piece = active.begin();
-    EXPECT_FALSE(piece->keepsDistance) << "the halves are judged anew";
-    EXPECT_EQ(piece->halving, GmPoint(2, 0));
-    EXPECT_FALSE((++piece)->keepsDistance);
-    EXPECT_EQ(piece->halving, GmPoint(7, 0));
-    EXPECT_EQ(piece->element.id(), 1);
-    EXPECT_TRUE((++piece)->keepsDistance) << "not cut";
-}
-
-TEST(Insertion, DoesNotCutAtEnds) {
-    PieceList active = ListOf({Segment(0, 0, 10, 0)});
-    insertPiece(active, Segment(10.00005, 0, 15, 5));
-    insertPiece(active, Segment(5, 5, 5, 0));
-    EXPECT_EQ(active.size(), 4u) << "the second one ends on the first, which alone is cut";
-}
-
-TEST(Insertion, CutsAPieceAtSeveralPointsInOrder) {
-    PieceList active;
-    for (const double x : {6.0, 2.0, 8.0, 4.0})
-        insertPiece(active, Segment(x, -1, x, 1));
-    insertPiece(active, Segment(0, 0, 10, 0, 2));
-    EXPECT_EQ(Starts(active), (std::vector<double>{6, 6, 2, 2, 8, 8, 4, 4, 0, 2, 4, 6, 8}));
-
-    // A clockwise arc from the left to the right crosses two of the verticals.
-    auto arc = std::make_unique<GmArc>(GmPoint(1, 0), GmPoint(7, 0), GmPoint(4, 0), GmBase::eRotCW);
-    PieceList verticals = ListOf({Segment(6, 0.5, 6, 9), Segment(2, 0.5, 2, 9)});
-    insertPiece(verticals, {std::move(arc), 0, 1, true, false});
-    EXPECT_EQ(verticals.size(), 7u);
-    const auto starts = Starts(verticals);
-    EXPECT_NEAR(starts[4], 1, 1e-9);
-    EXPECT_NEAR(starts[5], 2, 1e-9);
-    EXPECT_NEAR(starts[6], 6, 1e-9);
-}
-
 TEST(Insertion, BoxesCoverEveryPointThatAMembershipTestAccepts) {
     int accepted = 0;
     std::mt19937 engine(7);
@@ -172,52 +132,6 @@ TEST(Insertion, BoxesCoverEveryPointThatAMembershipTestAccepts) {
     EXPECT_GT(accepted, 50000);
 }
 
-TEST(Removal, DropsWhatComesNearerThanTheDistance) {
-    GmContour span;
-    span.AddElement(GmStretch(GmPoint(0, 0), GmPoint(10, 0)), false, 0);
-    span.AddElement(GmStretch(GmPoint(10, 0), GmPoint(10, 10)), false, 0);
-    const std::vector<GmOffsetElement> pieces{
-        Segment(1, -1, 2, -1), Segment(2, -0.9, 3, -0.9), Segment(3, -0.99999995, 4, -0.99999995),
-        Segment(9.05, 2, 9.05, 3), Segment(4, -0.9999998, 5, -0.9999998)};
-    PieceList active = ListOf(pieces);
-    removeNearPieces(active, span, true, -1);
-    EXPECT_EQ(Starts(active), (std::vector<double>{1, 3}));
-
-    PieceList passed = ListOf(pieces);
-    for (Piece& piece : passed)
-        piece.keepsDistance = true;
-    PieceList untested = passed;
-    removeNearPieces(untested, span, false, 1);
-    EXPECT_EQ(untested.size(), 5u) << "a span that has not grown is not asked again";
-    removeNearPieces(passed, span, true, 1);
-    EXPECT_EQ(passed.size(), 4u) << "only the last element of the span is asked";
-
-    PieceList all = ListOf(pieces);
-    removeNearPieces(all, GmContour(), false, 1);
-    EXPECT_EQ(all.size(), 5u);
-}
-
-TEST(Chaining, BeginsWithTheSmallestIdentifierAndGoesBackAlongItInOneWalk) {
-    PieceList pieces =
-        ListOf({Segment(2, 0, 3, 0, 5), Segment(4, 0, 5, 0, 3), Segment(3, 0, 4, 0, 3),
-                Segment(2, 0, 3, 0, 3), Segment(1, 0, 2, 0, 4)});
-    EXPECT_EQ(Starts(takeChain(pieces)), (std::vector<double>{2, 3, 4}));
-    EXPECT_EQ(Starts(pieces), (std::vector<double>{2, 1}))
-        << "other identifiers do not go in front";
-
-    // The piece before the one found stands earlier in the list and is passed by.
-    pieces = ListOf({Segment(4, 0, 5, 0, 3), Segment(2, 0, 3, 0, 3), Segment(3, 0, 4, 0, 3)});
-    EXPECT_EQ(Starts(takeChain(pieces)), (std::vector<double>{3, 4}));
-    EXPECT_EQ(Starts(pieces), (std::vector<double>{2}));
-}
-
-TEST(Chaining, GoesOnOverGapsBelowThreeTolerances) {
-    PieceList pieces = ListOf(
-        {Segment(0, 0, 1, 0, 1), Segment(1.00029, 0, 2, 0, 9), Segment(2.00031, 0, 3, 0, 9)});
-    EXPECT_EQ(takeChain(pieces).size(), 2u);
-    EXPECT_EQ(pieces.size(), 1u);
-}
-
 TEST(Chaining, PrefersCandidatesThatLeadOn) {
     PieceList pieces =
         ListOf({Segment(0, 0, 1, 0, 1), Segment(1, 0, 1, 5, 2), Segment(1, 0, 2, 0, 3),
@@ -229,16 +143,6 @@ TEST(Chaining, PrefersCandidatesThatLeadOn) {
     pieces = ListOf({Segment(0, 0, 1, 0, 1), Segment(1, 0, 1, 5, 2), Segment(1, 0, 2, 0, 3)});
     chain = takeChain(pieces);
     EXPECT_EQ(chain.back().element.id(), 2) << "the first where none leads on";
-}
-
-TEST(Chaining, LeavesShortPiecesOutAtLast) {
-    PieceList pieces = ListOf({Segment(0, 0, 1, 0, 1), Segment(1, 0, 1.0009, 0, 2),
-                               Segment(1.0009, 0, 2, 0, 3), Segment(2, 0, 2.0011, 0, 4)});
-    EXPECT_EQ(Starts(takeChain(pieces)), (std::vector<double>{0, 1.0009, 2}));
-    pieces = ListOf({Segment(0, 0, 0.0009, 0, 1, true)});
-    const PieceList nothing = takeChain(pieces);
-    EXPECT_TRUE(nothing.empty());
-    EXPECT_FALSE(hasOffset(nothing));
 }
 
 TEST(ResultContour, BridgesGapsAndTellsWhatIsMade) {
@@ -255,17 +159,4 @@ TEST(ResultContour, BridgesGapsAndTellsWhatIsMade) {
     EXPECT_TRUE(contour->IsClosed());
     EXPECT_TRUE(hasOffset(ListOf({Segment(0, 0, 1, 0, 1, true), Segment(1, 0, 2, 0)})));
     EXPECT_FALSE(hasOffset(ListOf({Segment(0, 0, 1, 0, 1, true)})));
-}
-
-TEST(OffsetElement, CopiesOwnTheirCurves) {
-    GmOffsetElement first = Segment(0, 0, 1, 0, 1);
-    GmOffsetElement second(first);
-    second.curve().SetEP(GmPoint(5, 5));
-    EXPECT_EQ(first.curve().EP(), GmPoint(1, 0));
-    first = second;
-    GmOffsetElement const& itself = first;
-    first = itself;
-    EXPECT_EQ(first.curve().EP(), GmPoint(5, 5));
-    EXPECT_NE(&first.curve(), &second.curve());
-    first.Trace();
 }

@@ -128,23 +128,6 @@ TEST(Offsetting, ANeckSplitsTheResultAndAWidthBeyondHalfLeavesNone) {
     EXPECT_EQ(neck.GetSubContour(0), nullptr) << "earlier results are gone";
 }
 
-TEST(Offsetting, AnArcSharperThanTheDistanceLeavesNoOffset) {
-    GmContour shape;
-    shape.AddElement(GmStretch(GmPoint(-9, 2), GmPoint(0, 2)), false, 1);
-    shape.AddElement(GmArc(GmPoint(0, 2), GmPoint(0, -2), GmPoint(0, 0), GmBase::eRotCW), false, 2);
-    shape.AddElement(GmStretch(GmPoint(0, -2), GmPoint(-9, -2)), false, 3);
-    GmContour arc;
-    arc.AddElement(GmArc(GmPoint(2, 0), GmPoint(0, 2), GmPoint(0, 0), GmBase::eRotCCW), false, 1);
-    EXPECT_EQ(arc.Offsetting(-3, kWholeContour, false), 0) << "caps alone are not stored";
-    ASSERT_EQ(arc.Offsetting(3, kWholeContour, false), 1);
-    EXPECT_EQ(arc.GetSubContour(0)->GetElement(0)->IsArc(), true);
-    shape.Offsetting(3, kWholeContour, false);
-    for (GmContour const* result : Results(shape)) {
-        for (long id : Identifiers(*result))
-            EXPECT_NE(id, 2);
-    }
-}
-
 TEST(Offsetting, TinyDistancesCopyAndOthersThatAreNoNumbersGiveNothing) {
     GmContour wave = Wave();
     for (const double d : {0.0, 0.00009, -0.00009}) {
@@ -164,16 +147,6 @@ TEST(Offsetting, TinyDistancesCopyAndOthersThatAreNoNumbersGiveNothing) {
     GmContour empty;
     EXPECT_EQ(empty.Offsetting(1, kWholeContour, false), 0);
     EXPECT_EQ(empty.Offsetting(0, kWholeContour, false), 1);
-}
-
-TEST(Offsetting, ParallelContoursIgnoresItsFlags) {
-    for (const double d : {1.3, -1.3}) {
-        GmContour star = shapes::RandomStar(4, true);
-        GmContour other = shapes::RandomStar(4, true);
-        star.Offsetting(d, kWholeContour, false);
-        EXPECT_EQ(other.ParallelContours(d, d > 0, true, false), 1);
-        ExpectSameChains(star, other);
-    }
 }
 
 TEST(Offsetting, AShortSpanGivesTheSameForALocallySimpleContour) {
@@ -209,16 +182,6 @@ TEST(Offsetting, WithoutASpanNothingIsCutAway) {
     }
     ASSERT_EQ(square.Offsetting(-1, 0, false), 1) << "closed results know no span";
     EXPECT_NEAR(Area(*square.GetSubContour(0)), 64, 1e-9);
-}
-
-TEST(Offsetting, OpenResultsToTheInsideAreKeptOnDemand) {
-    // Two sides of the square know nothing of the other two, so that the loops stay open.
-    GmContour square = Numbered(shapes::Square(10));
-    ASSERT_EQ(square.Offsetting(-1, 1, true), 4);
-    for (GmContour const* result : Results(square))
-        EXPECT_FALSE(result->IsClosed());
-    ASSERT_EQ(square.Offsetting(-1, 1, false), 1);
-    EXPECT_TRUE(square.GetSubContour(0)->IsClosed());
 }
 
 TEST(Offsetting, OpenChainsKeepTheCapAtTheirEnd) {
