@@ -1,7 +1,7 @@
 #include <cmath>
 
 #include "contour/ContourElements.h"
-#include "curves/kernels/Constants.h"
+#include "values/Constants.h"
 #include "gmkernel/GmArc.h"
 #include "gmkernel/GmContour.h"
 

@@ -7,10 +7,10 @@
 
 #include "curves/Joining.h"
 #include "curves/kernels/AngleOrder.h"
-#include "curves/kernels/Constants.h"
 #include "gmkernel/GmBeam.h"
 #include "gmkernel/GmMatrix.h"
 #include "gmkernel/GmStretch.h"
+#include "values/Constants.h"
 
 namespace {
 

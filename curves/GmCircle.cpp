@@ -5,10 +5,9 @@
 #include <algorithm>
 #include <cmath>
 
-#include "curves/kernels/CircleCircle.h"
-#include "curves/kernels/CircleLine.h"
-#include "curves/kernels/Constants.h"
+#include "curves/CarrierHits.h"
 #include "gmkernel/GmRect.h"
+#include "values/Constants.h"
 
 GmCircle::GmCircle() {
     m_eType = eGmCircle;
@@ -144,14 +143,13 @@ double GmCircle::Dist(GmCircle const& circle) const {
 }
 
 int GmCircle::IntersectionWithLine(GmLine const& line) const {
-    const auto hits = gmkernel_detail::intersectCircleLine(
-        m_M, m_dR, line.SP(), line.Dir(), [&](GmPoint const& p) { return line.Dist(p); });
+    const auto hits = gmkernel_detail::carrierHits(*this, line);
     m_ptSol.assign(hits.begin(), hits.end());
     return static_cast<int>(m_ptSol.size());
 }
 
 int GmCircle::IntersectionWithCircle(GmCircle const& circle) const {
-    const auto hits = gmkernel_detail::intersectCircleCircle(m_M, m_dR, circle.m_M, circle.m_dR);
+    const auto hits = gmkernel_detail::carrierHits(*this, circle);
     m_ptSol.assign(hits.begin(), hits.end());
     return static_cast<int>(m_ptSol.size());
 }

@@ -2,7 +2,7 @@
 
 #include <cmath>
 
-#include "curves/kernels/LineLine.h"
+#include "curves/CarrierHits.h"
 #include "curves/kernels/SlopeForm.h"
 #include "gmkernel/GmRect.h"
 
@@ -184,7 +184,7 @@ int GmLine::PointPos(GmPoint const& p) const {
 }
 
 int GmLine::IntersectionWithLine(GmLine const& line) const {
-    const auto hits = gmkernel_detail::intersectLineLine(m_SP, m_Dir, line.m_SP, line.m_Dir);
+    const auto hits = gmkernel_detail::carrierHits(*this, line);
     m_ptSol.assign(hits.begin(), hits.end());
     return static_cast<int>(m_ptSol.size());
 }

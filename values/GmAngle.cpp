@@ -4,6 +4,7 @@
 
 #include "gmkernel/GmDir.h"
 #include "gmkernel/GmRect.h"
+#include "values/Constants.h"
 
 GmAngle::GmAngle() : m_dAngle(0.0) {
     m_eType = eGmAngle;
@@ -100,11 +101,11 @@ GmBase::eQuadrant GmAngle::Quadrant() const {
 }
 
 double GmAngle::ToRadiant(double degrees) const {
-    return degrees * M_PI / 180.0;
+    return degrees * gmkernel_detail::kPi / 180.0;
 }
 
 double GmAngle::ToDegree(double radians) const {
-    return radians / M_PI * 180.0;
+    return radians / gmkernel_detail::kPi * 180.0;
 }
 
 void GmAngle::Standardize() {

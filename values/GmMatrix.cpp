@@ -5,6 +5,7 @@
 #include <cstring>
 
 #include "gmkernel/GmVec.h"
+#include "values/Constants.h"
 
 const double GmMatrix::_identity[16] = {1.0, 0.0, 0.0, 0.0, 0.0, 1.0, 0.0, 0.0,
                                         0.0, 0.0, 1.0, 0.0, 0.0, 0.0, 0.0, 1.0};
@@ -17,7 +18,7 @@ double at(double const* m, int r, int c) {
 }
 
 double toRadians(double degrees) {
-    return degrees * M_PI / 180.0;
+    return degrees * gmkernel_detail::kPi / 180.0;
 }
 
 /// The 2x2 minors of two rows, named by their columns.

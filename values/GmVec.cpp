@@ -9,6 +9,7 @@
 #include "gmkernel/GmMatrix.h"
 #include "gmkernel/GmPoint.h"
 #include "gmkernel/GmRect.h"
+#include "values/Constants.h"
 
 namespace {
 
@@ -120,7 +121,7 @@ GmAngle GmVec::Angle(GmVec const& w) const {
         return GmAngle(sine < 0.0 ? -angle : angle, true);
     }
     // Parallel or opposite; rounding may have taken the cosine beyond the domain of acos.
-    return GmAngle(cosine > 0.0 ? 0.0 : M_PI, true);
+    return GmAngle(cosine > 0.0 ? 0.0 : gmkernel_detail::kPi, true);
 }
 
 GmAngle GmVec::Angle() const {
@@ -138,11 +139,11 @@ double GmVec::DAngle(GmVec const& w) const {
 }
 
 double GmVec::DAngle() const {
-    return polarAngle(m_dX, m_dY, 180.0, 180.0, M_PI);
+    return polarAngle(m_dX, m_dY, 180.0, 180.0, gmkernel_detail::kPi);
 }
 
 double GmVec::RAngle(GmVec const& w, GmBase::eRotDir rot) const {
-    return DAngle(w, rot) * M_PI / 180.0;
+    return DAngle(w, rot) * gmkernel_detail::kPi / 180.0;
 }
 
 double GmVec::RAngle(GmVec const& w) const {
@@ -150,7 +151,7 @@ double GmVec::RAngle(GmVec const& w) const {
 }
 
 double GmVec::RAngle() const {
-    return polarAngle(m_dX, m_dY, M_PI, 1.0, 1.0);
+    return polarAngle(m_dX, m_dY, gmkernel_detail::kPi, 1.0, 1.0);
 }
 
 void GmVec::Rotate(GmAngle const& a) {

@@ -8,10 +8,8 @@
 #include <unordered_map>
 #include <vector>
 
+#include "curves/CarrierHits.h"
 #include "curves/dispatch/PairKey.h"
-#include "curves/kernels/CircleCircle.h"
-#include "curves/kernels/CircleLine.h"
-#include "curves/kernels/LineLine.h"
 #include "gmkernel/GmArc.h"
 #include "gmkernel/GmBeam.h"
 #include "gmkernel/GmContour.h"
@@ -41,24 +39,11 @@ bool holds(GmArc const& arc, GmPoint const& p) {
     return arc.Element(p);
 }
 
-Hits<1> kernel(GmLine const& a, GmLine const& b) {
-    return intersectLineLine(a.SP(), a.Dir(), b.SP(), b.Dir());
-}
-
-Hits<2> kernel(GmCircle const& a, GmLine const& b) {
-    return intersectCircleLine(a.M(), a.R(), b.SP(), b.Dir(),
-                               [&](GmPoint const& p) { return b.Dist(p); });
-}
-
-Hits<2> kernel(GmCircle const& a, GmCircle const& b) {
-    return intersectCircleCircle(a.M(), a.R(), b.M(), b.R());
-}
-
 template <class A, class B>
 void intersectPair(GmBase const& first, GmBase const& second, Points& result) {
     auto const& a = static_cast<A const&>(first);
     auto const& b = static_cast<B const&>(second);
-    for (GmPoint const& p : kernel(a, b)) {
+    for (GmPoint const& p : carrierHits(a, b)) {
         if (holds(a, p) && holds(b, p)) result.push_back(p);
     }
 }

@@ -14,8 +14,8 @@
 ///
 /// A circle with start point, end point, their direction angles seen from the centre and a sense of
 /// rotation; the arc runs from start to end in that sense. Coincident ends (within m_scdPrecCalc)
-/// make a full circle. `double` angles are in radians unless the name ends in Deg. In() and Out()
-/// answer false.
+/// make a full circle; membership takes ends that are equal within m_scdPrec for one. `double`
+/// angles are in radians unless the name ends in Deg. In() and Out() answer false.
 class GMKERNEL_EXPORT GmArc : public GmCircle, public boost::equality_comparable<GmArc> {
 public:
     /// An undefined arc.
@@ -114,7 +114,8 @@ public:
     /// Moves centre and ends.
     void Translation(GmVec const& v) override;
     /// Transforms ends and centre and rebuilds the arc from them; a mirroring transform reverses
-    /// the sense. Shapes other than circles cannot result: a non-uniform scale keeps the ends.
+    /// the sense. Shapes other than circles cannot result: a non-uniform scale keeps the ends. The
+    /// result is created also where this arc is undefined.
     void Transform(GmMatrix const& m) override;
     /// "circ2 (x, y) - (x, y) mp (x, y)" with five decimals: start, end, centre; "circ3" for every
     /// arc that is not clockwise.

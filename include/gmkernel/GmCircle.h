@@ -88,6 +88,7 @@ public:
     ///
     /// On the perpendicular through the centre for straight curves (the nearer of two); on the line
     /// of centres for circles and arcs, there of two points the one farther from the other centre.
+    /// Concentric curves take the other's start for its centre; where it has none, SP() answers.
     /// Undefined for other kinds and where the curve has no such point. Replaces the solution list.
     virtual GmPoint NP(GmCurve const* c) const;
 
@@ -103,8 +104,9 @@ public:
     double Dist(GmLine const& line) const;
     /// The gap between two circles, also when one lies inside the other; 0 where they meet.
     double Dist(GmCircle const& circle) const;
-    /// Intersects the full circle with the whole carrier of a line; the points replace the solution
-    /// list. A line up to m_scdPrec outside the circle touches it; one parallel to the y axis only
+    /// Intersects the full circle with the carrier of a straight curve; the points replace the
+    /// solution list. Only touching is judged by the curve itself: a stretch has to reach the
+    /// point. A line up to m_scdPrec outside the circle touches it; one parallel to the y axis only
     /// up to about 1e-9 / R outside.
     /// @return 0, 1 (touching) or 2
     int IntersectionWithLine(GmLine const& line) const;

@@ -52,9 +52,9 @@ public:
     ///
     /// The points replace this curve's solution list; read them with GetSolution(). Points are kept
     /// only where they lie on both bounded curves (within m_scdPrec on beams and stretches, within
-    /// 0.01 on arcs). A pair and its swapped pair give the same points in the same order, except
-    /// for two straight lines of one kind, whose z comes from the first one. Coincident curves have
-    /// no intersection.
+    /// 0.01 on arcs). A pair of two kinds and its swapped pair give the same points in the same
+    /// order. Two curves of one kind take z from the first one, and swapping two circles or arcs
+    /// reverses the order of their points. Coincident curves have no intersection.
     /// @return the number of points found
     /// @throw std::runtime_error "Function not found" for a pair of kinds that cannot be
     ///        intersected (a helix or a rectangle); the list is empty then
@@ -101,7 +101,7 @@ public:
     /// @param d receives the distance; see the other overload for the case without candidates.
     ///        Where this curve has a start point and `c` has none, the search starts from the
     ///        largest double, so that the start competes through its foot point on `c` alone.
-    /// @param c the other curve
+    /// @param c the other curve; null leaves `d` as it is
     /// @param bPreferSP leaves the end points of both curves out of the search
     virtual GmPoint MinDist(double& d, GmCurve const* c, bool bPreferSP) const;
     /// The point of this curve nearest to `p`; undefined where there is none.
@@ -150,9 +150,9 @@ protected:
     void CopyPtSol(GmCurve const& other) const;
     /// Copies creation flag and solution list and keeps the own type tag.
     void CopyCurvePart(GmCurve const& other);
-    /// Offers the candidate `p` with the reference point `q` to a nearest-point search: it becomes
-    /// the best point when `q` is defined and the squared distance of both is strictly below `d`,
-    /// or when there is no defined best point yet.
+    /// Offers the candidate `p` with the reference point `q` to a nearest-point search. Ignored
+    /// when `q` is undefined; else it becomes the best point when the squared distance of both is
+    /// strictly below `d`, or when there is no defined best point yet.
     void CheckDist(double& d, GmPoint& best, GmPoint const& p, GmPoint const& q) const;
 
     /// The solution list, mutable state of a constant curve.

@@ -11,8 +11,8 @@
 
 /// A straight segment from a start to an end point, one of the two kinds of contour elements.
 ///
-/// The direction points from start to end while the two differ; it keeps its last value when they
-/// meet.
+/// The direction points from start to end while the two differ; when SetSP() or SetEP() makes them
+/// meet, it keeps its last value.
 class GMKERNEL_EXPORT GmStretch : public GmLine, public boost::equality_comparable<GmStretch> {
 public:
     /// An undefined stretch.
@@ -48,10 +48,11 @@ public:
     /// @throw std::runtime_error for a `next` that cannot be intersected with a segment
     bool Trim(GmCurve* next) override;
     /// A new connection from this end to the start of `next`, owned by the caller. Mode 0: a
-    /// stretch. Mode 1: the arc that leaves this segment tangentially, about the crossing of the
-    /// normals at both ends, provided that their distances from it agree within m_scdPrec and 5 %;
-    /// else a stretch. Null for any other mode, and for mode 1 where `next` is neither a stretch
-    /// nor an arc.
+    /// stretch, undefined where `next` has no start. Mode 1: the arc that leaves this segment
+    /// tangentially, about the crossing of the normals at both ends, provided that their distances
+    /// from it agree within m_scdPrec and 5 %; the half circle about the midpoint where both
+    /// normals coincide; else a stretch. Null for any other mode, and for mode 1 where `next` is
+    /// neither a stretch nor an arc.
     GmCurve* Concat(GmCurve const& next, int mode) override;
     /// Extends or shortens this segment to the carrier of a stretch or the full circle of an arc
     /// and moves the start of `next` there (although it is passed as constant). Of two points on a

@@ -4,16 +4,13 @@
 #include <memory>
 
 #include "contour/GmContourArray.h"
-#include "gmkernel/GmArc.h"
 #include "gmkernel/GmContour.h"
-#include "gmkernel/GmLine.h"
 #include "gmkernel/GmStretch.h"
 #include "support/Contours.h"
 
 namespace {
 
 struct OpenContour : GmContour {
-    using GmContour::InitAll;
     using GmContour::operator=;
     void AddSub(GmContour const& sub) { m_pSubConts->Add(sub.Clone()); }
     void Mark(GmPoint const& lastInsert) {
@@ -23,9 +20,7 @@ struct OpenContour : GmContour {
 };
 
 GmContour SquareAt(double x, double side) {
-    GmContour square = shapes::Square(side);
-    square.Translation(GmVec(x, x, 0));
-    return square;
+    return shapes::Moved(shapes::Square(side), x, x);
 }
 
 }  // namespace
@@ -38,14 +33,12 @@ TEST(ContourModel, CopiesAreEqualIndependentAndWithoutIdentifiers) {
         source.GetContElement(1)->bInserted = true;
         source.AddSub(source);
         GmContour copy(source);
-        RC_ASSERT(copy == source);
-        RC_ASSERT(!(copy != source));
+        RC_ASSERT(copy == source && !(copy != source));
         RC_ASSERT(copy.IsClosed());
         RC_ASSERT(copy.GetSubContour(0) == nullptr);
         for (int i = 0; i < copy.ElementCount(); ++i) {
             GmContElement const& record = *copy.GetContElement(i);
             RC_ASSERT(record.lId == 0 && record.lIndex == i && !record.bInserted);
-            RC_ASSERT(record.pCurve != source.GetElement(i));
         }
         copy.Translation(GmVec(1, 0, 0));
         RC_ASSERT(copy != source);
@@ -57,12 +50,10 @@ TEST(ContourModel, ACopyOfABrokenChainLosesWhatDoesNotJoin) {
     broken.RemoveElement(1);
     EXPECT_TRUE(broken.IsClosed());
     const GmContour copy(broken);
-    EXPECT_EQ(copy.ElementCount(), 1);
-    EXPECT_FALSE(copy.IsClosed());
+    EXPECT_TRUE(copy.ElementCount() == 1 && !copy.IsClosed());
     GmContour assigned;
     assigned = broken;
-    EXPECT_EQ(assigned.ElementCount(), 1);
-    EXPECT_TRUE(assigned.IsClosed());
+    EXPECT_TRUE(assigned.ElementCount() == 1 && assigned.IsClosed());
 }
 
 TEST(ContourModel, AssignmentTakesFlagsAndPointAndOutlivesTheSource) {
@@ -77,22 +68,21 @@ TEST(ContourModel, AssignmentTakesFlagsAndPointAndOutlivesTheSource) {
     target.AddSub(shapes::Square(1));
     target = *source;
     source.reset();
+    GmContour& same = target;
+    target = same;
     EXPECT_EQ(target, shapes::Square(10));
     EXPECT_EQ(target.GetLastInsertPoint(), GmPoint(3, 4));
     EXPECT_FALSE(target.CreationOK());
     EXPECT_EQ(target.GetPtSol().size(), 2u);
     EXPECT_EQ(target.GetSubContour(0), nullptr);
-    GmContour& same = target;
-    target = same;
-    EXPECT_EQ(target.ElementCount(), 4);
 }
 
 TEST(ContourModel, AContourCanBecomeItsOwnSubContour) {
     // The target's sub-contours are released by the assignment, the source among them.
     OpenContour contour;
-    contour.AddSub(shapes::Slot(5, 2));
+    contour.AddSub(shapes::Slot());
     contour = *contour.GetSubContour(0);
-    EXPECT_EQ(contour, shapes::Slot(5, 2));
+    EXPECT_EQ(contour, shapes::Slot());
     EXPECT_EQ(contour.GetSubContour(0), nullptr);
 }
 

@@ -1,7 +1,10 @@
 #include "support/Contours.h"
 
+#include <gtest/gtest.h>
+
 #include <cmath>
 #include <random>
+#include <sstream>
 
 #include "gmkernel/GmArc.h"
 #include "gmkernel/GmStretch.h"
@@ -12,22 +15,11 @@ namespace {
 
 constexpr double kPi = 3.14159265358979323846;
 
-void AddSegment(GmContour& contour, GmPoint const& sp, GmPoint const& ep) {
-    contour.AddElement(GmStretch(sp, ep), false, 0);
-}
-
-void AddCounterClockwise(GmContour& contour, GmPoint const& sp, GmPoint const& ep,
-                         GmPoint const& m) {
-    contour.AddElement(GmArc(sp, ep, m, GmBase::eRotCCW), false, 0);
-}
-
-void AddSide(GmContour& contour, GmPoint const& sp, GmPoint const& ep, double bulge) {
-    if (bulge == 0.0) return AddSegment(contour, sp, ep);
-    const GmPoint middle(sp, ep);
-    const double dx = ep.X() - sp.X();
-    const double dy = ep.Y() - sp.Y();
-    const GmPoint top(middle.X() + dy * bulge / 2.0, middle.Y() - dx * bulge / 2.0);
-    contour.AddElement(GmArc(sp, top, ep), false, 0);
+GmPoint ReadPoint(std::istream& words) {
+    double x = std::nan("");
+    double y = std::nan("");
+    words >> x >> y;
+    return GmPoint(x, y);
 }
 
 GmPoint Along(GmCurve const& element, int i, int n) {
@@ -35,65 +27,59 @@ GmPoint Along(GmCurve const& element, int i, int n) {
     return GmPoint(element.SP() + (element.EP() - element.SP()) * (double(i) / n));
 }
 
-GmContour Transformed(GmContour const& contour, GmMatrix const& map) {
-    GmContour transformed(contour);
-    transformed.Transform(map);
-    return transformed;
-}
-
 }  // namespace
 
-GmContour Polyline(std::vector<GmPoint> const& points) {
-    GmContour contour;
-    for (size_t i = 1; i < points.size(); ++i)
-        AddSegment(contour, points[i - 1], points[i]);
-    return contour;
-}
-
-GmContour Polygon(std::vector<GmPoint> const& points) {
-    GmContour contour = Polyline(points);
-    contour.Close(false);
-    return contour;
+GmContour Path(std::string const& words) {
+    GmContour path;
+    std::istringstream input(words);
+    GmPoint sp = ReadPoint(input);
+    while (input >> std::ws && !input.eof()) {
+        std::string sense;
+        if (std::isalpha(input.peek())) input >> sense;
+        const GmPoint m = sense.empty() ? sp : ReadPoint(input);
+        const GmPoint ep = ReadPoint(input);
+        const GmArc arc(sp, ep, m, sense == "cw" ? GmBase::eRotCW : GmBase::eRotCCW);
+        const GmStretch segment(sp, ep);
+        GmCurve const& next = sense.empty() ? static_cast<GmCurve const&>(segment) : arc;
+        EXPECT_TRUE(input && path.AddElement(next, false, path.ElementCount() + 1)) << words;
+        sp = ep;
+    }
+    return path;
 }
 
 GmContour Square(double side) {
-    return Polygon({GmPoint(0, 0), GmPoint(side, 0), GmPoint(side, side), GmPoint(0, side)});
+    GmContour square = Path("0 0  1 0  1 1  0 1  0 0");
+    square.Transform(GmMatrix::matrixScale(side));
+    return square;
 }
 
-GmContour Slot(double length, double r) {
-    GmContour contour;
-    AddSegment(contour, GmPoint(0, 0), GmPoint(length, 0));
-    AddCounterClockwise(contour, GmPoint(length, 0), GmPoint(length, 2 * r), GmPoint(length, r));
-    AddSegment(contour, GmPoint(length, 2 * r), GmPoint(0, 2 * r));
-    AddCounterClockwise(contour, GmPoint(0, 2 * r), GmPoint(0, 0), GmPoint(0, r));
-    return contour;
+GmContour Slot() {
+    return Path("0 0  8 0  ccw 8 3 8 6  0 6  ccw 0 3 0 0");
 }
 
-GmContour RoundedRectangle(double width, double height, double r) {
-    const double w = width;
-    const double h = height;
-    GmContour contour;
-    AddSegment(contour, GmPoint(r, 0), GmPoint(w - r, 0));
-    AddCounterClockwise(contour, GmPoint(w - r, 0), GmPoint(w, r), GmPoint(w - r, r));
-    AddSegment(contour, GmPoint(w, r), GmPoint(w, h - r));
-    AddCounterClockwise(contour, GmPoint(w, h - r), GmPoint(w - r, h), GmPoint(w - r, h - r));
-    AddSegment(contour, GmPoint(w - r, h), GmPoint(r, h));
-    AddCounterClockwise(contour, GmPoint(r, h), GmPoint(0, h - r), GmPoint(r, h - r));
-    AddSegment(contour, GmPoint(0, h - r), GmPoint(0, r));
-    AddCounterClockwise(contour, GmPoint(0, r), GmPoint(r, 0), GmPoint(r, r));
-    return contour;
+GmContour RoundedRectangle() {
+    return Path(
+        "2 0  10 0  ccw 10 2 12 2  12 7  ccw 10 7 10 9  2 9  ccw 2 7 0 7  0 2  ccw 2 2 2 0");
 }
 
 GmContour Star(std::vector<StarCorner> const& corners) {
     const size_t n = corners.size();
-    std::vector<GmPoint> points;
-    for (size_t i = 0; i < n; ++i) {
-        const double angle = 2.0 * kPi * double(i) / double(n);
-        points.emplace_back(corners[i].r * std::cos(angle), corners[i].r * std::sin(angle));
-    }
+    const auto at = [&](size_t i) {
+        const double angle = 2.0 * kPi * double(i % n) / double(n);
+        return GmPoint(corners[i % n].r * std::cos(angle), corners[i % n].r * std::sin(angle));
+    };
     GmContour contour;
     for (size_t i = 0; i < n; ++i) {
-        AddSide(contour, points[i], points[(i + 1) % n], corners[i].bulge);
+        const GmPoint sp = at(i);
+        const GmPoint ep = at(i + 1);
+        const GmVec side = ep - sp;
+        const double bulge = corners[i].bulge;
+        const GmVec rise = GmVec(side.Y(), -side.X(), 0) * (bulge / 2.0);
+        if (bulge == 0.0) {
+            contour.AddElement(GmStretch(sp, ep), false, 0);
+        } else {
+            contour.AddElement(GmArc(sp, GmPoint(sp.Mean(ep) + rise), ep), false, 0);
+        }
     }
     return contour;
 }
@@ -112,40 +98,44 @@ GmContour RandomStar(unsigned seed, bool bWithArcs) {
     return Star(corners);
 }
 
-GmPoint Variant::Map(GmPoint const& p) const {
-    GmPoint mapped(p);
-    mapped.Transform(map);
-    return mapped;
-}
-
 GmContour StartedAt(GmContour const& contour, int first) {
     const int n = static_cast<int>(contour.ElementCount());
     GmContour turned;
-    for (int i = 0; i < n; ++i) {
+    for (int i = 0; i < n; ++i)
         turned.AddElement(contour.GetElement((first + i) % n), false, 0);
-    }
     return turned;
 }
 
+GmContour Moved(GmContour contour, double dx, double dy) {
+    contour.Translation(GmVec(dx, dy, 0));
+    return contour;
+}
+
 std::vector<Variant> Variants(GmContour const& contour) {
-    std::vector<Variant> variants;
-    const auto add = [&](std::string const& name, GmMatrix const& map, double scale,
-                         bool bMirrors) {
-        variants.push_back({name, Transformed(contour, map), map, scale, bMirrors});
-    };
     const GmMatrix identity;
-    variants.push_back({"as it is", contour, identity, 1.0, false});
-    variants.push_back({"reversed", contour.Inverted(), identity, 1.0, true});
+    std::vector<Variant> variants{{"as it is", contour, identity, 1.0, false},
+                                  {"reversed", contour.Inverted(), identity, 1.0, true}};
     if (contour.IsClosed()) {
         const int middle = static_cast<int>(contour.ElementCount()) / 2;
         variants.push_back({"started elsewhere", StartedAt(contour, middle), identity, 1.0, false});
     }
+    const auto add = [&](char const* name, GmMatrix const& map, double scale, bool bMirrors) {
+        variants.push_back({name, contour, map, scale, bMirrors});
+        variants.back().contour.Transform(map);
+    };
     add("mirrored", GmMatrix::matrixScale(GmVec(-1, 1, 1)), 1.0, true);
     add("rotated", GmMatrix::matrixRotate(GmVec(0, 0, -1), 33.0), 1.0, false);
     add("moved far", GmMatrix::matrixTranslate(4321.5, -8765.25, 0.0), 1.0, false);
     add("larger", GmMatrix::matrixScale(12.5), 12.5, false);
     add("smaller", GmMatrix::matrixScale(0.25), 0.25, false);
     return variants;
+}
+
+std::vector<long> Identifiers(GmContour const& contour) {
+    std::vector<long> ids;
+    for (int i = 0; i < contour.ElementCount(); ++i)
+        ids.push_back(contour.GetContElement(i)->lId);
+    return ids;
 }
 
 double ChainLength(GmContour const& contour) {
@@ -158,9 +148,8 @@ double ChainLength(GmContour const& contour) {
 std::vector<GmPoint> Samples(GmContour const& contour, int perElement) {
     std::vector<GmPoint> samples;
     for (int i = 0; i < contour.ElementCount(); ++i) {
-        for (int k = 0; k < perElement; ++k) {
+        for (int k = 0; k < perElement; ++k)
             samples.push_back(Along(*contour.GetElement(i), k, perElement - 1));
-        }
     }
     return samples;
 }

@@ -10,20 +10,18 @@
 /// Contours to test with, and the variants under which a law about contours must go on holding.
 namespace shapes {
 
-/// The open chain of segments through the points.
-GmContour Polyline(std::vector<GmPoint> const& points);
-
-/// The closed chain of segments through the points and back to the first one.
-GmContour Polygon(std::vector<GmPoint> const& points);
+/// The chain that words describe: a start point, then one element after another, with identifiers
+/// from 1. "x y" is a segment to that point; "cw" or "ccw", centre and end are an arc.
+GmContour Path(std::string const& words);
 
 /// Counter-clockwise square from (0, 0) to (side, side), starting at the origin.
 GmContour Square(double side);
 
-/// Counter-clockwise slot: segments of the length from y = 0 and y = 2 r, half circles at the ends.
-GmContour Slot(double length, double r);
+/// Counter-clockwise slot: segments of length 8 from y = 0 and y = 6, half circles at the ends.
+GmContour Slot();
 
-/// Counter-clockwise rectangle from (0, 0) to (width, height) with quarter circles at the corners.
-GmContour RoundedRectangle(double width, double height, double r);
+/// Counter-clockwise rectangle from (0, 0) to (12, 9) with quarter circles of radius 2.
+GmContour RoundedRectangle();
 
 /// One corner of a star: its distance from the origin and the height of the arc over the side that
 /// starts there, as a share of half the side; 0 is a segment, positive bulges to the right of the
@@ -49,7 +47,7 @@ struct Variant {
     double scale;    ///< factor of lengths
     bool bReversed;  ///< is the right side of the original on the left of the variant?
 
-    GmPoint Map(GmPoint const& p) const;
+    GmPoint Map(GmPoint const& p) const { return GmPoint(map * p); }
     /// A signed distance beside the original, as it is beside the variant.
     double MapOffset(double d) const { return (bReversed ? -d : d) * scale; }
 };
@@ -60,6 +58,12 @@ std::vector<Variant> Variants(GmContour const& contour);
 
 /// The closed contour with the given element first.
 GmContour StartedAt(GmContour const& contour, int first);
+
+/// A copy moved by (dx, dy).
+GmContour Moved(GmContour contour, double dx, double dy);
+
+/// The identifiers of the elements in order.
+std::vector<long> Identifiers(GmContour const& contour);
 
 /// Sum of the elements' lengths.
 double ChainLength(GmContour const& contour);

@@ -1,9 +1,11 @@
 #include "support/OffsetLaws.h"
 
+#include <gtest/gtest.h>
+
 #include <algorithm>
 #include <cmath>
+#include <complex>
 #include <limits>
-#include <sstream>
 
 #include "gmkernel/GmArc.h"
 #include "gmkernel/GmStretch.h"
@@ -20,56 +22,52 @@ constexpr double kAccuracy = 1e-3;
 constexpr double kRounding = 1e-7;
 constexpr int kSamples = 9;
 
-struct Xy {
-    double x;
-    double y;
-};
+using Xy = std::complex<double>;
+constexpr Xy kQuarterTurn{0, 1};
 
 Xy At(GmPoint const& p) {
     return {p.X(), p.Y()};
 }
-Xy operator-(Xy a, Xy b) {
-    return {a.x - b.x, a.y - b.y};
-}
 double Dot(Xy a, Xy b) {
-    return a.x * b.x + a.y * b.y;
+    return a.real() * b.real() + a.imag() * b.imag();
 }
 double Cross(Xy a, Xy b) {
-    return a.x * b.y - a.y * b.x;
+    return a.real() * b.imag() - a.imag() * b.real();
 }
-double Norm(Xy a) {
-    return std::hypot(a.x, a.y);
+double Turn(Xy a, Xy b) {
+    return std::atan2(Cross(a, b), Dot(a, b));
 }
 
 GmArc const* AsArc(GmCurve const& curve) {
     return curve.IsArc() ? static_cast<GmArc const*>(&curve) : nullptr;
 }
 
-/// The turn from direction `a` to direction `b` in the sense of an arc, in [0, 2 pi).
-double Turn(Xy a, Xy b, GmBase::eRotDir rot) {
-    const double turn = std::atan2(Cross(a, b), Dot(a, b)) * (rot == GmBase::eRotCW ? -1 : 1);
+double Sense(GmArc const& arc) {
+    return arc.Dir() == GmBase::eRotCW ? -1 : 1;
+}
+
+/// The way along the arc from its start to the direction of a point, in [0, 2 pi).
+double TurnTo(GmArc const& arc, GmPoint const& p) {
+    const Xy m = At(arc.M());
+    const double turn = Turn(At(arc.SP()) - m, At(p) - m) * Sense(arc);
     return turn < 0 ? turn + 2 * kPi : turn;
 }
 
 double Sweep(GmArc const& arc) {
-    const Xy m = At(arc.M());
-    const double sweep = Turn(At(arc.SP()) - m, At(arc.EP()) - m, arc.Dir());
-    return arc.IsFullCircle() ? 2 * kPi : sweep;
+    return arc.IsFullCircle() ? 2 * kPi : TurnTo(arc, arc.EP());
 }
 
 double DistanceOf(GmCurve const& element, GmPoint const& point) {
     const Xy p = At(point);
     const Xy sp = At(element.SP());
-    const Xy ep = At(element.EP());
-    const double toEnds = std::min(Norm(p - sp), Norm(p - ep));
+    const Xy d = At(element.EP()) - sp;
+    const double toEnds = std::min(std::abs(p - sp), std::abs(p - sp - d));
     if (GmArc const* arc = AsArc(element)) {
-        const Xy m = At(arc->M());
-        const bool beside = Turn(sp - m, p - m, arc->Dir()) <= Sweep(*arc);
-        return beside ? std::min(toEnds, std::fabs(Norm(p - m) - arc->R())) : toEnds;
+        if (TurnTo(*arc, point) > Sweep(*arc)) return toEnds;
+        return std::min(toEnds, std::fabs(std::abs(p - At(arc->M())) - arc->R()));
     }
-    const Xy d = ep - sp;
     const double t = Dot(p - sp, d) / Dot(d, d);
-    return t > 0 && t < 1 ? std::fabs(Cross(d, p - sp)) / Norm(d) : toEnds;
+    return t > 0 && t < 1 ? std::fabs(Cross(d, p - sp)) / std::abs(d) : toEnds;
 }
 
 /// Is a point away from the contour inside of it? A ray to the right crosses it an odd number of
@@ -79,71 +77,93 @@ bool IsInside(std::vector<GmPoint> const& polygon, GmPoint const& p) {
     for (size_t i = 0; i < polygon.size(); ++i) {
         const Xy a = At(polygon[i]) - At(p);
         const Xy b = At(polygon[(i + 1) % polygon.size()]) - At(p);
-        if ((a.y > 0) != (b.y > 0) && Cross(a, b) * (b.y - a.y) > 0) inside = !inside;
+        const bool passes = (a.imag() > 0) != (b.imag() > 0);
+        if (passes && Cross(a, b) * (b - a).imag() > 0) inside = !inside;
     }
     return inside;
 }
 
-std::string Say(char const* what, GmPoint const& p, double value) {
-    std::ostringstream text;
-    text.precision(10);
-    text << what << " at (" << p.X() << ", " << p.Y() << "): " << value;
-    return text.str();
-}
-
 /// The direction of travel at an end of an element.
 Xy Heading(GmCurve const& element, bool bAtEnd) {
-    const Xy p = At(bAtEnd ? element.EP() : element.SP());
-    if (GmArc const* arc = AsArc(element)) {
-        const Xy r = p - At(arc->M());
-        const double sign = (arc->Dir() == GmBase::eRotCW ? -1 : 1) / Norm(r);
-        return {-r.y * sign, r.x * sign};
-    }
-    const Xy d = At(element.EP()) - At(element.SP());
-    return {d.x / Norm(d), d.y / Norm(d)};
+    GmArc const* arc = AsArc(element);
+    const Xy way = arc != nullptr
+                       ? (At(bAtEnd ? arc->EP() : arc->SP()) - At(arc->M())) * kQuarterTurn
+                       : At(element.EP()) - At(element.SP());
+    return way / std::abs(way) * (arc != nullptr ? Sense(*arc) : 1.0);
 }
 
 /// Points of the offset of one element, without its ends, where other pieces take over.
-void AddOffset(GmCurve const& element, double d, std::vector<GmPoint>& points) {
+void AddOffset(GmCurve const& element, double d, std::vector<Xy>& points) {
+    GmArc const* arc = AsArc(element);
+    if (arc != nullptr && arc->R() + d * Sense(*arc) < kAccuracy) return;
+    const Xy sp = At(element.SP());
+    const Xy beside = sp - d * kQuarterTurn * Heading(element, false);
     for (int k = 1; k < 2 * kSamples; ++k) {
         const double t = k / (2.0 * kSamples);
-        if (GmArc const* arc = AsArc(element)) {
-            const double sense = arc->Dir() == GmBase::eRotCW ? -1 : 1;
-            const double r = arc->R() + d * sense;
-            if (r < kAccuracy) return;
-            const Xy start = At(arc->SP()) - At(arc->M());
-            const double angle = std::atan2(start.y, start.x) + t * Sweep(*arc) * sense;
-            points.emplace_back(arc->M().X() + r * std::cos(angle),
-                                arc->M().Y() + r * std::sin(angle));
+        if (arc != nullptr) {
+            const Xy m = At(arc->M());
+            points.push_back(m + (beside - m) * std::polar(1.0, t * Sweep(*arc) * Sense(*arc)));
         } else {
-            const Xy u = Heading(element, false);
-            const Xy way = At(element.EP()) - At(element.SP());
-            points.emplace_back(element.SP().X() + t * way.x + d * u.y,
-                                element.SP().Y() + t * way.y - d * u.x);
+            points.push_back(beside + t * (At(element.EP()) - sp));
         }
     }
 }
 
 /// Points of the arc about the joint of two elements, if the corner opens away from the side of d.
-void AddCorner(GmCurve const& before, GmCurve const& after, double d,
-               std::vector<GmPoint>& points) {
+void AddCorner(GmCurve const& before, GmCurve const& after, double d, std::vector<Xy>& points) {
     const Xy in = Heading(before, true);
-    const Xy out = Heading(after, false);
-    const double turn = std::atan2(Cross(in, out), Dot(in, out));
-    if (turn * d <= 0) return;
-    const double start = std::atan2(-in.x * d, in.y * d);
-    for (int k = 1; k < kSamples; ++k) {
-        const double angle = start + turn * k / kSamples;
-        points.emplace_back(before.EP().X() + std::fabs(d) * std::cos(angle),
-                            before.EP().Y() + std::fabs(d) * std::sin(angle));
-    }
+    const double turn = Turn(in, Heading(after, false));
+    for (int k = 1; k < kSamples && turn * d > 0; ++k)
+        points.push_back(At(before.EP()) -
+                         d * kQuarterTurn * in * std::polar(1.0, turn * k / kSamples));
 }
 
-double DistanceFromResults(GmContour const& source, GmPoint const& p) {
-    double nearest = std::numeric_limits<double>::max();
-    for (GmContour const* result : Results(source))
-        nearest = std::min(nearest, DistanceFrom(*result, p));
-    return nearest;
+int ExpectRightDistance(GmContour const& source, double d) {
+    int checked = 0;
+    const std::vector<GmPoint> polygon = shapes::Samples(source, 65);
+    const bool insideExpected = d * Area(source) < 0;
+    for (GmContour const* result : Results(source)) {
+        for (GmPoint const& p : shapes::Samples(*result, kSamples)) {
+            EXPECT_NEAR(DistanceFrom(source, p), std::fabs(d), kAccuracy) << p.GetTraceString();
+            const bool rightSide = !source.IsClosed() || IsInside(polygon, p) == insideExpected;
+            EXPECT_TRUE(rightSide) << p.GetTraceString();
+            ++checked;
+        }
+    }
+    return checked;
+}
+
+int ExpectNothingMissing(GmContour const& source, double d) {
+    std::vector<Xy> points;
+    const int n = static_cast<int>(source.ElementCount());
+    for (int i = 0; i < n; ++i) {
+        AddOffset(*source.GetElement(i), d, points);
+        if (i + 1 < n || source.IsClosed())
+            AddCorner(*source.GetElement(i), *source.GetElement((i + 1) % n), d, points);
+    }
+    int checked = 0;
+    for (Xy const& xy : points) {
+        const GmPoint p(xy.real(), xy.imag());
+        if (DistanceFrom(source, p) < std::fabs(d) - kRounding) continue;
+        double nearest = std::numeric_limits<double>::max();
+        for (GmContour const* result : Results(source))
+            nearest = std::min(nearest, DistanceFrom(*result, p));
+        EXPECT_LT(nearest, kAccuracy) << "missing at " << p.GetTraceString();
+        ++checked;
+    }
+    return checked;
+}
+
+int ExpectChains(GmContour const& source) {
+    int checked = 0;
+    for (GmContour const* result : Results(source)) {
+        const int n = static_cast<int>(result->ElementCount());
+        EXPECT_GT(n, 0);
+        EXPECT_TRUE(result->IsClosed() || !source.IsClosed());
+        for (int i = source.IsClosed() ? 0 : 1; i < n; ++i, ++checked)
+            EXPECT_EQ(result->GetElement((i + n - 1) % n)->EP(), result->GetElement(i)->SP()) << i;
+    }
+    return checked;
 }
 
 }  // namespace
@@ -157,15 +177,12 @@ double DistanceFrom(GmContour const& contour, GmPoint const& p) {
 
 double Area(GmContour const& contour) {
     double doubled = 0;
-    if (contour.ElementCount() == 0) return 0;
-    const Xy origin = At(contour.GetElement(0)->SP());
     for (int i = 0; i < contour.ElementCount(); ++i) {
         GmCurve const& element = *contour.GetElement(i);
+        const Xy origin = At(contour.GetElement(0)->SP());
         doubled += Cross(At(element.SP()) - origin, At(element.EP()) - origin);
-        if (GmArc const* arc = AsArc(element)) {
-            const double sense = arc->Dir() == GmBase::eRotCW ? -1 : 1;
-            doubled += sense * arc->R() * arc->R() * (Sweep(*arc) - std::sin(Sweep(*arc)));
-        }
+        if (GmArc const* arc = AsArc(element))
+            doubled += Sense(*arc) * arc->R() * arc->R() * (Sweep(*arc) - std::sin(Sweep(*arc)));
     }
     return doubled / 2;
 }
@@ -177,62 +194,8 @@ std::vector<GmContour const*> Results(GmContour const& source) {
     return results;
 }
 
-Verdict KeepsDistance(GmContour const& source, double d) {
-    Verdict verdict;
-    const std::vector<GmPoint> polygon = shapes::Samples(source, 65);
-    const bool insideExpected = d * Area(source) < 0;
-    for (GmContour const* result : Results(source)) {
-        for (GmPoint const& p : shapes::Samples(*result, kSamples)) {
-            ++verdict.checked;
-            const double off = DistanceFrom(source, p) - std::fabs(d);
-            if (!(std::fabs(off) < kAccuracy)) verdict.fault = Say("off the distance", p, off);
-            if (source.IsClosed() && IsInside(polygon, p) != insideExpected)
-                verdict.fault = Say("on the wrong side", p, d);
-            if (!verdict.Holds()) return verdict;
-        }
-    }
-    return verdict;
-}
-
-Verdict MissesNothing(GmContour const& source, double d) {
-    std::vector<GmPoint> points;
-    const int n = static_cast<int>(source.ElementCount());
-    for (int i = 0; i < n; ++i) {
-        AddOffset(*source.GetElement(i), d, points);
-        if (i + 1 < n || source.IsClosed())
-            AddCorner(*source.GetElement(i), *source.GetElement((i + 1) % n), d, points);
-    }
-    Verdict verdict;
-    for (GmPoint const& p : points) {
-        if (DistanceFrom(source, p) < std::fabs(d) - kRounding) continue;
-        ++verdict.checked;
-        const double off = DistanceFromResults(source, p);
-        if (off < kAccuracy) continue;
-        verdict.fault = Say("missing", p, off);
-        return verdict;
-    }
-    return verdict;
-}
-
-Verdict IsChained(GmContour const& source) {
-    Verdict verdict;
-    for (GmContour const* result : Results(source)) {
-        ++verdict.checked;
-        const int n = static_cast<int>(result->ElementCount());
-        if (n == 0) {
-            verdict.fault = "a result without elements";
-            return verdict;
-        }
-        const GmPoint start = result->GetElement(0)->SP();
-        for (int i = 1; i < n; ++i) {
-            const GmPoint joint = result->GetElement(i)->SP();
-            if (result->GetElement(i - 1)->EP() != joint) verdict.fault = Say("gap", joint, i);
-        }
-        const bool meets = result->GetElement(n - 1)->EP() == start;
-        if (source.IsClosed() && !(result->IsClosed() && meets))
-            verdict.fault = Say("open", start, n);
-    }
-    return verdict;
+int ExpectOffsetLaws(GmContour const& source, double d) {
+    return ExpectRightDistance(source, d) + ExpectNothingMissing(source, d) + ExpectChains(source);
 }
 
 }  // namespace offset_laws

@@ -1,6 +1,5 @@
 #pragma once
 
-#include <string>
 #include <vector>
 
 #include "gmkernel/GmContour.h"
@@ -18,22 +17,13 @@ double Area(GmContour const& contour);
 /// The offsets that a contour holds as sub-contours.
 std::vector<GmContour const*> Results(GmContour const& source);
 
-/// How a law came out.
-struct Verdict {
-    std::string fault;  ///< the first point at which the law fails, empty when it holds
-    int checked = 0;    ///< the points that were looked at
-    bool Holds() const { return fault.empty(); }
-};
-
-/// Every point of the results lies at the distance |d| from the source, on its right side for
-/// positive d; sides are only told apart where the source is closed.
-Verdict KeepsDistance(GmContour const& source, double d);
-
-/// Every point of the offsets of single elements, and of the arcs about corners that open away from
-/// the offset side, is on some result unless another part of the source comes nearer to it.
-Verdict MissesNothing(GmContour const& source, double d);
-
-/// Results are chains without gaps; those of a closed source are closed.
-Verdict IsChained(GmContour const& source);
+/// Expects of the offsets by d, positive to the right, that a contour holds:
+/// - every point lies at the distance |d| from the source, and on the right side where that is
+///   closed;
+/// - every point of the offsets of single elements, and of the arcs about corners that open away
+///   from the offset side, is on some result unless another part of the source comes nearer to it;
+/// - they are chains without gaps, closed where the source is.
+/// @returns the number of points that were looked at
+int ExpectOffsetLaws(GmContour const& source, double d);
 
 }  // namespace offset_laws

@@ -6,6 +6,7 @@
 #include <cmath>
 #include <ostream>
 #include <random>
+#include <vector>
 
 #include "gmkernel/GmArc.h"
 #include "gmkernel/GmContElement.h"
@@ -14,30 +15,22 @@
 
 namespace {
 
-bool SameDigits(GmPoint const& a, GmPoint const& b) {
-    return a.X() == b.X() && a.Y() == b.Y() && a.Z() == b.Z();
-}
-
-bool SameArc(GmArc const& a, GmArc const& b) {
-    return SameDigits(a.M(), b.M()) && a.R() == b.R() && a.SAng() == b.SAng() &&
-           a.EAng() == b.EAng() && a.Dir() == b.Dir();
-}
-
-bool SameElement(GmContElement const& a, GmContElement const& b) {
-    if (a.lId != b.lId || a.lIndex != b.lIndex || a.bInserted != b.bInserted) return false;
-    GmCurve const& c = *a.pCurve;
-    GmCurve const& o = *b.pCurve;
-    if (c.IsArc() != o.IsArc() || !SameDigits(c.SP(), o.SP()) || !SameDigits(c.EP(), o.EP()))
-        return false;
-    return !c.IsArc() || SameArc(static_cast<GmArc const&>(c), static_cast<GmArc const&>(o));
-}
-
-bool SameContour(GmContour const& a, GmContour const& b) {
-    if (a.ElementCount() != b.ElementCount() || a.IsClosed() != b.IsClosed()) return false;
-    for (int i = 0; i < a.ElementCount(); ++i) {
-        if (!SameElement(*a.GetContElement(i), *b.GetContElement(i))) return false;
+/// Everything that results must have in common, digit by digit.
+std::vector<double> Digits(GmContour const& contour) {
+    std::vector<double> digits{double(contour.IsClosed())};
+    for (int i = 0; i < contour.ElementCount(); ++i) {
+        GmContElement const& e = *contour.GetContElement(i);
+        digits.insert(digits.end(), {double(e.lId), double(e.lIndex), double(e.bInserted)});
+        std::vector<GmPoint> points{e.pCurve->SP(), e.pCurve->EP()};
+        if (e.pCurve->IsArc()) {
+            GmArc const& arc = static_cast<GmArc const&>(*e.pCurve);
+            points.push_back(arc.M());
+            digits.insert(digits.end(), {arc.R(), arc.SAng(), arc.EAng(), double(arc.Dir())});
+        }
+        for (GmPoint const& p : points)
+            digits.insert(digits.end(), {p.X(), p.Y(), p.Z()});
     }
-    return true;
+    return digits;
 }
 
 /// Results that both forms of the algorithm agree on, -1 when they differ.
@@ -46,7 +39,7 @@ int AgreedResults(GmContour& source, double d, int nSpan, bool bKeepOpen) {
     const int count = source.Offsetting(d, nSpan, bKeepOpen);
     if (count != static_cast<int>(plain.size())) return -1;
     for (int i = 0; i < count; ++i) {
-        if (!SameContour(*plain[static_cast<size_t>(i)], *source.GetSubContour(i))) return -1;
+        if (Digits(*plain[size_t(i)]) != Digits(*source.GetSubContour(i))) return -1;
     }
     return count;
 }
