@@ -20,8 +20,8 @@ struct KernelOffset {
 /// Elements shorter than 3e-4, over which the kernel joins pieces, are passed over, so there the
 /// offsets keep their distance within 3e-4 only. When a closed path yields nothing or open pieces,
 /// as an element that turns back for such a length makes it, the offset is tried again without
-/// elements shorter than 1e-3. Cost: up to the square of
-/// the number of elements, and more where many offsets cross.
+/// elements shorter than 1e-3. Cost: up to the square of the number of elements, and more where
+/// many offsets cross.
 KernelOffset offsetByKernel(const Path& path, double d);
 
 }  // namespace gmpath
