@@ -156,18 +156,3 @@ TEST(ChainBuilder, ShortElementsAreDroppedWithoutLosingTheirCourse) {
     EXPECT_TRUE(
         buildChains({circle({0, 0}, 1e-5), loose({{1, 1}, {1, 1}})}, kTolerance).contours.empty());
 }
-
-TEST(ChainBuilder, LayersAndNearlyClosedPieces) {
-    Path other = loose({{1, 0}, {0, 1}});
-    other.layer = "OTHER";
-    EXPECT_EQ(buildChains({loose({{0, 0}, {1, 0}}), other}, kTolerance).contours.size(), 2U);
-    // An arc that stops short of the full circle by less than the tolerance closes upon itself.
-    Path nearly{{}, false, "0"};
-    appendArc(nearly.elements, {0, 0}, 5, 0, 2 * path_shapes::kPi - 1e-4);
-    const auto closed = buildChains({nearly}, kTolerance).contours;
-    ASSERT_EQ(closed.size(), 1U);
-    EXPECT_TRUE(closed[0].closed);
-    EXPECT_NEAR(signedArea(closed[0]), 25 * path_shapes::kPi, 0.01);
-    // A short line does not close upon itself, however wide the tolerance.
-    EXPECT_FALSE(buildChains({loose({{0, 0}, {0.5, 0}})}, 1.0).contours[0].closed);
-}

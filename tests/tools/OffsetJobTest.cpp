@@ -18,13 +18,6 @@ using Distances = std::vector<double>;
 
 const ProgressCall kNoProgress = [](std::size_t, std::size_t) {};
 
-double totalArea(const ContourOffsets& offsets) {
-    double area = 0.0;
-    for (const OffsetPath& offset : offsets.paths)
-        area += std::abs(signedArea(offset.path));
-    return area;
-}
-
 /// Largest difference between the offset's distance from its source and d, sampled.
 double deviation(const Path& offset, const Path& source, double d) {
     double worst = 0.0;
@@ -54,21 +47,6 @@ TEST(OffsetJob, SideByDepthAndSense) {
     EXPECT_EQ(signedDistances(open, 0, Side::kInside, 2), Distances({2, -2}));
     EXPECT_EQ(signedDistances(open, 0, Side::kLeft, 2), Distances({-2}));
     EXPECT_EQ(signedDistances(open, 0, Side::kWaste, 0).size(), 1U);
-}
-
-TEST(OffsetJob, PlateWithHoles) {
-    // The plate grows, the holes shrink; the small one vanishes.
-    const std::vector<Path> part = {rectangle({0, 0}, {40, 20}), reversed(circle({10, 10}, 5)),
-                                    circle({30, 10}, 1), polygon({{50, 0}, {60, 0}}, false)};
-    const auto offsets = offsetContours(part, {Side::kWaste, {2}}, kNoProgress);
-    ASSERT_EQ(offsets.size(), 4U);
-    ASSERT_EQ(offsets[0].paths.size(), 1U);
-    EXPECT_NEAR(totalArea(offsets[0]), 800 + 2 * 120 + 4 * kPi, 1e-3);
-    EXPECT_NEAR(totalArea(offsets[1]), 9 * kPi, 1e-3);
-    EXPECT_TRUE(offsets[2].paths.empty());
-    EXPECT_EQ(offsets[2].emptyPasses, std::vector<std::size_t>({0}));
-    EXPECT_EQ(offsets[3].paths.size(), 2U);
-    EXPECT_TRUE(offsets[0].paths[0].path.closed);
 }
 
 TEST(KernelBridge, OffsetsKeepTheirDistance) {
