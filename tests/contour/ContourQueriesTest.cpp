@@ -33,7 +33,7 @@ double NearestSample(GmContour const& contour, GmPoint const& p) {
 TEST(ContourQueries, MinDistIsTheDistanceOfAPointOfTheContour) {
     EXPECT_TRUE(rc::check([](unsigned seed) {
         const GmPoint p = RandomPoint();
-        const double scaleOfSampling = 0.05;  // a sample lies within this of every point of a star
+        const double scaleOfSampling = 0.06;  // a sample lies within this of every point of a star
         for (auto const& variant : shapes::Variants(shapes::RandomStar(seed, true))) {
             const GmPoint mapped = variant.Map(p);
             double d = 0;
