@@ -1,9 +1,9 @@
 #include <cmath>
 
 #include "contour/ContourElements.h"
-#include "values/Constants.h"
 #include "gmkernel/GmArc.h"
 #include "gmkernel/GmContour.h"
+#include "values/Constants.h"
 
 // The sense of rotation is the sign of the area of a polygon through the joints and through points
 // of the arcs, by the sum of cross products of neighbouring radius vectors (the shoelace formula).
