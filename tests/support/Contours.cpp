@@ -63,6 +63,7 @@ GmContour RoundedRectangle() {
 }
 
 GmContour Star(std::vector<StarCorner> const& corners) {
+    constexpr double kFlattestBulge = 1e-3;
     const size_t n = corners.size();
     const auto at = [&](size_t i) {
         const double angle = 2.0 * kPi * double(i % n) / double(n);
@@ -75,7 +76,8 @@ GmContour Star(std::vector<StarCorner> const& corners) {
         const GmVec side = ep - sp;
         const double bulge = corners[i].bulge;
         const GmVec rise = GmVec(side.Y(), -side.X(), 0) * (bulge / 2.0);
-        if (bulge == 0.0) {
+        // Three points that are nearly in line make no arc.
+        if (std::fabs(bulge) < kFlattestBulge) {
             contour.AddElement(GmStretch(sp, ep), false, 0);
         } else {
             contour.AddElement(GmArc(sp, GmPoint(sp.Mean(ep) + rise), ep), false, 0);

@@ -24,8 +24,8 @@ GmContour Slot();
 GmContour RoundedRectangle();
 
 /// One corner of a star: its distance from the origin and the height of the arc over the side that
-/// starts there, as a share of half the side; 0 is a segment, positive bulges to the right of the
-/// direction of travel, which is outwards.
+/// starts there, as a share of half the side; below 1e-3 a segment, positive bulges to the right of
+/// the direction of travel, which is outwards.
 struct StarCorner {
     double r;
     double bulge;
