@@ -12,9 +12,8 @@ public:
     /// @param curve the piece
     /// @param source index of the source element whose band the piece belongs to
     /// @param id identifier of the source element, carried to the results
-    /// @param kept true for the offset on the chosen side and for the end cap, which may end up in
-    /// a
-    ///        result; the other pieces only serve to cut
+    /// @param kept true for the offset on the chosen side and for the end cap, which may end up
+    ///        in a result; the other pieces only serve to cut
     /// @param auxiliary false only for the offset on the chosen side
     GmOffsetElement(std::unique_ptr<GmCurve> curve, int source, int id, bool kept, bool auxiliary);
     /// Clones the curve.
