@@ -7,7 +7,7 @@ cd "$(dirname "$0")/.."
 
 values='GmBase|GmVec|GmPoint|GmAngle|GmDir|GmMatrix|export'
 curves='GmCurve|GmRect|GmLine|GmBeam|GmStretch|GmCircle|GmArc'
-contour='GmContour|GmContElement|KxArray'
+contour='GmApprDepData|GmContour|GmContElement|KxArray'
 
 # The layer of a header or source by its path: 1 values, 2 curves, 3 contour, 0 none of them.
 layer_of() {

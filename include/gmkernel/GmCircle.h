@@ -12,6 +12,9 @@
 #include "gmkernel/GmPoint.h"
 #include "gmkernel/export.h"
 
+class GmArc;
+class GmStretch;
+
 /// A full circle: centre, radius and axis; base of the arc.
 ///
 /// Intersections are computed in the x-y plane and take z from a centre; distances of points are
@@ -32,6 +35,55 @@ public:
     /// The concentric circle with the radius enlarged by `d`; undefined with radius 0 when `circle`
     /// is or when the new radius falls below m_scdPrec.
     GmCircle(GmCircle const& circle, double d);
+
+    /// The circle through three points; undefined when one of them is, when two of them are equal
+    /// and when all are collinear.
+    GmCircle(GmPoint const& p1, GmPoint const& p2, GmPoint const& p3);
+    /// The circle that touches three lines, about the crossing of the bisectors of (l1, l2) and of
+    /// (reversed l1, l3). Directions choose among the four such circles: for a triangle, reversing
+    /// one side of a boundary run in one sense leads from one circle to another. Undefined when a
+    /// line is and when the bisectors do not cross.
+    GmCircle(GmLine const& l1, GmLine const& l2, GmLine const& l3);
+    /// The circle of radius |r| that touches two lines, in the sector between the rays that leave
+    /// their crossing along both directions: at |r / sin(a/2)| from the crossing on the bisector,
+    /// a the angle between the directions. Radius 0 gives the crossing. Undefined when a line is
+    /// and for parallel lines.
+    GmCircle(GmLine const& l1, GmLine const& l2, double r);
+    /// The circle of radius `r` that touches a circle and a line. Undefined when one of them is,
+    /// when `r` is not positive and when no such circle exists.
+    /// @param c the circle to touch
+    /// @param l the line to touch, directed
+    /// @param r the radius, positive
+    /// @param bRight the new circle lies right of the line, else left
+    /// @param bOutside it touches `c` from outside, else from inside
+    /// @param bAfter of two such circles the one that comes after its touching point with `c` in
+    ///        the direction of the line, else the one that comes before it
+    GmCircle(GmCircle const& c, GmLine const& l, double r, bool bRight, bool bOutside, bool bAfter);
+    /// The circle of radius `r` that touches two circles. Undefined when one of them is, when `r`
+    /// is not positive and when no such circle exists.
+    /// @param c1, c2 the circles to touch
+    /// @param r the radius, positive
+    /// @param bCW of two such circles the one whose centre sees the touching point with `c2`
+    ///        clockwise from that with `c1` (by less than a half-turn), else counter-clockwise
+    /// @param bOutside1, bOutside2 it touches the circle from outside, else from inside
+    /// @param bOther the other of the two circles
+    GmCircle(GmCircle const& c1, GmCircle const& c2, double r, bool bCW, bool bOutside1,
+             bool bOutside2, bool bOther);
+    /// The fillet of radius `r` between the end of `a1` and the start of `a2`: it lies on the side
+    /// to which the path turns there, and touches an arc from inside where the path turns with it.
+    /// Where the path reverses it turns with `a1` if the end of `a2` lies inside a1's full circle,
+    /// else against it. The touching points may lie off the arcs. Undefined when an arc is, when
+    /// `r` is not positive and when no such circle exists.
+    /// @param bOther the other of two candidates
+    GmCircle(GmArc const& a1, GmArc const& a2, double r, bool bOther);
+    /// The fillet of radius `r` between an arc and a segment, chosen as between two arcs.
+    /// @param a the arc
+    /// @param s the segment; only its carrier counts
+    /// @param r the radius, positive
+    /// @param bArcFirst the end of the arc joins the start of the segment, else the end of the
+    ///        segment joins the start of the arc
+    /// @param bOther the other of two candidates
+    GmCircle(GmArc const& a, GmStretch const& s, double r, bool bArcFirst, bool bOther);
     ~GmCircle() override;
     /// Copies centre, radius, axis, creation flag and solution list, and keeps the own type tag;
     /// nothing when assigned to itself.
@@ -124,6 +176,12 @@ protected:
     GmPoint m_M;   ///< centre
     GmDir m_Axis;  ///< axis of the plane
     double m_dR;   ///< radius
+
+private:
+    void CreateTangCircle(GmCircle const& c, GmLine const& l, double r, bool bRight, bool bOutside,
+                          bool bAfter);
+    void CreateTangCircle(GmCircle const& c1, GmCircle const& c2, double r, bool bCW,
+                          bool bOutside1, bool bOutside2, bool bOther);
 };
 
 #endif  // GMKERNEL_GMCIRCLE_H

@@ -12,7 +12,12 @@
 #include "gmkernel/KxArray.h"
 #include "gmkernel/export.h"
 
+class GmArc;
+class GmCircle;
 class GmContourArray;
+class GmStretch;
+struct GmApprDepData;
+struct GmContIntPoint;
 
 /// A chain of segments and arcs in which every element starts where the previous one ends.
 ///
@@ -47,6 +52,11 @@ public:
     /// insert point are not copied. Of a chain that is broken (by RemoveElement(), or through the
     /// element pointers) the elements that do not join are left out.
     GmContour(GmContour const& source);
+    /// An approach to a curve or a departure from it, of segments and arcs with identifier 0; see
+    /// GmApprDepData. Undefined when the curve is null or has no such end, when the free point is
+    /// undefined, and where the kind of move builds nothing (as when the free point lies inside
+    /// the circle of the lead-in arc). Created but empty when the free point is the curve's end.
+    GmContour(GmApprDepData const& data);
     /// Deletes the elements and the sub-contours.
     ~GmContour() override;
     /// Makes this contour an independent copy: the elements as in the copy constructor, with
@@ -281,6 +291,18 @@ private:
     /// Replaces the sub-contours by one copy of this chain that keeps the identifiers.
     void CopyContourToSubContour();
 };
+
+/// Picks where a path along the offsets of a contour starts: at the element with the smallest
+/// identifier, of several the one whose start is nearest to the start of the contour moved sideways
+/// by the distance. Of an open contour with exactly one open offset only that one is searched, for
+/// the first element with the smallest identifier.
+/// @param c the contour; null or without elements answers false
+/// @param count how many of its sub-contours are searched; more than there are stand for all
+/// @param d the signed distance of the offsets, positive to the right
+/// @param sub, elem receive the indices of sub-contour and element; on false they may hold a part
+///        of the answer or -1
+/// @return was a start found?
+GMKERNEL_EXPORT bool FindTPCCont(GmContour const* c, int count, double d, int& sub, int& elem);
 
 /// Hook for diagnostics of a contour's elements; does nothing.
 GMKERNEL_EXPORT void GmTraceContourElements(GmContour const* contour, std::string const& title,

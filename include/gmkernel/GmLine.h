@@ -11,6 +11,8 @@
 #include "gmkernel/GmPoint.h"
 #include "gmkernel/export.h"
 
+class GmCircle;
+
 /// Selects a line built from a line and a point.
 enum eLineCustructionTypePL {
     ePLParallel = 0,  ///< the parallel through the point
@@ -56,6 +58,21 @@ public:
     /// that reversing one line gives the other, perpendicular bisector. Of parallel lines it is the
     /// middle parallel with the direction of `a`. Undefined when a line is.
     GmLine(GmLine const& a, GmLine const& b);
+    /// The tangent from `p` to a circle: starts at the touching point and points away from `p`,
+    /// with the circle on its right if bRight is set, else on its left. The touching points are the
+    /// crossings of the circle with the circle whose diameter joins `p` and the centre. For a point
+    /// of the circle it is the tangent there. Undefined for a point inside the circle, and when
+    /// point or circle is.
+    GmLine(GmPoint const& p, GmCircle const& c, bool bRight);
+    /// The common tangent from `c1` to `c2` with each circle on the side its flag asks for: right
+    /// if set, else left. It starts at its touching point on `c2`; equal flags give a direct
+    /// tangent, different ones a crossing tangent.
+    ///
+    /// With D the distance of the centres, the radius to the touching points makes the angle
+    /// 90 degrees - asin((R1 - R2) / D) with the line of centres, R1 + R2 for a crossing tangent.
+    /// Undefined when there is none (one circle inside the other; a crossing tangent of circles
+    /// that overlap), for equal concentric circles, and when a circle is undefined.
+    GmLine(GmCircle const& c1, bool bRight1, GmCircle const& c2, bool bRight2);
     ~GmLine() override;
     /// Copies point, direction, creation flag and solution list, and keeps the own type tag;
     /// nothing when assigned to itself.

@@ -4,6 +4,7 @@
 #define GMKERNEL_GMKERNEL_H
 
 #include "gmkernel/GmAngle.h"
+#include "gmkernel/GmApprDepData.h"
 #include "gmkernel/GmArc.h"
 #include "gmkernel/GmBase.h"
 #include "gmkernel/GmBeam.h"
