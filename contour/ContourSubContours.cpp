@@ -64,8 +64,7 @@ void GmContour::CopyContourToSubContour() {
         copy->AddElement(GetElement(i), false, GetContElement(i)->lId);
     }
     RemoveAllSubConts();
-    m_pSubConts->Add(copy.get());
-    copy.release();
+    m_pSubConts->Take(std::move(copy));
 }
 
 void GmContour::RemoveAllSubConts() {

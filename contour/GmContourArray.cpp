@@ -4,6 +4,11 @@ void GmContourArray::Add(GmContour* contour) {
     m_entries.Add(contour);
 }
 
+void GmContourArray::Take(std::unique_ptr<GmContour> contour) {
+    Add(contour.get());
+    static_cast<void>(contour.release());
+}
+
 int GmContourArray::GetCount() const {
     return static_cast<int>(m_entries.GetCount());
 }

@@ -2,7 +2,9 @@
 
 #include <wx/dynarray.h>
 
-class GmContour;
+#include <memory>
+
+#include "gmkernel/GmContour.h"
 
 /// The sub-contour list: pointers to contours in the order of their indices. The list forgets and
 /// never deletes; the contour that holds it owns the entries.
@@ -10,6 +12,8 @@ class GmContourArray {
 public:
     /// Appends one pointer.
     void Add(GmContour* contour);
+    /// Appends a contour whose owner is from now on that of the list.
+    void Take(std::unique_ptr<GmContour> contour);
     int GetCount() const;
     /// Entry at an index in 0..GetCount()-1; the index is not tested.
     GmContour* operator[](int index) const;

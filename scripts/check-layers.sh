@@ -5,8 +5,8 @@
 set -euo pipefail
 cd "$(dirname "$0")/.."
 
-values='GmBase|GmVec|GmPoint|GmAngle|GmDir|GmMatrix|export'
-curves='GmCurve|GmRect|GmLine|GmBeam|GmStretch|GmCircle|GmArc'
+values='GmBase|GmVec|GmPoint|GmAngle|GmDir|GmMatrix|GmRotary|export'
+curves='GmCurve|GmRect|GmLine|GmBeam|GmStretch|GmCircle|GmArc|GmHelix'
 contour='GmApprDepData|GmContour|GmContElement|KxArray'
 
 # The layer of a header or source by its path: 1 values, 2 curves, 3 contour, 0 none of them.

@@ -52,8 +52,7 @@ int GmContour::Offsetting(double d, int nSpan, bool bKeepOpen) {
         const PieceList chain = takeChain(pieces);
         std::unique_ptr<GmContour> result = resultContour(chain);
         if (!hasOffset(chain) || (insideOnly && !result->IsClosed())) continue;
-        m_pSubConts->Add(result.get());
-        static_cast<void>(result.release());
+        m_pSubConts->Take(std::move(result));
     }
     return m_pSubConts->GetCount();
 }

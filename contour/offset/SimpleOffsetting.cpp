@@ -55,7 +55,6 @@ int GmContour::SimpleOffsetting(double d) {
     for (OffsetCurve const& offset : offsets) {
         result->AddElement(*offset.curve, false, offset.id);
     }
-    m_pSubConts->Add(result.get());
-    static_cast<void>(result.release());
+    m_pSubConts->Take(std::move(result));
     return 1;
 }

@@ -44,6 +44,13 @@ struct GmContIntPoint;
 class GMKERNEL_EXPORT GmContour : public GmCurve,
                                   private boost::equality_comparable<GmContour, GmContour> {
 public:
+    /// The kinds of transition between two elements, and what their value means (length units).
+    enum eTransType {
+        eTransRadius = 1,         ///< rounding arc, tangent to both elements, of this radius
+        eTransChamferDist = 2,    ///< chamfer between the points at this distance from the corner
+        eTransChamferLength = 3,  ///< chamfer of this length
+    };
+
     /// An empty open contour without sub-contours, created.
     GmContour();
     /// Copies creation flag, tag and solution list, and clones the elements as if each was appended
@@ -230,6 +237,80 @@ public:
     /// eRotNone.
     eRotDir Dir(GmPoint const& r);
 
+    /// Puts a rounding or chamfer into the junction after an element, between the last and the
+    /// first one too when the contour is closed. Both neighbours are cut back to its ends; then
+    /// every element of the contour shorter than m_scdPrec is removed, also after a failure.
+    ///
+    /// A chamfer of given length between two segments is exact: both legs are value / |2 sin(a/2)|
+    /// with the angle a of the corner. Beside an arc at most 20 halvings of the distance from the
+    /// corner look for it, to within 0.005. The new element is marked as inserted.
+    ///
+    /// Known limits: beside an arc a chamfer of at most 0.005 is never found, nor one whose legs
+    /// are longer than the shorter of the two elements' chords (0 for a full circle).
+    /// @param type the kind; any other value makes no transition
+    /// @param index index of the element that ends at the junction
+    /// @param value radius, distance or length
+    /// @param bIdOfFirst the new element gets the identifier of the element before the junction,
+    ///        else that of the one after it
+    /// @return was it made, or not needed because the elements continue each other? False, too, for
+    ///        an index outside and for values that do not fit the elements.
+    bool AddTrans(eTransType type, int index, double value, bool bIdOfFirst);
+    /// AddElement() with the curve, the validation flag and the identifier, then AddTrans() between
+    /// it and the element before it. False when the curve is refused, when there is no transition
+    /// (the curve stays appended) and for the first element.
+    bool AddElementAndTrans(GmCurve const* c, bool bValidate, long id, eTransType type,
+                            double value, bool bIdOfFirst);
+    bool AddElementAndTrans(GmCurve const& c, bool bValidate, long id, eTransType type,
+                            double value, bool bIdOfFirst);
+    /// Rounds the corners between consecutive elements, in a closed contour that between the last
+    /// and the first one too. A corner stays sharp where no circle of the radius touches each
+    /// element in exactly one point. New arcs are marked as inserted; their identifier and index
+    /// are their position.
+    /// @param dRadius the radius in length units
+    /// @param nMode for closed contours: below 0 only corners that turn with the contour, above 0
+    ///        only those that turn against it, 0 all
+    void RoundCorners(double dRadius, int nMode);
+
+    /// Splits the first element that contains the point (with the element's own tolerance, 0.01 for
+    /// arcs) into two that meet there. The second one carries the identifier and index of the first
+    /// and is marked as inserted. A point that is a joint already splits nothing. The point becomes
+    /// the last insert point.
+    /// @return does the point lie on the contour? False also for an element that is neither a
+    ///         segment nor an arc, which cannot be split.
+    bool SplitAt(GmPoint const& p);
+    /// Splits at every point in which a curve meets the contour; replaces the solution list. False
+    /// when they do not meet.
+    /// @throw std::runtime_error "Function not found" for a curve that cannot be intersected
+    bool SplitAt(GmCurve* curve);
+    /// Splits at the point nearest to `p`; false without elements.
+    bool SplitAtMinDist(GmPoint const& p);
+    /// Splits at the point nearest to `p`, of equally near ones at the one nearer to `q`; false
+    /// without elements.
+    bool SplitAtMinDist(GmPoint const& p, GmPoint const& q);
+    /// Splits at the point nearest to another contour; false for null and without elements.
+    bool SplitAtMinDist(GmContour* other);
+    /// Splits both contours where they are nearest to each other; false for null and without
+    /// elements.
+    bool SplitBothAtMinDist(GmContour* other);
+
+    /// Computes the loops which the boundaries of this and another closed contour form together and
+    /// stores them as sub-contours in place of earlier ones: a loop follows one boundary to the
+    /// next crossing, changes over to the other one, and so on. For two overlapping contours of the
+    /// same sense these are the outline of both and of their common part, running in that sense.
+    /// Neither contour changes; all identifiers are 0. Cost: elements times elements, then the
+    /// number of crossings for each step along the loops.
+    ///
+    /// Known limit: where sides lie flush on each other there are no crossings; only the joints at
+    /// their ends count. Contours that touch along a side may yield one loop, parts or none.
+    /// @param other the other contour; may be one of the sub-contours
+    /// @param bSameSense keeps only loops with the sense of this contour
+    /// @return the number of sub-contours, 0 for contours apart from each other; -1, with nothing
+    ///         changed, when a contour is not closed, is null or holds other elements than segments
+    ///         and arcs; -2 when a loop does not come back to its start: the loops before it stay
+    int MeltContours(GmContour* other, bool bSameSense);
+    /// MeltContours(other, false): every loop, whatever its sense.
+    int SplitContours(GmContour* other);
+
     /// Computes the contours at the constant distance `d` beside the contour, positive to the
     /// right of the direction of travel, and stores them as sub-contours in place of earlier ones.
     ///
@@ -253,6 +334,25 @@ public:
     /// contour when every element vanishes.
     /// @return 1, or 0 with no sub-contour when neighbours do not cross or `d` is not finite
     int SimpleOffsetting(double d);
+    /// Computes parallel contours with different distances in x and y and stores them as
+    /// sub-contours in place of earlier ones. Arcs of this contour are first split where they cross
+    /// the axes through their centre, which stays. Every element moves by +-x and +-y, with both
+    /// positive to the right of the direction of travel: by (x, -y) for a direction of the first
+    /// quadrant, by the whole vector (z included) for the second, then by (-x, y) and (-x, -y);
+    /// directions along +y and -x count to the second, along +x and -y to the fourth. Neighbours
+    /// that no longer meet are trimmed or bridged by segments, and the chain is taken apart at its
+    /// crossings into loops; those with the sense of this contour are kept. A vector shorter than
+    /// m_scdPrec gives a copy. Cost: elements times elements.
+    ///
+    /// Known limits: nothing is tested for distance, so a loop may come near the contour or be a
+    /// second loop beside the one that is wanted, and arcs keep their radius. Directions within
+    /// m_scdPrec of an axis follow the sign of their small component. A single crossing is not
+    /// taken apart.
+    /// @param v the distances in x and y, length units
+    /// @return the number of sub-contours; -2 when a loop does not come back to its start: the
+    /// loops
+    ///         before it stay
+    int VarParallelContours(GmVec const& v);
 
 protected:
     /// Empties the contour: elements, sub-contours, last insert point, closed flag.
@@ -275,6 +375,26 @@ protected:
     /// was appended. Identifier 0, or the one given.
     bool AddRealElem(GmCurve* c);
     bool AddRealElem(GmCurve* c, long id);
+    /// AddTrans() at the corner after the element `index` of two elements of this contour, without
+    /// the removal of short elements. The new element gets the identifier `id`.
+    bool AddTrans(eTransType type, GmStretch* first, GmStretch* second, int index, double value,
+                  long id);
+    /// The same for a segment and an arc; bArcFirst says that the arc ends at the corner.
+    bool AddTrans(eTransType type, GmStretch* segment, GmArc* arc, int index, double value, long id,
+                  bool bArcFirst);
+    /// The same for two arcs.
+    bool AddTrans(eTransType type, GmArc* first, GmArc* second, int index, double value, long id);
+    /// Ends `c1` and starts `c2` on a circle of radius |r| and answers the arc between them in the
+    /// given sense. The circle touches one of the curves, on its left for a positive radius, on its
+    /// right for a negative one: `c2` at its start when that lies to the right of the end of `c1`
+    /// (to the left for a negative radius), else `c1` at its end. The caller owns the arc. Null for
+    /// null, and when the circle misses a curve; `c1` may then be cut already.
+    GmCurve* GetArc(GmCurve* c1, GmCurve* c2, double r, eRotDir dir);
+    /// Splits every arc at the point of its circle in the given direction from the centre and, with
+    /// bBoth, at the opposite point. Always true.
+    bool SplitArcs(GmDir const& dir, bool bBoth);
+    /// Splits every arc where it crosses the axes through its centre. Always true.
+    bool SplitArcsQuadrant();
     /// Is the chain continuous and, when the closed flag is set, closed? True without elements.
     bool CheckContour();
     /// The middle point of an element; undefined for an index outside and for an element that is
@@ -287,6 +407,16 @@ protected:
     GmPoint m_LastInsertPoint;                             ///< see GetLastInsertPoint()
 
 private:
+    bool AddTransAt(eTransType type, int index, double value, bool bIdOfFirst);
+    bool AddTransBetween(eTransType type, GmCurve* first, GmCurve* second, int index, double value,
+                         long id);
+    GmPoint GetIntersectionPoint(GmCircle const& circle, GmArc const* arc) const;
+    /// Splits an element at a point; false for an element that is neither a segment nor an arc.
+    bool SplitElement(int index, GmPoint const& p);
+    /// Splits an element at a point of it other than its ends; false where there is no such point.
+    bool SplitInside(int index, GmPoint const& p);
+    int FindNextPoint(GmPoint p, GmCurve* curve, int index,
+                      KxArray<GmContIntPoint*, GmContIntPoint*> const& passages) const;
     GmContour* GetSubContour_private(int index) const;
     /// Replaces the sub-contours by one copy of this chain that keeps the identifiers.
     void CopyContourToSubContour();
