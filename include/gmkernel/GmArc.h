@@ -159,10 +159,10 @@ protected:
 private:
     GmPoint SP_Ang() const;
     GmPoint EP_Ang() const;
-    bool AreDefined(GmPoint const& sp, GmPoint const& ep);
-    void SetEnds(GmPoint const& sp, GmPoint const& ep);
-    void SetAngles(double sAng, double eAng, eRotDir rot);
-    GmDir TangentAt(GmDir const& radial) const;
+    GMKERNEL_NO_EXPORT bool AreDefined(GmPoint const& sp, GmPoint const& ep);
+    GMKERNEL_NO_EXPORT void SetEnds(GmPoint const& sp, GmPoint const& ep);
+    GMKERNEL_NO_EXPORT void SetAngles(double sAng, double eAng, eRotDir rot);
+    GMKERNEL_NO_EXPORT GmDir TangentAt(GmDir const& radial) const;
 
     GmPoint m_SP;
     GmPoint m_EP;

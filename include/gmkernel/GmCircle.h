@@ -171,7 +171,7 @@ public:
 
 protected:
     /// Sets centre, axis and radius and marks the circle as created.
-    void Define(GmPoint const& m, GmDir const& axis, double r);
+    GMKERNEL_NO_EXPORT void Define(GmPoint const& m, GmDir const& axis, double r);
 
     GmPoint m_M;   ///< centre
     GmDir m_Axis;  ///< axis of the plane

@@ -407,14 +407,14 @@ protected:
     GmPoint m_LastInsertPoint;                             ///< see GetLastInsertPoint()
 
 private:
-    bool AddTransAt(eTransType type, int index, double value, bool bIdOfFirst);
-    bool AddTransBetween(eTransType type, GmCurve* first, GmCurve* second, int index, double value,
-                         long id);
+    GMKERNEL_NO_EXPORT bool AddTransAt(eTransType type, int index, double value, bool bIdOfFirst);
+    GMKERNEL_NO_EXPORT bool AddTransBetween(eTransType type, GmCurve* first, GmCurve* second,
+                                            int index, double value, long id);
     GmPoint GetIntersectionPoint(GmCircle const& circle, GmArc const* arc) const;
     /// Splits an element at a point; false for an element that is neither a segment nor an arc.
-    bool SplitElement(int index, GmPoint const& p);
+    GMKERNEL_NO_EXPORT bool SplitElement(int index, GmPoint const& p);
     /// Splits an element at a point of it other than its ends; false where there is no such point.
-    bool SplitInside(int index, GmPoint const& p);
+    GMKERNEL_NO_EXPORT bool SplitInside(int index, GmPoint const& p);
     int FindNextPoint(GmPoint p, GmCurve* curve, int index,
                       KxArray<GmContIntPoint*, GmContIntPoint*> const& passages) const;
     GmContour* GetSubContour_private(int index) const;

@@ -149,7 +149,7 @@ protected:
     /// Replaces this curve's solution list by a copy of the other's.
     void CopyPtSol(GmCurve const& other) const;
     /// Copies creation flag and solution list and keeps the own type tag.
-    void CopyCurvePart(GmCurve const& other);
+    GMKERNEL_NO_EXPORT void CopyCurvePart(GmCurve const& other);
     /// Offers the candidate `p` with the reference point `q` to a nearest-point search. Ignored
     /// when `q` is undefined; else it becomes the best point when the squared distance of both is
     /// strictly below `d`, or when there is no defined best point yet.

@@ -91,8 +91,8 @@ public:
 
 private:
     /// The swept angle in radians from the start of the arc to a point beside it.
-    double SweepTo(GmPoint const& p) const;
-    double HeightAt(double sweep) const;
+    GMKERNEL_NO_EXPORT double SweepTo(GmPoint const& p) const;
+    GMKERNEL_NO_EXPORT double HeightAt(double sweep) const;
 
     GmArc m_Arc;
     double m_dStartHeight;

@@ -143,7 +143,7 @@ public:
 
 protected:
     /// Sets point and direction and marks the line as created.
-    void Define(GmPoint const& p, GmDir const& dir);
+    GMKERNEL_NO_EXPORT void Define(GmPoint const& p, GmDir const& dir);
 
     GmPoint m_SP;  ///< a point of the line; the start of beams and stretches
     GmDir m_Dir;   ///< unit direction

@@ -102,7 +102,7 @@ public:
     bool operator==(GmStretch const& stretch) const;
 
 private:
-    void FollowEnds();
+    GMKERNEL_NO_EXPORT void FollowEnds();
 
     GmPoint m_EP;
 };
