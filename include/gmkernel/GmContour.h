@@ -300,8 +300,10 @@ public:
     /// Neither contour changes; all identifiers are 0. Cost: elements times elements, then the
     /// number of crossings for each step along the loops.
     ///
-    /// Known limit: where sides lie flush on each other there are no crossings; only the joints at
-    /// their ends count. Contours that touch along a side may yield one loop, parts or none.
+    /// Known limits: where sides lie flush on each other there are no crossings; only the joints at
+    /// their ends count. Contours that touch along a side may yield one loop, parts or none. A
+    /// crossing within m_scdPrec of a joint can be lost when the next element misses it by more
+    /// than that; a loop may then not come back.
     /// @param other the other contour; may be one of the sub-contours
     /// @param bSameSense keeps only loops with the sense of this contour
     /// @return the number of sub-contours, 0 for contours apart from each other; -1, with nothing
