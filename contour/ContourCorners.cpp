@@ -17,15 +17,21 @@ GmCircle circleInCorner(GmCurve const& prev, GmCurve const& cur, double radius) 
                     radius);
 }
 
-/// The arc that rounds a corner; null where no circle touches each element in exactly one point.
-std::unique_ptr<GmArc> filletBetween(GmCurve const& prev, GmCurve const& cur, double radius) {
+/// The arc that rounds a corner and the points where it meets the elements.
+struct Fillet {
+    std::unique_ptr<GmArc> arc;  ///< null where no circle touches each element in exactly one point
+    GmPoint start;
+    GmPoint end;
+};
+
+Fillet filletBetween(GmCurve const& prev, GmCurve const& cur, double radius) {
     const GmCircle circle = circleInCorner(prev, cur, radius);
-    if (!circle.CreationOK() || circle.Intersection(&prev) != 1) return nullptr;
+    if (!circle.CreationOK() || circle.Intersection(&prev) != 1) return {};
     const GmPoint start = circle.GetSolution(0);
-    if (circle.Intersection(&cur) != 1) return nullptr;
+    if (circle.Intersection(&cur) != 1) return {};
     const GmPoint end = circle.GetSolution(0);
-    if (start == end) return nullptr;
-    return std::make_unique<GmArc>(circle, start, end, true);
+    if (start == end) return {};
+    return {std::make_unique<GmArc>(circle, start, end, true), start, end};
 }
 
 /// Does the mode ask for a corner that turns in the given sense?
@@ -42,14 +48,14 @@ void GmContour::RoundCorners(double dRadius, int nMode) {
     for (int j = 1; j <= corners; ++j) {
         GmCurve& prev = *GetElement(j - 1);
         GmCurve& cur = *GetElement(j < ElementCount() ? j : 0);
-        std::unique_ptr<GmArc> fillet = filletBetween(prev, cur, dRadius);
-        if (!fillet || (m_bClosed && !isWanted(nMode, fillet->Dir() == sense))) continue;
-        prev.SetEP(fillet->SP());
-        cur.SetSP(fillet->EP());
-        std::unique_ptr<GmContElement> record(CreateContElement(fillet.get(), j, j, true));
+        Fillet fillet = filletBetween(prev, cur, dRadius);
+        if (!fillet.arc || (m_bClosed && !isWanted(nMode, fillet.arc->Dir() == sense))) continue;
+        prev.SetEP(fillet.start);
+        cur.SetSP(fillet.end);
+        std::unique_ptr<GmContElement> record(CreateContElement(fillet.arc.get(), j, j, true));
         m_pElements->InsertAt(j, record.get());
         static_cast<void>(record.release());
-        static_cast<void>(fillet.release());
+        static_cast<void>(fillet.arc.release());
         ++j;
         ++corners;
     }

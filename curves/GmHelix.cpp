@@ -135,6 +135,7 @@ void GmHelix::Translation(GmVec const& /*v*/) {}
 
 void GmHelix::Transform(GmMatrix const& m) {
     m_Arc.Transform(m);
+    m_bCreationOK = m_Arc.CreationOK();
 }
 
 std::string GmHelix::GetTraceString() const {

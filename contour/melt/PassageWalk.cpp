@@ -57,6 +57,7 @@ bool walkLoop(Passages& passages, int start, WalkTrack const& track) {
     GmPoint at = passages[start].Point;
     int found = start;
     long long steps = 0;
+    int stepsWithoutPassage = 0;
     do {
         const std::unique_ptr<GmCurve> piece(track.curveAt(index).Clone());
         if (found >= 0) piece->SetSP(at);
@@ -71,7 +72,8 @@ bool walkLoop(Passages& passages, int start, WalkTrack const& track) {
             index = passages[found].nTo;
         }
         track.append(*piece);
-        if (++steps > stepLimit) return false;
+        stepsWithoutPassage = found < 0 ? stepsWithoutPassage + 1 : 0;
+        if (++steps > stepLimit || stepsWithoutPassage > track.curveCount + 1) return false;
     } while (found != start);
     return true;
 }

@@ -48,7 +48,8 @@ struct WalkTrack {
 
 /// Walks from a passage along the curves and over every passage that comes, until it is back at the
 /// first one. Marks passages as used. False when it does not come back within as many steps as
-/// there are pairs of curves and passages.
+/// there are pairs of curves and passages, or goes past more curves than there are without a
+/// passage: it would then go round for ever.
 bool walkLoop(Passages& passages, int start, WalkTrack const& track);
 
 }  // namespace gmkernel_detail

@@ -14,7 +14,7 @@ double degreesOf(double radians) {
 }
 
 /// Does a tangent of the kind exist? A circle inside the other has none, and circles that overlap
-/// have no crossing one. Of concentric circles only equal ones get past these tests.
+/// have no crossing one. Equal concentric circles are refused by their distance.
 bool hasTangent(double r1, double r2, double dist, bool crossing) {
     if (crossing && r1 + r2 > dist) return false;
     return dist + r1 >= r2 && dist + r2 >= r1 && dist > 0.0;

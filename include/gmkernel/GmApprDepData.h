@@ -48,8 +48,9 @@ struct GmApprDepData {
     double dAutoRadius = 0.0;
 
     /// The side of the curve on which the move lies, seen along the curve: 1 right, -1 left.
-    /// Any other value chooses the left-hand normal of an approach or departure run towards Q; it
-    /// scales the angle of kind 3, and kind 4 takes 0 for -1.
+    /// Any other value chooses the left-hand normal of an approach or departure run towards Q. It
+    /// also scales the angle of kind 3 and, except for 0, which counts as -1, the distance of the
+    /// centre in kind 4: then the arc misses Q and is left out.
     int nSide = 0;
 };
 

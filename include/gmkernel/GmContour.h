@@ -45,7 +45,7 @@ class GMKERNEL_EXPORT GmContour : public GmCurve,
                                   private boost::equality_comparable<GmContour, GmContour> {
 public:
     /// The kinds of transition between two elements, and what their value means (length units).
-    enum eTransType {
+    enum eTransType : int {
         eTransRadius = 1,         ///< rounding arc, tangent to both elements, of this radius
         eTransChamferDist = 2,    ///< chamfer between the points at this distance from the corner
         eTransChamferLength = 3,  ///< chamfer of this length
@@ -249,7 +249,8 @@ public:
     /// are longer than the shorter of the two elements' chords (0 for a full circle).
     /// @param type the kind; any other value makes no transition
     /// @param index index of the element that ends at the junction
-    /// @param value radius, distance or length
+    /// @param value radius, distance or length. Between segments, and as a distance everywhere, it
+    ///        counts by its magnitude; beside an arc a radius or length has to be positive.
     /// @param bIdOfFirst the new element gets the identifier of the element before the junction,
     ///        else that of the one after it
     /// @return was it made, or not needed because the elements continue each other? False, too, for
@@ -266,7 +267,8 @@ public:
     /// and the first one too. A corner stays sharp where no circle of the radius touches each
     /// element in exactly one point. New arcs are marked as inserted; their identifier and index
     /// are their position.
-    /// @param dRadius the radius in length units
+    /// @param dRadius the radius in length units; between segments it counts by its magnitude,
+    ///        beside an arc it has to be positive
     /// @param nMode for closed contours: below 0 only corners that turn with the contour, above 0
     ///        only those that turn against it, 0 all
     void RoundCorners(double dRadius, int nMode);
@@ -303,7 +305,8 @@ public:
     /// Known limits: where sides lie flush on each other there are no crossings; only the joints at
     /// their ends count. Contours that touch along a side may yield one loop, parts or none. A
     /// crossing within m_scdPrec of a joint can be lost when the next element misses it by more
-    /// than that; a loop may then not come back.
+    /// than that; a loop may then not come back. Nor does one that starts a full circle, split it
+    /// first.
     /// @param other the other contour; may be one of the sub-contours
     /// @param bSameSense keeps only loops with the sense of this contour
     /// @return the number of sub-contours, 0 for contours apart from each other; -1, with nothing
@@ -348,12 +351,11 @@ public:
     ///
     /// Known limits: nothing is tested for distance, so a loop may come near the contour or be a
     /// second loop beside the one that is wanted, and arcs keep their radius. Directions within
-    /// m_scdPrec of an axis follow the sign of their small component. A single crossing is not
-    /// taken apart.
+    /// m_scdPrec of an axis follow the sign of their small component. A contour without elements
+    /// gives one empty sub-contour.
     /// @param v the distances in x and y, length units
-    /// @return the number of sub-contours; -2 when a loop does not come back to its start: the
-    /// loops
-    ///         before it stay
+    /// @return the number of sub-contours; -2 when a loop does not come back to its start, the
+    ///         loops before it stay
     int VarParallelContours(GmVec const& v);
 
 protected:

@@ -40,7 +40,8 @@ public:
     GmHelix* Clone() const override;
     /// Not provided: an undefined rectangle.
     GmRect BoundingRect() const override;
-    /// GmArc::Trim() of the projection; the heights stay.
+    /// GmArc::Trim() of the projection; the heights stay. The start of `next` moves to the end of
+    /// the arc, at the arc's z.
     bool Trim(GmCurve* next) override;
     /// Is the point's projection on the arc (within 0.01) and its height strictly within m_scdPrec
     /// of the height there?
@@ -72,7 +73,8 @@ public:
     GmCurve* GetParallel(double d) const override;
     /// Has no effect: a helix does not move.
     void Translation(GmVec const& v) override;
-    /// Transforms the arc. The heights stay, so what a matrix does along z does not reach them.
+    /// Transforms the arc, which is created by that. The heights stay, so what a matrix does along
+    /// z does not reach them.
     void Transform(GmMatrix const& m) override;
     /// "helix2 (x, y) - (x, y) mp (x, y)" with five decimals: start, end, centre; "helix3" for
     /// every helix that is not clockwise.

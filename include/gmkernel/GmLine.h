@@ -14,14 +14,14 @@
 class GmCircle;
 
 /// Selects a line built from a line and a point.
-enum eLineCustructionTypePL {
+enum eLineCustructionTypePL : int {
     ePLParallel = 0,  ///< the parallel through the point
     ePLNormal = 1,    ///< the perpendicular through the point, directed to the right of the line
     ePLCopy = 2       ///< a copy of the line; the point is only tested for being defined
 };
 
 /// Selects a line built from two points.
-enum eLineCustructionTypePP {
+enum eLineCustructionTypePP : int {
     ePPMidNormal = 0,     ///< the perpendicular bisector
     ePPNormalFirst = 1,   ///< the perpendicular to the connection, through the first point
     ePPNormalSecond = 2,  ///< the perpendicular to the connection, through the second point

@@ -20,7 +20,7 @@ GMKERNEL_EXPORT void ITracyl(double a, double r, double& length);
 
 /// From Cartesian coordinates on an end face to polar ones.
 /// @param x, y the point in length units; a coordinate below 1e-7 in magnitude counts as 0 for the
-///        angle
+///        angle, except that with both so small any negative y gives 180
 /// @param c offset added to the radius
 /// @param radius receives the distance from the origin plus `c`
 /// @param angle receives degrees in [0, 360), clockwise from the positive y axis; 90 at the origin

@@ -50,8 +50,8 @@ TEST(Tangents, FromAPointTouchTheCircleOnTheSideAskedFor) {
         const GmLine tangent(p, c, bRight);
         RC_ASSERT(tangent.CreationOK() == (dist > c.R()));
         if (dist < c.R()) return;
-        RC_ASSERT(std::fabs(rightOf(tangent, c.M()) - (bRight ? c.R() : -c.R())) < 1e-6);
-        RC_ASSERT(std::fabs(tangent.SP().Dist(c.M()) - c.R()) < 1e-6);
+        RC_ASSERT(std::fabs(rightOf(tangent, c.M()) - (bRight ? c.R() : -c.R())) < 1e-8);
+        RC_ASSERT(std::fabs(tangent.SP().Dist(c.M()) - c.R()) < 1e-8);
         RC_ASSERT(tangent.Dir() == GmDir(p, tangent.SP()));
     }));
     const GmLine onCircle(GmPoint(2, 0), Circle(0, 0, 2), true);
