@@ -72,9 +72,9 @@ public:
     /// The fillet of radius `r` between the end of `a1` and the start of `a2`: it lies on the side
     /// to which the path turns there, and touches an arc from inside where the path turns with it.
     /// Where the path reverses it turns with `a1` if the end of `a2` lies inside a1's full circle,
-    /// else against it. The touching points may lie off the arcs. Undefined when an arc is, when
-    /// `r` is not positive and when no such circle exists.
-    /// @param bOther the other of two candidates
+    /// else against it. The touching points may lie off the arcs; bOther takes the other of two
+    /// candidates. Undefined when an arc is, when `r` is not positive and when no such circle
+    /// exists.
     GmCircle(GmArc const& a1, GmArc const& a2, double r, bool bOther);
     /// The fillet of radius `r` between an arc and a segment, chosen as between two arcs.
     /// @param a the arc
