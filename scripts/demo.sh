@@ -1,6 +1,6 @@
 #!/usr/bin/env bash
-# Installs what is missing, builds gmpath and offsets the example parts; the drawings of the
-# results are in out/.
+# Installs what is missing, builds gmpath, offsets the example parts and makes a program that cuts one
+# of them out; the results are in out/.
 set -euo pipefail
 cd "$(dirname "$0")/.."
 
@@ -18,6 +18,11 @@ echo "== bracket: paths of a 6 mm cutter, along the edges and 1.5 mm off them be
 "$gmpath" offset examples/parts/bracket.dxf --distance 3 --count 2 --step 1.5 \
     -o out/bracket.svg -o out/bracket.dxf
 echo
+echo "== bracket: cut out 8 mm deep with that cutter, in quarter-circle arcs onto the cut and off it"
+"$gmpath" toolpath examples/parts/bracket.dxf --tool 6 --stock 0.2 --count 2 --step 1.5 \
+    --lead arc --depth 8 --step-down 4 --feed 900 --spindle 12000 \
+    -o out/bracket.ngc -o out/bracket-toolpath.svg
+echo
 echo "== hourglass plate: from the rim inwards; the paths part at the neck"
 "$gmpath" info examples/parts/hourglass-plate.dxf
 "$gmpath" offset examples/parts/hourglass-plate.dxf --side inside \
@@ -31,4 +36,4 @@ echo "== gasket: one sixth drawn once and inserted six times"
 
 echo
 echo "Pictures and drawings of the results:"
-ls -1 "$PWD"/out/*.svg "$PWD"/out/*.dxf
+ls -1 "$PWD"/out/*.svg "$PWD"/out/*.dxf "$PWD"/out/*.ngc

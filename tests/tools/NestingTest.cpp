@@ -43,3 +43,12 @@ TEST(Nesting, TouchingCrossingAndEqualPaths) {
     EXPECT_EQ(equal[0], 0);
     EXPECT_EQ(equal[1], 0);
 }
+
+TEST(Nesting, OpenPathsAreHeldHoweverOftenTheyGoRound) {
+    const std::vector<Vec2> round = {{1, 1}, {9, 1}, {9, 9}, {1, 9},
+                                     {1, 2}, {9, 2}, {9, 8}, {2, 8}};
+    using Holders = std::vector<std::vector<std::size_t>>;
+    EXPECT_EQ(enclosingPaths({rectangle({0, 0}, {10, 10}), polygon(round, false),
+                              polygon({{5, 5}, {15, 5}}, false), circle({5, 5}, 1)}),
+              Holders({{}, {0}, {}, {0}}));
+}

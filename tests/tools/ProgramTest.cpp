@@ -36,6 +36,11 @@ protected:
 
 const std::string kBracket = std::string(GMPATH_TEST_DATA) + "/bracket.dxf";
 
+const std::string kDrawingInFeet =
+    "0\nSECTION\n2\nHEADER\n9\n$INSUNITS\n70\n2\n0\nENDSEC\n0\nSECTION\n2\nENTITIES\n"
+    "0\nCIRCLE\n8\n0\n10\n5\n20\n5\n40\n3\n0\nCIRCLE\n8\n0\n10\n5\n20\n5\n40\n0.5\n"
+    "0\nENDSEC\n0\nEOF\n";
+
 bool isOneLine(const std::string& text) {
     return std::count(text.begin(), text.end(), '\n') == 1 && text.back() == '\n';
 }
@@ -65,6 +70,21 @@ TEST_F(Program, OffsetWritesEveryOutput) {
     EXPECT_EQ(run("offset " + kBracket + " --distance -1 --side both -o b.svg").exitCode, 0);
 }
 
+TEST_F(Program, ToolpathWritesProgramAndPicture) {
+    m_scratch.store("feet.dxf", kDrawingInFeet);
+    const Outcome cut =
+        run("toolpath feet.dxf --scale 12 --units inch --tool 14 --lead arc --spindle 8000 "
+            "-o a.NGC -o a.svg");
+    EXPECT_EQ(cut.exitCode, 0);
+    EXPECT_EQ(cut.err, "gmpath: feet.dxf: contour 2: the tool does not fit\n");
+    EXPECT_EQ(cut.out.find("2 contours, cuts 270.2 in, "), 0U) << cut.out;
+    EXPECT_NE(m_scratch.content("a.NGC").find("\nG20\n"), std::string::npos);
+    EXPECT_NE(m_scratch.content("a.NGC").find("\nM3 S8000.000\n"), std::string::npos);
+    for (const std::string part : {"source", "cut", "lead", "rapid"}) {
+        EXPECT_NE(m_scratch.content("a.svg").find("<path class=\"" + part), std::string::npos);
+    }
+}
+
 TEST_F(Program, BadInputIsOneLineAndExitCodeTwo) {
     m_scratch.store("empty.dxf", "");
     m_scratch.store("prose.dxf", "This is no drawing.\nNot at all.\n");
@@ -73,6 +93,7 @@ TEST_F(Program, BadInputIsOneLineAndExitCodeTwo) {
                                               "ELF\0\0\1\2",
                                               8));
     m_scratch.store("bare.dxf", "0\nSECTION\n2\nENTITIES\n0\nENDSEC\n0\nEOF\n");
+    m_scratch.store("feet.dxf", kDrawingInFeet);
     std::filesystem::create_directory(m_scratch.file("folder.dxf"));
     const std::size_t before = m_scratch.files();
     const std::vector<std::pair<std::string, std::string>> cases = {
@@ -98,6 +119,18 @@ TEST_F(Program, BadInputIsOneLineAndExitCodeTwo) {
         {"offset " + kBracket + " --distance 1 --strict -o a.svg", "TEXT"},
         {"offset " + kBracket + " -o a.svg", "--distance"},
         {"offset " + kBracket + " --distance 1", "--output"},
+        {"toolpath " + kBracket + " -o a.ngc", "--tool"},
+        {"toolpath " + kBracket + " --tool nan -o a.ngc", "--tool"},
+        {"toolpath " + kBracket + " --tool 4 -o a.dxf", ".ngc or .svg"},
+        {"toolpath " + kBracket + " --tool 4 --stock -1 -o a.ngc", "--stock"},
+        {"toolpath " + kBracket + " --tool 4 --lead spiral -o a.ngc", "--lead"},
+        {"toolpath " + kBracket + " --tool 4 --lead-angle inf -o a.ngc", "--lead-angle"},
+        {"toolpath " + kBracket + " --tool 4 --depth 20 --step-down 0.01 -o a.ngc", "--step-down"},
+        {"toolpath " + kBracket + " --tool 4 --safe-z 0 -o a.ngc", "--safe-z"},
+        {"toolpath " + kBracket + " --tool 4 --plunge 1e-9 -o a.ngc", "--plunge"},
+        {"toolpath " + kBracket + " --tool 4 --count 9 --step 9e8 -o a.ngc", "--step"},
+        {"toolpath " + kBracket + " --tool 4 --climb --conventional -o a.ngc", "excludes"},
+        {"toolpath feet.dxf --tool 4 -o a.ngc", "feet"},
         {"", "subcommand"},
         {"melt " + kBracket, ""},
     };
@@ -115,6 +148,7 @@ TEST_F(Program, BadInputIsOneLineAndExitCodeTwo) {
 TEST_F(Program, HelpHasAnExamplePerSubcommand) {
     EXPECT_NE(run("info --help").out.find("Example: gmpath info"), std::string::npos);
     EXPECT_NE(run("offset --help").out.find("Example: gmpath offset"), std::string::npos);
+    EXPECT_NE(run("toolpath --help").out.find("Example: gmpath toolpath"), std::string::npos);
     const Outcome version = run("--version");
     EXPECT_EQ(version.exitCode, 0);
     EXPECT_EQ(version.out.find("gmpath "), 0U);

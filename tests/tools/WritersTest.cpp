@@ -11,6 +11,7 @@
 #include "PartReader.h"
 #include "PathShapes.h"
 #include "Scratch.h"
+#include "SvgPage.h"
 #include "SvgWriter.h"
 
 using namespace gmpath;

@@ -17,6 +17,9 @@ public:
     AtomicFile& operator=(const AtomicFile&) = delete;
     AtomicFile& operator=(AtomicFile&&) = delete;
 
+    /// The name that the file gets.
+    const std::string& name() const { return m_name; }
+
     /// The name to write under until the file is committed.
     const std::string& besideName() const { return m_besideName; }
 

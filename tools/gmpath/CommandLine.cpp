@@ -5,6 +5,7 @@
 
 #include "InputError.h"
 #include "Text.h"
+#include "ToolpathCommandLine.h"
 
 namespace gmpath {
 
@@ -86,13 +87,17 @@ int runCommandLine(int argc, const char* const* argv, const Console& console) {
     program.footer("Example: gmpath offset bracket.dxf --distance 3 -o bracket.svg");
     InputOptions infoOptions;
     OffsetOptions offsetOptions;
+    ToolpathOptions toolpathOptions;
     const CLI::App* info = addInfo(program, infoOptions);
     const CLI::App* offset = addOffset(program, offsetOptions);
+    CLI::App* toolpath = addToolpath(program, toolpathOptions);
+    addInputOptions(*toolpath, toolpathOptions.input);
     try {
         program.parse(argc, argv);
         if (offset->count("--step") == 0) offsetOptions.step = offsetOptions.distance;
         if (info->parsed()) runInfo(infoOptions, console);
         if (offset->parsed()) runOffset(offsetOptions, console);
+        if (toolpath->parsed()) runToolpath(toolpathOptions, console);
     } catch (const CLI::ParseError& error) {
         return finishParsing(program, error, console);
     } catch (const InputError& error) {

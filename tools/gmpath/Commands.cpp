@@ -19,23 +19,6 @@ constexpr double kLargestDistance = 1e9;
 
 constexpr int kDistanceDigits = 9;
 
-void checkPositive(double value, const std::string& option) {
-    if (!std::isfinite(value) || value <= 0.0 || value > kLargestDistance) {
-        throw InputError(option + ": not a positive finite number");
-    }
-}
-
-Part readInput(const InputOptions& options, const Console& console) {
-    checkPositive(options.read.joinTolerance, "--join");
-    checkPositive(options.read.scale, "--scale");
-    Part part = readPart(options.drawing, options.read);
-    if (part.skipped.unusable.empty()) return part;
-    const std::string line = options.drawing + ": " + unusableLine(part.skipped);
-    if (options.strict) throw InputError(line);
-    console.err << "gmpath: " << line << "\n";
-    return part;
-}
-
 std::vector<double> distancesOf(const OffsetOptions& options) {
     if (options.count < 1 || options.count > kMaxPasses) {
         throw InputError("--count: not a number from 1 to " + std::to_string(kMaxPasses));
@@ -71,6 +54,23 @@ std::size_t reportContours(const OffsetOptions& options, const std::vector<doubl
 }
 
 }  // namespace
+
+void checkPositive(double value, const std::string& option) {
+    if (!std::isfinite(value) || value <= 0.0 || value > kLargestDistance) {
+        throw InputError(option + ": not a positive finite number");
+    }
+}
+
+Part readInput(const InputOptions& options, const Console& console) {
+    checkPositive(options.read.joinTolerance, "--join");
+    checkPositive(options.read.scale, "--scale");
+    Part part = readPart(options.drawing, options.read);
+    if (part.skipped.unusable.empty()) return part;
+    const std::string line = options.drawing + ": " + unusableLine(part.skipped);
+    if (options.strict) throw InputError(line);
+    console.err << "gmpath: " << line << "\n";
+    return part;
+}
 
 void runInfo(const InputOptions& options, const Console& console) {
     console.out << infoTable(readInput(options, console));

@@ -32,6 +32,13 @@ struct Console {
     bool showProgress = false;  ///< `err` is a terminal
 };
 
+/// Throws InputError, naming the option, for a value that is not positive and finite or beyond 1e9.
+void checkPositive(double value, const std::string& option);
+
+/// Reads the drawing and reports what of it cannot be used. Throws InputError for options and input
+/// that cannot be used.
+Part readInput(const InputOptions& options, const Console& console);
+
 /// Prints the table of contours. Throws InputError for input that cannot be used.
 void runInfo(const InputOptions& options, const Console& console);
 

@@ -18,12 +18,18 @@ Vec2 turnedHalfSweep(Vec2 v, double bulge, double sign) {
     return {cosine * v.x - sine * v.y, sine * v.x + cosine * v.y};
 }
 
-double distanceToSegment(const Element& e, Vec2 p) {
+/// v turned counter-clockwise by an angle in radians.
+Vec2 turned(Vec2 v, double angle) {
+    const double cosine = std::cos(angle);
+    const double sine = std::sin(angle);
+    return {cosine * v.x - sine * v.y, sine * v.x + cosine * v.y};
+}
+
+Vec2 nearestOnSegment(const Element& e, Vec2 p) {
     const Vec2 d = e.ep - e.sp;
     const double lengthSquared = dot(d, d);
-    if (lengthSquared == 0.0) return distance(e.sp, p);
-    const double t = std::clamp(dot(p - e.sp, d) / lengthSquared, 0.0, 1.0);
-    return distance(e.sp + t * d, p);
+    if (lengthSquared == 0.0) return e.sp;
+    return e.sp + std::clamp(dot(p - e.sp, d) / lengthSquared, 0.0, 1.0) * d;
 }
 
 }  // namespace
@@ -44,6 +50,15 @@ Vec2 centre(const Element& e) {
 
 Vec2 halvingPoint(const Element& e) {
     return middle(e.sp, e.ep) + 0.5 * e.bulge * rightNormal(e.ep - e.sp);
+}
+
+// The chord from the start turns half as far from the chord of the whole as the tangent does; its
+// length follows from the sines of both half sweeps. So a flat arc needs no far-off centre.
+Vec2 pointAt(const Element& e, double t) {
+    if (!isArc(e)) return e.sp + t * (e.ep - e.sp);
+    const double half = 0.5 * sweep(e);
+    const double share = std::sin(t * half) / std::sin(half);
+    return e.sp + share * turned(e.ep - e.sp, (t - 1.0) * half);
 }
 
 double length(const Element& e) {
@@ -71,13 +86,16 @@ bool arcHolds(const Element& e, Vec2 q) {
     return e.bulge * sideOfChord(e, q) <= 0.0;
 }
 
-double distance(const Element& e, Vec2 p) {
-    if (!isArc(e)) return distanceToSegment(e, p);
+Vec2 nearestPoint(const Element& e, Vec2 p) {
+    if (!isArc(e)) return nearestOnSegment(e, p);
     const Vec2 m = centre(e);
-    const double r = radius(e);
-    const Vec2 foot = m + r * unit(p - m);
-    if (foot != m && arcHolds(e, foot)) return std::abs(distance(m, p) - r);
-    return std::min(distance(e.sp, p), distance(e.ep, p));
+    const Vec2 foot = m + radius(e) * unit(p - m);
+    if (foot != m && arcHolds(e, foot)) return foot;
+    return distance(e.sp, p) <= distance(e.ep, p) ? e.sp : e.ep;
+}
+
+double distance(const Element& e, Vec2 p) {
+    return distance(nearestPoint(e, p), p);
 }
 
 Element straightened(const Element& e) {

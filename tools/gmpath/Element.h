@@ -35,6 +35,9 @@ Vec2 centre(const Element& e);
 /// Point half way along the element.
 Vec2 halvingPoint(const Element& e);
 
+/// Point at the fraction t, 0..1, of the length.
+Vec2 pointAt(const Element& e, double t);
+
 /// Length along the element.
 double length(const Element& e);
 
@@ -53,6 +56,9 @@ double sideOfChord(const Element& e, Vec2 p);
 
 /// True when a point q of the arc's circle lies on the arc itself.
 bool arcHolds(const Element& e, Vec2 q);
+
+/// The point of the element nearest to p.
+Vec2 nearestPoint(const Element& e, Vec2 p);
 
 /// Distance from p to the nearest point of the element.
 double distance(const Element& e, Vec2 p);

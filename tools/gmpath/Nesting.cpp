@@ -11,14 +11,14 @@ namespace {
 /// Points looked at along a path, at most.
 constexpr std::size_t kMaxSamples = 64;
 
-struct ClosedRegion {
+struct Region {
     const Path* path;
     Box box;
     double area;
 };
 
-ClosedRegion regionOf(const Path& path) {
-    return {&path, boundingBox(path), std::abs(signedArea(path))};
+Region regionOf(const Path& path) {
+    return {&path, boundingBox(path), path.closed ? std::abs(signedArea(path)) : 0.0};
 }
 
 std::vector<Vec2> samplesAlong(const Path& path) {
@@ -31,7 +31,7 @@ std::vector<Vec2> samplesAlong(const Path& path) {
     return samples;
 }
 
-bool liesIn(const ClosedRegion& inner, const ClosedRegion& outer) {
+bool liesIn(const Region& inner, const Region& outer) {
     if (inner.area >= outer.area) return false;
     if (!outer.box.grown(kKernelTolerance).holds(inner.box)) return false;
     bool anyInside = false;
@@ -43,22 +43,40 @@ bool liesIn(const ClosedRegion& inner, const ClosedRegion& outer) {
     return anyInside;
 }
 
+std::vector<Region> regionsOf(const std::vector<Path>& paths) {
+    std::vector<Region> regions;
+    for (const Path& path : paths)
+        regions.push_back(regionOf(path));
+    return regions;
+}
+
+std::vector<std::size_t> enclosing(const std::vector<Region>& regions, std::size_t inner) {
+    std::vector<std::size_t> found;
+    for (std::size_t outer = 0; outer < regions.size(); ++outer) {
+        if (regions[outer].path->closed && liesIn(regions[inner], regions[outer])) {
+            found.push_back(outer);
+        }
+    }
+    return found;
+}
+
 }  // namespace
 
 std::vector<std::optional<int>> nestingDepths(const std::vector<Path>& paths) {
-    std::vector<ClosedRegion> regions;
-    for (const Path& path : paths)
-        regions.push_back(regionOf(path));
-
+    const std::vector<Region> regions = regionsOf(paths);
     std::vector<std::optional<int>> depths(paths.size());
     for (std::size_t i = 0; i < paths.size(); ++i) {
-        if (!paths[i].closed) continue;
-        const auto enclosing = [&](const ClosedRegion& outer) {
-            return outer.path->closed && liesIn(regions[i], outer);
-        };
-        depths[i] = static_cast<int>(std::count_if(regions.begin(), regions.end(), enclosing));
+        if (paths[i].closed) depths[i] = static_cast<int>(enclosing(regions, i).size());
     }
     return depths;
+}
+
+std::vector<std::vector<std::size_t>> enclosingPaths(const std::vector<Path>& paths) {
+    const std::vector<Region> regions = regionsOf(paths);
+    std::vector<std::vector<std::size_t>> found;
+    for (std::size_t i = 0; i < paths.size(); ++i)
+        found.push_back(enclosing(regions, i));
+    return found;
 }
 
 }  // namespace gmpath

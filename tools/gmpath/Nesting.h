@@ -16,4 +16,8 @@ namespace gmpath {
 /// elements.
 std::vector<std::optional<int>> nestingDepths(const std::vector<Path>& paths);
 
+/// For every path, open ones too, the indices of the closed paths that it lies in, by the same
+/// rule; an open path counts as one without area.
+std::vector<std::vector<std::size_t>> enclosingPaths(const std::vector<Path>& paths);
+
 }  // namespace gmpath

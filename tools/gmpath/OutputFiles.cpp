@@ -4,7 +4,6 @@
 #include <cctype>
 #include <filesystem>
 
-#include "AtomicFile.h"
 #include "DxfWriter.h"
 #include "InputError.h"
 #include "SvgWriter.h"
@@ -26,24 +25,36 @@ bool isSameFile(const std::string& a, const std::string& b) {
            std::filesystem::weakly_canonical(b, error);
 }
 
-AtomicFile written(const OffsetDrawing& drawing, const std::string& name) {
+std::string alternatives(const std::vector<std::string>& endings) {
+    std::string text;
+    for (const std::string& ending : endings)
+        text += (text.empty() ? "" : " or ") + ending;
+    return text;
+}
+
+AtomicFile written(const std::vector<OutputFormat>& formats, const std::string& name) {
     AtomicFile file(name);
-    if (endingOf(name) == ".svg") {
-        file.write(svgOf(drawing));
-    } else if (!writeDxf(drawing, file.besideName())) {
-        throw InputError(name + ": cannot be written as a whole");
+    const std::string ending = endingOf(name);
+    for (const OutputFormat& format : formats) {
+        if (format.ending == ending) format.write(file);
     }
     return file;
 }
 
+void writeWholeDxf(const OffsetDrawing& drawing, const AtomicFile& file) {
+    if (!writeDxf(drawing, file.besideName())) {
+        throw InputError(file.name() + ": cannot be written as a whole");
+    }
+}
+
 }  // namespace
 
-void checkOutputs(const std::vector<std::string>& names, const std::string& inputName) {
+void checkOutputs(const std::vector<std::string>& names, const std::string& inputName,
+                  const std::vector<std::string>& endings) {
     for (std::size_t i = 0; i < names.size(); ++i) {
         const std::string& name = names[i];
-        const std::string ending = endingOf(name);
-        if (ending != ".svg" && ending != ".dxf") {
-            throw InputError(name + ": the ending of an output is .svg or .dxf");
+        if (std::find(endings.begin(), endings.end(), endingOf(name)) == endings.end()) {
+            throw InputError(name + ": the ending of an output is " + alternatives(endings));
         }
         if (isSameFile(name, inputName)) throw InputError(name + ": is the drawing that is read");
         for (std::size_t j = 0; j < i; ++j) {
@@ -53,12 +64,18 @@ void checkOutputs(const std::vector<std::string>& names, const std::string& inpu
     }
 }
 
-void writeOutputs(const OffsetDrawing& drawing, const std::vector<std::string>& names) {
+void writeOutputs(const std::vector<OutputFormat>& formats, const std::vector<std::string>& names) {
     std::vector<AtomicFile> files;
     for (const std::string& name : names)
-        files.push_back(written(drawing, name));
+        files.push_back(written(formats, name));
     for (AtomicFile& file : files)
         file.commit();
+}
+
+void writeOutputs(const OffsetDrawing& drawing, const std::vector<std::string>& names) {
+    writeOutputs({{".svg", [&](AtomicFile& file) { file.write(svgOf(drawing)); }},
+                  {".dxf", [&](const AtomicFile& file) { writeWholeDxf(drawing, file); }}},
+                 names);
 }
 
 }  // namespace gmpath

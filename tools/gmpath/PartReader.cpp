@@ -48,11 +48,12 @@ Drawing readFiltered(const FilteredDrawing& filtered) {
 }  // namespace
 
 Part partFromText(const std::string& text, const ReadOptions& options) {
-    const Drawing drawing = readFiltered(filterDrawing(dxfGroups(text)));
+    const std::vector<DxfGroup> groups = dxfGroups(text);
+    const Drawing drawing = readFiltered(filterDrawing(groups));
     ExpandedDrawing expanded = expandBlocks(drawing, Placement::scaling(options.scale));
     ChainResult chains =
         buildChains(std::move(expanded.paths), options.joinTolerance * options.scale);
-    Part part{std::move(chains.contours), std::move(expanded.skipped)};
+    Part part{std::move(chains.contours), std::move(expanded.skipped), drawingUnits(groups)};
     add(part.skipped, chains.skipped);
     if (part.contours.empty()) failWithoutContours(part.skipped);
     return part;

@@ -3,6 +3,7 @@
 #include <string>
 #include <vector>
 
+#include "DrawingUnits.h"
 #include "Path.h"
 #include "SkipReport.h"
 
@@ -19,6 +20,7 @@ struct ReadOptions {
 struct Part {
     std::vector<Path> contours;  ///< at least one, each with at least one element
     SkipReport skipped;
+    DrawingUnits units;
 };
 
 /// Reads a part drawing (DXF in text form) and builds its contours.

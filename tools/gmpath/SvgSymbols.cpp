@@ -30,14 +30,7 @@ double dotRadius(const Path& path, double diagonal) {
 Vec2 pointAlong(const Path& path, double distanceAlong) {
     for (const Element& e : path.elements) {
         const double len = length(e);
-        if (distanceAlong <= len) {
-            const double t = len > 0.0 ? distanceAlong / len : 0.0;
-            if (!isArc(e)) return e.sp + t * (e.ep - e.sp);
-            const Vec2 m = centre(e);
-            const double angle = t * sweep(e);
-            const Vec2 r = e.sp - m;
-            return m + std::cos(angle) * r - std::sin(angle) * rightNormal(r);
-        }
+        if (distanceAlong <= len) return pointAt(e, len > 0.0 ? distanceAlong / len : 0.0);
         distanceAlong -= len;
     }
     return path.elements.back().ep;

@@ -5,6 +5,7 @@
 
 #include "Measure.h"
 #include "Nesting.h"
+#include "SvgPage.h"
 #include "SvgSymbols.h"
 #include "Text.h"
 
@@ -12,29 +13,17 @@ namespace gmpath {
 
 namespace {
 
-constexpr double kPi = 3.14159265358979323846;
-
 /// Strokes of the passes; further passes start again at the first.
 constexpr std::array<const char*, 8> kPassColours = {"#d9480f", "#1c7ed6", "#2b8a3e", "#9c36b5",
                                                      "#e0a100", "#0c8599", "#c2255c", "#6741d9"};
 constexpr const char* kSourceColour = "#212529";
 
 /// Sizes as fractions of the picture's diagonal.
-constexpr double kMarginFraction = 0.03;
-constexpr double kLegendFraction = 0.014;
 constexpr double kSourceStrokeFraction = 0.0014;
 constexpr double kOffsetStrokeFraction = 0.0009;
 
 const char* passColour(std::size_t pass) {
     return kPassColours[pass % kPassColours.size()];
-}
-
-std::string flipped(Vec2 p) {
-    return formatReal(p.x) + " " + formatReal(-p.y);
-}
-
-std::string pathTag(const Path& path, const std::string& styleClass) {
-    return "<path class=\"" + styleClass + "\" d=\"" + svgPathData(path) + "\"/>\n";
 }
 
 Box boxOf(const OffsetDrawing& drawing) {
@@ -64,61 +53,34 @@ std::string senseName(const Path& path) {
 class SvgWriter {
 public:
     explicit SvgWriter(const OffsetDrawing& drawing)
-        : m_drawing(drawing),
-          m_depths(nestingDepths(drawing.contours)),
-          m_box(boxOf(drawing)),
-          m_diagonal(length(m_box.size())) {}
+        : m_drawing(drawing), m_depths(nestingDepths(drawing.contours)), m_page(boxOf(drawing)) {}
 
     std::string run() {
-        writeHead();
+        m_svg = m_page.head(styleRules());
         for (std::size_t i = 0; i < m_drawing.contours.size(); ++i)
             writeContour(i);
-        writeLegend();
-        return m_svg + "</svg>\n";
+        return m_svg + m_page.legend(legendEntries()) + "</svg>\n";
     }
 
 private:
-    double legendSize() const { return kLegendFraction * m_diagonal; }
-
-    void writeHead() {
-        const Box page = m_box.grown(kMarginFraction * m_diagonal);
-        const double legendHeight = 2.0 * legendSize();
-        const std::string width = formatReal(page.size().x);
-        const std::string height = formatReal(page.size().y + legendHeight);
-        const std::string corner = formatReal(page.low.x) + " " + formatReal(-page.high.y);
-        m_svg =
-            "<?xml version=\"1.0\" encoding=\"UTF-8\"?>\n"
-            "<svg xmlns=\"http://www.w3.org/2000/svg\" viewBox=\"" +
-            corner + " " + width + " " + height + "\">\n";
-        writeStyle();
-        m_svg += "<rect id=\"background\" x=\"" + formatReal(page.low.x) + "\" y=\"" +
-                 formatReal(-page.high.y) + "\" width=\"" + width + "\" height=\"" + height +
-                 "\" fill=\"#ffffff\"/>\n";
-    }
-
     /// Where strokes can keep their width they do; elsewhere it follows the size of the drawing.
-    void writeStyle() {
-        const std::string sourceWidth = formatReal(kSourceStrokeFraction * m_diagonal);
-        const std::string offsetWidth = formatReal(kOffsetStrokeFraction * m_diagonal);
-        m_svg +=
-            "<style>\n"
-            "path { fill: none; stroke-linejoin: round; stroke-linecap: round; }\n"
-            "text { font-family: sans-serif; }\n";
-        m_svg += std::string(".source { stroke: ") + kSourceColour +
-                 "; stroke-width: " + sourceWidth + "; }\n.offset { stroke-width: " + offsetWidth +
-                 "; }\n";
-        m_svg += std::string(".source-mark { fill: ") + kSourceColour + "; }\n";
+    std::string styleRules() const {
+        const std::string sourceWidth = formatReal(kSourceStrokeFraction * m_page.diagonal());
+        const std::string offsetWidth = formatReal(kOffsetStrokeFraction * m_page.diagonal());
+        std::string rules = std::string(".source { stroke: ") + kSourceColour +
+                            "; stroke-width: " + sourceWidth +
+                            "; }\n.offset { stroke-width: " + offsetWidth + "; }\n";
+        rules += std::string(".source-mark { fill: ") + kSourceColour + "; }\n";
         for (std::size_t pass = 0; pass < m_drawing.distances.size(); ++pass) {
             const std::string name = passClass(pass);
             const std::string colour = passColour(pass);
-            m_svg += "." + name + " { stroke: " + colour + "; }\n";
-            m_svg += "." + name + "-mark { fill: " + colour + "; }\n";
+            rules += "." + name + " { stroke: " + colour + "; }\n";
+            rules += "." + name + "-mark { fill: " + colour + "; }\n";
         }
-        m_svg +=
-            "@supports (vector-effect: non-scaling-stroke) {\n"
-            "path { vector-effect: non-scaling-stroke; }\n"
-            ".source { stroke-width: 1.8px; }\n.offset { stroke-width: 1.2px; }\n}\n"
-            "</style>\n";
+        return rules +
+               "@supports (vector-effect: non-scaling-stroke) {\n"
+               "path { vector-effect: non-scaling-stroke; }\n"
+               ".source { stroke-width: 1.8px; }\n.offset { stroke-width: 1.2px; }\n}\n";
     }
 
     static std::string passClass(std::size_t pass) { return "pass-" + std::to_string(pass + 1); }
@@ -129,68 +91,34 @@ private:
         m_svg += "<g id=\"contour-" + number + "\">\n<title>contour " + number + ", layer " +
                  xmlEscaped(printable(contour.layer)) + ", " + senseName(contour) + "</title>\n";
         for (const OffsetPath& offset : m_drawing.offsets[index].paths) {
-            m_svg += pathTag(offset.path, "offset " + passClass(offset.pass));
-            m_svg += startMark(offset.path, passClass(offset.pass) + "-mark", m_diagonal);
+            m_svg += svgPathTag(offset.path, "offset " + passClass(offset.pass));
+            m_svg += startMark(offset.path, passClass(offset.pass) + "-mark", m_page.diagonal());
         }
-        m_svg += pathTag(contour, "source");
-        m_svg += startMark(contour, "source-mark", m_diagonal);
-        m_svg += numberLabel(contour, number, isOutline(index), m_diagonal);
+        m_svg += svgPathTag(contour, "source");
+        m_svg += startMark(contour, "source-mark", m_page.diagonal());
+        m_svg += numberLabel(contour, number, isOutline(index), m_page.diagonal());
         m_svg += "</g>\n";
     }
 
     /// Numbers stand in the material: inside of outlines, outside of holes.
     bool isOutline(std::size_t index) const { return m_depths[index].value_or(0) % 2 == 0; }
 
-    /// A line of text under the picture: what each colour stands for. Ends where the page does.
-    void writeLegend() {
-        const double size = legendSize();
-        constexpr double kEntryWidth = 9.0;  // in text sizes
-        const double perLine = m_box.size().x / (kEntryWidth * size);
-        const std::size_t entries = m_drawing.distances.size() + 1;
-        m_svg += "<g id=\"legend\">\n";
-        for (std::size_t i = 0; i < entries && static_cast<double>(i) <= perLine; ++i) {
-            const Vec2 at{m_box.low.x + static_cast<double>(i) * kEntryWidth * size,
-                          m_box.low.y - kMarginFraction * m_diagonal - size};
-            writeLegendEntry(at, i);
+    std::vector<SvgLegendEntry> legendEntries() const {
+        std::vector<SvgLegendEntry> entries = {{"source", kSourceColour}};
+        for (std::size_t pass = 0; pass < m_drawing.distances.size(); ++pass) {
+            entries.push_back(
+                {"offset " + formatReal(m_drawing.distances[pass], 6), passColour(pass)});
         }
-        m_svg += "</g>\n";
-    }
-
-    void writeLegendEntry(Vec2 at, std::size_t entry) {
-        const bool source = entry == 0;
-        const std::size_t pass = source ? 0 : entry - 1;
-        const std::string text =
-            source ? "source" : "offset " + formatReal(m_drawing.distances[pass], 6);
-        const std::string colour = source ? kSourceColour : passColour(pass);
-        m_svg += textTag(at, legendSize(), "fill=\"" + colour + "\"", text);
+        return entries;
     }
 
     const OffsetDrawing& m_drawing;
     std::vector<std::optional<int>> m_depths;
-    Box m_box;
-    double m_diagonal;
+    SvgPage m_page;
     std::string m_svg;
 };
 
 }  // namespace
-
-std::string svgPathData(const Path& path) {
-    if (path.elements.empty()) return {};
-    std::string data = "M " + flipped(path.elements.front().sp);
-    for (const Element& e : path.elements) {
-        if (isArc(e)) {
-            const std::string r = formatReal(radius(e));
-            const bool large = std::abs(sweep(e)) > kPi;
-            // Turned downwards, a counter-clockwise arc runs against SVG's positive angles.
-            const bool positive = e.bulge < 0.0;
-            data += " A " + r + " " + r + " 0 " + (large ? "1" : "0") + (positive ? " 1 " : " 0 ");
-        } else {
-            data += " L ";
-        }
-        data += flipped(e.ep);
-    }
-    return path.closed ? data + " Z" : data;
-}
 
 std::string svgOf(const OffsetDrawing& drawing) {
     return SvgWriter(drawing).run();

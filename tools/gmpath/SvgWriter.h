@@ -11,7 +11,4 @@ namespace gmpath {
 /// however the picture is scaled. A dot marks the start of every contour, an arrow its direction.
 std::string svgOf(const OffsetDrawing& drawing);
 
-/// The course of a path as SVG path data, with y turned downwards as the picture needs it.
-std::string svgPathData(const Path& path);
-
 }  // namespace gmpath

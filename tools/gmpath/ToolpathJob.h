@@ -1,0 +1,48 @@
+#pragma once
+
+#include <functional>
+
+#include "Leads.h"
+#include "Toolpath.h"
+
+namespace gmpath {
+
+/// How the contours of a drawing are cut out.
+struct ToolpathRequest {
+    /// One a pass, from the farthest to the last, which leaves the part as it shall be; positive.
+    std::vector<double> distances;
+    PartSide part = PartSide::kRight;
+    LeadShape lead;
+    std::vector<double> levels;  ///< heights to cut at, going down, all below 0
+    double safeZ = 5.0;          ///< height that clears everything, positive
+};
+
+/// What became of the leads of a contour, approaches and departures alike.
+struct LeadTally {
+    std::size_t made = 0;  ///< the shortened ones included
+    std::size_t shortened = 0;
+    std::size_t dropped = 0;
+    double smallest = HUGE_VAL;  ///< least size of the shortened ones
+};
+
+/// What became of a contour.
+struct ContourCut {
+    bool accepted = true;     ///< false when the kernel refused the contour
+    bool fits = true;         ///< false when nothing is left for the last pass
+    bool keepsOthers = true;  ///< false when its cuts come too near to another contour
+    LeadTally leads;
+};
+
+struct ToolpathResult {
+    Toolpath moves;
+    std::vector<ContourCut> contours;  ///< one entry a contour
+};
+
+/// Cuts every contour on its waste side, open ones on both sides. Of the contours that may come
+/// next (`ToolpathOrder`) the one whose start is nearest is cut, in all its passes; a pass is cut
+/// run by run, the nearest first, and a run through all levels at once.
+ToolpathResult makeToolpath(
+    const std::vector<Path>& contours, const ToolpathRequest& request,
+    const std::function<void(std::size_t done, std::size_t total)>& progress);
+
+}  // namespace gmpath
