@@ -18,6 +18,13 @@ Vec2 turnedHalfSweep(Vec2 v, double bulge, double sign) {
     return {cosine * v.x - sine * v.y, sine * v.x + cosine * v.y};
 }
 
+/// v turned counter-clockwise by an angle in radians.
+Vec2 turned(Vec2 v, double angle) {
+    const double cosine = std::cos(angle);
+    const double sine = std::sin(angle);
+    return {cosine * v.x - sine * v.y, sine * v.x + cosine * v.y};
+}
+
 double distanceToSegment(const Element& e, Vec2 p) {
     const Vec2 d = e.ep - e.sp;
     const double lengthSquared = dot(d, d);
@@ -44,6 +51,19 @@ Vec2 centre(const Element& e) {
 
 Vec2 halvingPoint(const Element& e) {
     return middle(e.sp, e.ep) + 0.5 * e.bulge * rightNormal(e.ep - e.sp);
+}
+
+// The chord from the start turns half as far from the chord of the whole as the tangent does; its
+// length follows from the sines of both half sweeps. So a flat arc needs no far-off centre.
+Vec2 pointAt(const Element& e, double t) {
+    if (!isArc(e)) return e.sp + t * (e.ep - e.sp);
+    const double half = 0.5 * sweep(e);
+    const double share = std::sin(t * half) / std::sin(half);
+    return e.sp + share * turned(e.ep - e.sp, (t - 1.0) * half);
+}
+
+Vec2 tangentAt(const Element& e, double t) {
+    return unit(turned(e.ep - e.sp, (t - 0.5) * sweep(e)));
 }
 
 double length(const Element& e) {

@@ -24,6 +24,7 @@ constexpr double kMarginFraction = 0.03;
 constexpr double kLegendFraction = 0.014;
 constexpr double kSourceStrokeFraction = 0.0014;
 constexpr double kOffsetStrokeFraction = 0.0009;
+constexpr double kDashFraction = 0.004;
 
 const char* passColour(std::size_t pass) {
     return kPassColours[pass % kPassColours.size()];
@@ -31,6 +32,11 @@ const char* passColour(std::size_t pass) {
 
 std::string flipped(Vec2 p) {
     return formatReal(p.x) + " " + formatReal(-p.y);
+}
+
+bool hasDoubtful(const OffsetDrawing& drawing) {
+    return std::any_of(drawing.offsets.begin(), drawing.offsets.end(),
+                       [](const ContourOffsets& offsets) { return !offsets.faults.empty(); });
 }
 
 std::string pathTag(const Path& path, const std::string& styleClass) {
@@ -107,6 +113,8 @@ private:
         m_svg += std::string(".source { stroke: ") + kSourceColour +
                  "; stroke-width: " + sourceWidth + "; }\n.offset { stroke-width: " + offsetWidth +
                  "; }\n";
+        m_svg +=
+            ".doubtful { stroke-dasharray: " + formatReal(kDashFraction * m_diagonal) + "; }\n";
         m_svg += std::string(".source-mark { fill: ") + kSourceColour + "; }\n";
         for (std::size_t pass = 0; pass < m_drawing.distances.size(); ++pass) {
             const std::string name = passClass(pass);
@@ -117,7 +125,8 @@ private:
         m_svg +=
             "@supports (vector-effect: non-scaling-stroke) {\n"
             "path { vector-effect: non-scaling-stroke; }\n"
-            ".source { stroke-width: 1.8px; }\n.offset { stroke-width: 1.2px; }\n}\n"
+            ".source { stroke-width: 1.8px; }\n.offset { stroke-width: 1.2px; }\n"
+            ".doubtful { stroke-dasharray: 5px; }\n}\n"
             "</style>\n";
     }
 
@@ -129,7 +138,8 @@ private:
         m_svg += "<g id=\"contour-" + number + "\">\n<title>contour " + number + ", layer " +
                  xmlEscaped(printable(contour.layer)) + ", " + senseName(contour) + "</title>\n";
         for (const OffsetPath& offset : m_drawing.offsets[index].paths) {
-            m_svg += pathTag(offset.path, "offset " + passClass(offset.pass));
+            const std::string style = "offset " + passClass(offset.pass);
+            m_svg += pathTag(offset.path, offset.doubtful ? style + " doubtful" : style);
             m_svg += startMark(offset.path, passClass(offset.pass) + "-mark", m_diagonal);
         }
         m_svg += pathTag(contour, "source");
@@ -141,28 +151,33 @@ private:
     /// Numbers stand in the material: inside of outlines, outside of holes.
     bool isOutline(std::size_t index) const { return m_depths[index].value_or(0) % 2 == 0; }
 
+    struct LegendEntry {
+        std::string colour;
+        std::string text;
+    };
+
+    std::vector<LegendEntry> legendEntries() const {
+        std::vector<LegendEntry> entries = {{kSourceColour, "source"}};
+        if (hasDoubtful(m_drawing)) entries.push_back({kSourceColour, "dashed: faulty"});
+        for (std::size_t pass = 0; pass < m_drawing.distances.size(); ++pass) {
+            entries.push_back(
+                {passColour(pass), "offset " + formatReal(m_drawing.distances[pass], 6)});
+        }
+        return entries;
+    }
+
     /// A line of text under the picture: what each colour stands for. Ends where the page does.
     void writeLegend() {
         const double size = legendSize();
         constexpr double kEntryWidth = 9.0;  // in text sizes
-        const double perLine = m_box.size().x / (kEntryWidth * size);
-        const std::size_t entries = m_drawing.distances.size() + 1;
+        Vec2 at{m_box.low.x, m_box.low.y - kMarginFraction * m_diagonal - size};
         m_svg += "<g id=\"legend\">\n";
-        for (std::size_t i = 0; i < entries && static_cast<double>(i) <= perLine; ++i) {
-            const Vec2 at{m_box.low.x + static_cast<double>(i) * kEntryWidth * size,
-                          m_box.low.y - kMarginFraction * m_diagonal - size};
-            writeLegendEntry(at, i);
+        for (const LegendEntry& entry : legendEntries()) {
+            m_svg += textTag(at, size, "fill=\"" + entry.colour + "\"", entry.text);
+            at.x += kEntryWidth * size;
+            if (!(at.x <= m_box.high.x)) break;
         }
         m_svg += "</g>\n";
-    }
-
-    void writeLegendEntry(Vec2 at, std::size_t entry) {
-        const bool source = entry == 0;
-        const std::size_t pass = source ? 0 : entry - 1;
-        const std::string text =
-            source ? "source" : "offset " + formatReal(m_drawing.distances[pass], 6);
-        const std::string colour = source ? kSourceColour : passColour(pass);
-        m_svg += textTag(at, legendSize(), "fill=\"" + colour + "\"", text);
     }
 
     const OffsetDrawing& m_drawing;
