@@ -2,7 +2,7 @@
 
 #include <gtest/gtest.h>
 
-#include "KernelBridge.h"
+#include "CheckedOffset.h"
 #include "Measure.h"
 #include "PathShapes.h"
 
@@ -74,7 +74,7 @@ TEST(KernelBridge, OffsetsKeepTheirDistance) {
 TEST(KernelBridge, TinyElementsDoNotTearTheResult) {
     // A hook of 4e-4 against the direction of travel, as rounding in a drawing leaves it.
     const Path hooked = polygon({{0, 0}, {10, 0}, {10, 10}, {5, 11}, {5.0004, 11}, {0, 10}});
-    const KernelOffset offset = offsetByKernel(hooked, 1.0);
+    const KernelOffset offset = offsetChecked(hooked, 1.0).offset;
     ASSERT_EQ(offset.results.size(), 1U);
     EXPECT_TRUE(offset.results[0].closed);
     EXPECT_LT(deviation(offset.results[0], hooked, 1.0), 1e-3);

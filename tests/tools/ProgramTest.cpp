@@ -8,6 +8,7 @@
 #include <utility>
 #include <vector>
 
+#include "DrawingText.h"
 #include "Scratch.h"
 
 namespace {
@@ -83,6 +84,22 @@ TEST_F(Program, ToolpathWritesProgramAndPicture) {
     for (const std::string part : {"source", "cut", "lead", "rapid"}) {
         EXPECT_NE(m_scratch.content("a.svg").find("<path class=\"" + part), std::string::npos);
     }
+}
+
+TEST_F(Program, FaultyOffsetsAreNamedAndDashed) {
+    // A polygon that crosses itself has no closed offset.
+    const std::vector<gmpath::Element> crossing = {
+        {{0, 0}, {}}, {{20, 12}, {}}, {{20, 0}, {}}, {{0, 10}, {}}};
+    m_scratch.store("a.dxf", drawing_text::drawing(drawing_text::lightPolyline(crossing, true)));
+    const Outcome offset = run("offset a.dxf --distance 1 --side left -o a.svg -o b.dxf");
+    EXPECT_EQ(offset.exitCode, 1);
+    EXPECT_EQ(offset.err, "gmpath: a.dxf: contour 1: the offset by 1 to the left is not closed\n");
+    EXPECT_EQ(m_scratch.files(), 3U);
+    const std::string svg = m_scratch.content("a.svg");
+    EXPECT_NE(svg.find("class=\"offset pass-1 doubtful\""), std::string::npos);
+    EXPECT_NE(svg.find("dashed: faulty"), std::string::npos);
+    run("offset a.dxf --distance 0 -o a.svg");
+    EXPECT_EQ(m_scratch.content("a.svg").find("dashed: faulty"), std::string::npos);
 }
 
 TEST_F(Program, BadInputIsOneLineAndExitCodeTwo) {

@@ -38,7 +38,7 @@ struct Sample {
 
     Sample() {
         for (const Path& path : contours)
-            offsets.push_back({{{0, path}, {1, path}}, {}, true});
+            offsets.push_back({{{0, path}, {1, path}}, {}, {}, true});
     }
     OffsetDrawing drawing() const { return {contours, offsets, distances}; }
 };

@@ -19,8 +19,10 @@ struct OrderedContour {
 
 std::size_t dropShort(std::vector<Path>& paths) {
     std::size_t dropped = 0;
-    for (Path& path : paths)
-        dropped += dropShortElements(path, kKernelTolerance);
+    for (Path& path : paths) {
+        const std::size_t before = path.elements.size();
+        dropped += before - dropShortElements(path, kKernelTolerance).size();
+    }
     const auto empty = [](const Path& path) { return path.elements.empty(); };
     paths.erase(std::remove_if(paths.begin(), paths.end(), empty), paths.end());
     return dropped;

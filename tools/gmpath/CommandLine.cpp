@@ -11,6 +11,7 @@ namespace gmpath {
 
 namespace {
 
+constexpr int kFaultyOffsets = 1;
 constexpr int kBadInput = 2;
 
 const std::map<std::string, Side>& sideNames() {
@@ -96,8 +97,8 @@ int runCommandLine(int argc, const char* const* argv, const Console& console) {
         program.parse(argc, argv);
         if (offset->count("--step") == 0) offsetOptions.step = offsetOptions.distance;
         if (info->parsed()) runInfo(infoOptions, console);
-        if (offset->parsed()) runOffset(offsetOptions, console);
         if (toolpath->parsed()) runToolpath(toolpathOptions, console);
+        if (offset->parsed() && !runOffset(offsetOptions, console)) return kFaultyOffsets;
     } catch (const CLI::ParseError& error) {
         return finishParsing(program, error, console);
     } catch (const InputError& error) {

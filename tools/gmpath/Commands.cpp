@@ -1,5 +1,6 @@
 #include "Commands.h"
 
+#include <algorithm>
 #include <cmath>
 
 #include "InfoTable.h"
@@ -34,23 +35,35 @@ std::vector<double> distancesOf(const OffsetOptions& options) {
     return distances;
 }
 
-std::size_t reportContours(const OffsetOptions& options, const std::vector<double>& distances,
-                           const std::vector<ContourOffsets>& offsets, const Console& console) {
+std::string faultLine(const FaultyOffset& faulty) {
+    const std::string side = faulty.distance > 0.0 ? "right" : "left";
+    return "the offset by " + formatReal(std::abs(faulty.distance), kDistanceDigits) + " to the " +
+           side + " " + std::string(faultText(faulty.fault));
+}
+
+void reportContour(const std::string& contour, const std::vector<double>& distances,
+                   const ContourOffsets& offsets, const Console& console) {
+    if (!offsets.accepted) {
+        console.err << contour << ": the kernel cannot take it over\n";
+        return;
+    }
+    for (const FaultyOffset& faulty : offsets.faults)
+        console.err << contour << ": " << faultLine(faulty) << "\n";
+    for (const std::size_t pass : offsets.emptyPasses) {
+        console.err << contour << ": nothing left at distance "
+                    << formatReal(distances[pass], kDistanceDigits) << "\n";
+    }
+}
+
+void reportContours(const OffsetOptions& options, const std::vector<double>& distances,
+                    const std::vector<ContourOffsets>& offsets, const Console& console) {
     std::size_t paths = 0;
     for (std::size_t i = 0; i < offsets.size(); ++i) {
-        const std::string contour =
-            "gmpath: " + options.input.drawing + ": contour " + std::to_string(i + 1);
+        reportContour("gmpath: " + options.input.drawing + ": contour " + std::to_string(i + 1),
+                      distances, offsets[i], console);
         paths += offsets[i].paths.size();
-        if (!offsets[i].accepted) {
-            console.err << contour << ": the kernel cannot take it over\n";
-            continue;
-        }
-        for (const std::size_t pass : offsets[i].emptyPasses) {
-            console.err << contour << ": nothing left at distance "
-                        << formatReal(distances[pass], kDistanceDigits) << "\n";
-        }
     }
-    return paths;
+    console.out << counted(offsets.size(), "contour") << ", " << counted(paths, "offset") << "\n";
 }
 
 }  // namespace
@@ -76,7 +89,7 @@ void runInfo(const InputOptions& options, const Console& console) {
     console.out << infoTable(readInput(options, console));
 }
 
-void runOffset(const OffsetOptions& options, const Console& console) {
+bool runOffset(const OffsetOptions& options, const Console& console) {
     const std::vector<double> distances = distancesOf(options);
     checkOutputs(options.outputs, options.input.drawing);
     const Part part = readInput(options.input, console);
@@ -86,9 +99,9 @@ void runOffset(const OffsetOptions& options, const Console& console) {
                        [&](std::size_t done, std::size_t total) { progress.show(done, total); });
     writeOutputs({part.contours, offsets, distances}, options.outputs);
     progress.clear();
-    const std::size_t paths = reportContours(options, distances, offsets, console);
-    console.out << counted(part.contours.size(), "contour") << ", " << counted(paths, "offset")
-                << "\n";
+    reportContours(options, distances, offsets, console);
+    return std::all_of(offsets.begin(), offsets.end(),
+                       [](const ContourOffsets& of) { return of.accepted && of.faults.empty(); });
 }
 
 }  // namespace gmpath

@@ -44,6 +44,8 @@ void runInfo(const InputOptions& options, const Console& console);
 
 /// Offsets every contour and writes the outputs; contours that yield nothing are reported. Throws
 /// InputError for input, distances and outputs that cannot be used; then no output is written.
-void runOffset(const OffsetOptions& options, const Console& console);
+/// False when some offset has a fault or could not be made; it is reported, the outputs are
+/// written, and its results are dashed in pictures.
+bool runOffset(const OffsetOptions& options, const Console& console);
 
 }  // namespace gmpath

@@ -61,6 +61,10 @@ Vec2 pointAt(const Element& e, double t) {
     return e.sp + share * turned(e.ep - e.sp, (t - 1.0) * half);
 }
 
+Vec2 tangentAt(const Element& e, double t) {
+    return unit(turned(e.ep - e.sp, (t - 0.5) * sweep(e)));
+}
+
 double length(const Element& e) {
     return isArc(e) ? radius(e) * std::abs(sweep(e)) : distance(e.sp, e.ep);
 }

@@ -38,6 +38,10 @@ Vec2 halvingPoint(const Element& e);
 /// Point at the fraction t, 0..1, of the length.
 Vec2 pointAt(const Element& e, double t);
 
+/// Unit direction of travel at the fraction t, 0..1, of the length; zero for an element without
+/// extent.
+Vec2 tangentAt(const Element& e, double t);
+
 /// Length along the element.
 double length(const Element& e);
 

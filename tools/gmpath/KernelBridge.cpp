@@ -1,7 +1,7 @@
 #include "KernelBridge.h"
 
-#include <algorithm>
 #include <memory>
+#include <numeric>
 
 #include "ShortElements.h"
 #include "gmkernel/GmArc.h"
@@ -16,17 +16,6 @@ constexpr double kPi = 3.14159265358979323846;
 
 /// Every element of the source stays in view, whatever its length.
 constexpr int kWholeContour = 1'000'000;
-
-/// Elements below this length are passed over at first, and when the first result is torn.
-constexpr double kShortestAtFirst = 3.0 * kKernelTolerance;
-constexpr double kShortestOfTorn = 10.0 * kKernelTolerance;
-
-/// The path without its shortest elements; a path that small altogether stays as it is.
-Path simplified(const Path& path, double shortest) {
-    Path result = path;
-    dropShortElements(result, shortest);
-    return result.elements.empty() ? path : result;
-}
 
 GmPoint kernelPoint(Vec2 p) {
     return {p.x, p.y};
@@ -44,10 +33,12 @@ std::unique_ptr<GmCurve> kernelCurve(const Element& e) {
     return std::make_unique<GmArc>(sp, ep, kernelPoint(centre(e)), rot);
 }
 
-bool fill(GmContour& contour, const Path& path) {
-    for (const Element& e : path.elements) {
-        const std::unique_ptr<GmCurve> curve = kernelCurve(e);
-        const long id = contour.ElementCount();
+/// The contour of a path, each element with its number as the identifier; false when it cannot be
+/// built.
+bool fill(GmContour& contour, const Path& path, const std::vector<std::size_t>& numbers) {
+    for (std::size_t i = 0; i < path.elements.size(); ++i) {
+        const std::unique_ptr<GmCurve> curve = kernelCurve(path.elements[i]);
+        const auto id = static_cast<long>(numbers[i]);
         if (!curve->CreationOK() || !contour.AddElement(curve.get(), false, id)) return false;
     }
     return contour.IsClosed() == path.closed;
@@ -72,50 +63,45 @@ void appendKernelArc(std::vector<Element>& elements, const GmArc& arc) {
     elements.back() = withEnds(elements.back(), elements.back().sp, fromKernel(arc.EP()));
 }
 
-Path pathFrom(const GmContour& contour, const std::string& layer) {
+void appendResult(KernelOffset& offset, const GmContour& contour, const std::string& layer) {
     Path path{{}, contour.IsClosed(), layer};
+    std::vector<std::size_t> origins;
     for (int i = 0; i < contour.ElementCount(); ++i) {
-        const GmCurve* curve = contour.GetElement(i);
-        if (curve->IsArc()) {
-            appendKernelArc(path.elements, static_cast<const GmArc&>(*curve));
+        const GmContElement& element = *contour.GetContElement(i);
+        const auto origin = static_cast<std::size_t>(element.lId);
+        const GmCurve& curve = *element.pCurve;
+        if (curve.IsArc()) {
+            appendKernelArc(path.elements, static_cast<const GmArc&>(curve));
         } else {
-            path.elements.push_back({fromKernel(curve->SP()), fromKernel(curve->EP())});
+            path.elements.push_back({fromKernel(curve.SP()), fromKernel(curve.EP())});
         }
+        origins.resize(path.elements.size(), origin);
     }
     meetEnds(path);
-    return path;
-}
-
-KernelOffset offsetAsGiven(const Path& path, double d) {
-    GmContour contour;
-    if (!fill(contour, path)) return {{}, false};
-    const bool keepOpen = !path.closed;
-    contour.Offsetting(d, kWholeContour, keepOpen);
-    KernelOffset offset;
-    for (int i = 0; const GmContour* result = contour.GetSubContour(i); ++i) {
-        if (result->ElementCount() == 0) continue;
-        offset.results.push_back(pathFrom(*result, path.layer));
-    }
-    return offset;
-}
-
-/// True when closed results, at least one, came out.
-bool isWhole(const KernelOffset& offset) {
-    const auto isClosed = [](const Path& path) { return path.closed; };
-    return !offset.results.empty() &&
-           std::all_of(offset.results.begin(), offset.results.end(), isClosed);
+    offset.results.push_back(std::move(path));
+    offset.origins.push_back(std::move(origins));
 }
 
 }  // namespace
 
-KernelOffset offsetByKernel(const Path& path, double d) {
-    const Path first = simplified(path, kShortestAtFirst);
-    KernelOffset offset = offsetAsGiven(first, d);
-    if (!path.closed || isWhole(offset)) return offset;
-    const Path second = simplified(path, kShortestOfTorn);
-    if (second.elements.size() == first.elements.size()) return offset;
-    KernelOffset again = offsetAsGiven(second, d);
-    return isWhole(again) ? again : offset;
+KernelOffset offsetByKernel(const Path& path, double d, double shortest) {
+    Path simplified = path;
+    std::vector<std::size_t> numbers = dropShortElements(simplified, shortest);
+    if (simplified.elements.empty()) {
+        simplified = path;
+        numbers.resize(path.elements.size());
+        std::iota(numbers.begin(), numbers.end(), std::size_t{0});
+    }
+    GmContour contour;
+    KernelOffset offset;
+    offset.accepted = fill(contour, simplified, numbers);
+    if (!offset.accepted) return offset;
+    const bool keepOpen = !path.closed;
+    contour.Offsetting(d, kWholeContour, keepOpen);
+    for (int i = 0; const GmContour* result = contour.GetSubContour(i); ++i) {
+        if (result->ElementCount() > 0) appendResult(offset, *result, path.layer);
+    }
+    return offset;
 }
 
 }  // namespace gmpath

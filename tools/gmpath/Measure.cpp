@@ -81,13 +81,18 @@ Box Box::grown(double margin) const {
     return isEmpty() ? *this : Box{low - by, high + by};
 }
 
+Box boundingBox(const Element& e) {
+    Box box;
+    box.include(e.sp);
+    box.include(e.ep);
+    if (isArc(e)) includeArcExtremes(box, e);
+    return box;
+}
+
 Box boundingBox(const Path& path) {
     Box box;
-    for (const Element& e : path.elements) {
-        box.include(e.sp);
-        box.include(e.ep);
-        if (isArc(e)) includeArcExtremes(box, e);
-    }
+    for (const Element& e : path.elements)
+        box.include(boundingBox(e));
     return box;
 }
 

@@ -20,6 +20,7 @@ struct Box {
 };
 
 /// Exact bounding box, arcs included up to their extreme points.
+Box boundingBox(const Element& e);
 Box boundingBox(const Path& path);
 
 /// Area enclosed by a closed path, exact for arcs: positive when it runs counter-clockwise. Regions

@@ -1,6 +1,6 @@
 #include "OffsetJob.h"
 
-#include "KernelBridge.h"
+#include "CheckedOffset.h"
 #include "Measure.h"
 #include "Nesting.h"
 
@@ -18,19 +18,26 @@ bool goesOutside(Side side, int depth) {
     return side == Side::kOutside || (side == Side::kWaste && depth % 2 == 0);
 }
 
+void addOffset(ContourOffsets& offsets, std::size_t pass, const Path& contour, double d) {
+    CheckedOffset found = offsetChecked(contour, d);
+    const bool doubtful = found.fault != OffsetFault::kNone;
+    offsets.accepted = offsets.accepted && found.offset.accepted;
+    if (doubtful) offsets.faults.push_back({d, found.fault});
+    for (Path& path : found.offset.results)
+        offsets.paths.push_back({pass, std::move(path), doubtful});
+}
+
 ContourOffsets offsetContour(const Path& contour, int depth, const OffsetRequest& request,
                              const std::function<void()>& passDone) {
     ContourOffsets offsets;
     for (std::size_t pass = 0; pass < request.distances.size(); ++pass) {
-        const std::size_t before = offsets.paths.size();
+        const std::size_t before = offsets.paths.size() + offsets.faults.size();
         const double distance = request.distances[pass];
         for (const double d : signedDistances(contour, depth, request.side, distance)) {
-            KernelOffset found = offsetByKernel(contour, d);
-            offsets.accepted = offsets.accepted && found.accepted;
-            for (Path& path : found.results)
-                offsets.paths.push_back({pass, std::move(path)});
+            addOffset(offsets, pass, contour, d);
         }
-        if (offsets.paths.size() == before) offsets.emptyPasses.push_back(pass);
+        const bool empty = offsets.paths.size() + offsets.faults.size() == before;
+        if (empty) offsets.emptyPasses.push_back(pass);
         passDone();
     }
     return offsets;

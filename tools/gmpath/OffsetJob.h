@@ -4,6 +4,7 @@
 #include <string_view>
 #include <vector>
 
+#include "OffsetCheck.h"
 #include "Path.h"
 
 namespace gmpath {
@@ -29,12 +30,20 @@ struct OffsetRequest {
 struct OffsetPath {
     std::size_t pass;  ///< index of the distance
     Path path;
+    bool doubtful = false;  ///< one of the results of an offset with a fault
+};
+
+/// An offset that does not stand the check against its source.
+struct FaultyOffset {
+    double distance;  ///< signed, positive to the right of the direction of travel
+    OffsetFault fault;
 };
 
 /// What became of one source contour.
 struct ContourOffsets {
     std::vector<OffsetPath> paths;         ///< by pass
-    std::vector<std::size_t> emptyPasses;  ///< passes that yielded nothing
+    std::vector<std::size_t> emptyPasses;  ///< passes that yielded nothing, and rightly so
+    std::vector<FaultyOffset> faults;      ///< by pass
     bool accepted = true;                  ///< false when the kernel refused the contour
 };
 
@@ -46,7 +55,8 @@ using ProgressCall = std::function<void(std::size_t done, std::size_t total)>;
 /// is asked for. `depth` is the nesting depth, even for outlines.
 std::vector<double> signedDistances(const Path& contour, int depth, Side side, double distance);
 
-/// Offsets every contour in every pass; the result has one entry a contour, in order.
+/// Offsets every contour in every pass and checks the offsets (offsetChecked); the result has one
+/// entry a contour, in order.
 std::vector<ContourOffsets> offsetContours(const std::vector<Path>& contours,
                                            const OffsetRequest& request,
                                            const ProgressCall& progress);

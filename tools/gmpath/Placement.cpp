@@ -27,6 +27,14 @@ Placement Placement::scaling(double factor) {
     return placement;
 }
 
+Placement Placement::turning(double angle, Vec2 about) {
+    Placement placement;
+    placement.m_xAxis = {std::cos(angle), std::sin(angle)};
+    placement.m_yAxis = {-placement.m_xAxis.y, placement.m_xAxis.x};
+    placement.m_origin = about - placement.apply(about);
+    return placement;
+}
+
 std::optional<Placement> Placement::ofReference(const BlockReference& reference, Vec2 base,
                                                 int column, int row) {
     const std::optional<Vec2> scale = uniform(reference.scale);

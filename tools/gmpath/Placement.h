@@ -16,6 +16,9 @@ public:
     /// Scales about the origin by a factor, finite and not 0.
     static Placement scaling(double factor);
 
+    /// Turns counter-clockwise about a point by an angle in radians.
+    static Placement turning(double angle, Vec2 about);
+
     /// Where a block with the given base point comes to lie by one cell of a reference, column and
     /// row counted from 0. Nothing when the scale is not uniform or 0, so that no similarity
     /// exists.

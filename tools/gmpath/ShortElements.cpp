@@ -10,21 +10,27 @@ bool isShort(const Element& e, double shortest) {
 
 }  // namespace
 
-std::size_t dropShortElements(Path& path, double shortest) {
-    if (path.elements.empty()) return 0;
+std::vector<std::size_t> dropShortElements(Path& path, double shortest) {
+    if (path.elements.empty()) return {};
+    std::vector<std::size_t> stay;
     std::vector<Element> kept;
     Vec2 sp = path.elements.front().sp;
-    for (const Element& e : path.elements) {
+    for (std::size_t i = 0; i < path.elements.size(); ++i) {
+        const Element& e = path.elements[i];
         const Element moved = straightened(withEnds(e, sp, e.ep));
         if (isShort(moved, shortest)) continue;
         kept.push_back(moved);
+        stay.push_back(i);
         sp = moved.ep;
     }
-    const std::size_t dropped = path.elements.size() - kept.size();
-    if (path.closed && kept.size() == 1 && !isArc(kept.front())) kept.clear();
+    const bool dropped = kept.size() < path.elements.size();
+    if (path.closed && kept.size() == 1 && !isArc(kept.front())) {
+        kept.clear();
+        stay.clear();
+    }
     path.elements = std::move(kept);
-    if (dropped > 0 && path.closed) meetEnds(path);
-    return dropped;
+    if (dropped && path.closed) meetEnds(path);
+    return stay;
 }
 
 }  // namespace gmpath

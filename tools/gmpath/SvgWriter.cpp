@@ -21,9 +21,15 @@ constexpr const char* kSourceColour = "#212529";
 /// Sizes as fractions of the picture's diagonal.
 constexpr double kSourceStrokeFraction = 0.0014;
 constexpr double kOffsetStrokeFraction = 0.0009;
+constexpr double kDashFraction = 0.004;
 
 const char* passColour(std::size_t pass) {
     return kPassColours[pass % kPassColours.size()];
+}
+
+bool hasDoubtful(const OffsetDrawing& drawing) {
+    return std::any_of(drawing.offsets.begin(), drawing.offsets.end(),
+                       [](const ContourOffsets& offsets) { return !offsets.faults.empty(); });
 }
 
 Box boxOf(const OffsetDrawing& drawing) {
@@ -67,9 +73,11 @@ private:
     std::string styleRules() const {
         const std::string sourceWidth = formatReal(kSourceStrokeFraction * m_page.diagonal());
         const std::string offsetWidth = formatReal(kOffsetStrokeFraction * m_page.diagonal());
+        const std::string dash = formatReal(kDashFraction * m_page.diagonal());
         std::string rules = std::string(".source { stroke: ") + kSourceColour +
                             "; stroke-width: " + sourceWidth +
-                            "; }\n.offset { stroke-width: " + offsetWidth + "; }\n";
+                            "; }\n.offset { stroke-width: " + offsetWidth +
+                            "; }\n.doubtful { stroke-dasharray: " + dash + "; }\n";
         rules += std::string(".source-mark { fill: ") + kSourceColour + "; }\n";
         for (std::size_t pass = 0; pass < m_drawing.distances.size(); ++pass) {
             const std::string name = passClass(pass);
@@ -80,7 +88,8 @@ private:
         return rules +
                "@supports (vector-effect: non-scaling-stroke) {\n"
                "path { vector-effect: non-scaling-stroke; }\n"
-               ".source { stroke-width: 1.8px; }\n.offset { stroke-width: 1.2px; }\n}\n";
+               ".source { stroke-width: 1.8px; }\n.offset { stroke-width: 1.2px; }\n"
+               ".doubtful { stroke-dasharray: 5px; }\n}\n";
     }
 
     static std::string passClass(std::size_t pass) { return "pass-" + std::to_string(pass + 1); }
@@ -91,7 +100,8 @@ private:
         m_svg += "<g id=\"contour-" + number + "\">\n<title>contour " + number + ", layer " +
                  xmlEscaped(printable(contour.layer)) + ", " + senseName(contour) + "</title>\n";
         for (const OffsetPath& offset : m_drawing.offsets[index].paths) {
-            m_svg += svgPathTag(offset.path, "offset " + passClass(offset.pass));
+            const std::string style = "offset " + passClass(offset.pass);
+            m_svg += svgPathTag(offset.path, offset.doubtful ? style + " doubtful" : style);
             m_svg += startMark(offset.path, passClass(offset.pass) + "-mark", m_page.diagonal());
         }
         m_svg += svgPathTag(contour, "source");
@@ -105,6 +115,7 @@ private:
 
     std::vector<SvgLegendEntry> legendEntries() const {
         std::vector<SvgLegendEntry> entries = {{"source", kSourceColour}};
+        if (hasDoubtful(m_drawing)) entries.push_back({"dashed: faulty", kSourceColour});
         for (std::size_t pass = 0; pass < m_drawing.distances.size(); ++pass) {
             entries.push_back(
                 {"offset " + formatReal(m_drawing.distances[pass], 6), passColour(pass)});
