@@ -96,7 +96,7 @@ TEST_F(Program, FaultyOffsetsAreNamedAndDashed) {
     EXPECT_EQ(offset.err, "gmpath: a.dxf: contour 1: the offset by 1 to the left is not closed\n");
     EXPECT_EQ(m_scratch.files(), 3U);
     const std::string svg = m_scratch.content("a.svg");
-    EXPECT_NE(svg.find("class=\"offset pass-1 doubtful\""), std::string::npos);
+    EXPECT_NE(svg.find("class=\"result pass-1 doubtful\""), std::string::npos);
     EXPECT_NE(svg.find("dashed: faulty"), std::string::npos);
     run("offset a.dxf --distance 0 -o a.svg");
     EXPECT_EQ(m_scratch.content("a.svg").find("dashed: faulty"), std::string::npos);

@@ -33,14 +33,13 @@ std::vector<Path> someContours() {
 /// Every contour with itself as the result of two passes.
 struct Sample {
     std::vector<Path> contours = someContours();
-    std::vector<double> distances = {1.5, 2.5};
-    std::vector<ContourOffsets> offsets;
-
-    Sample() {
+    ResultDrawing drawing() const {
+        ResultDrawing drawing{
+            contours, {}, {{"offset 1.5", "OFFSET_1"}, {"offset 2.5", "OFFSET_2"}}};
         for (const Path& path : contours)
-            offsets.push_back({{{0, path}, {1, path}}, {}, {}, true});
+            drawing.results.push_back({{0, path}, {1, path}});
+        return drawing;
     }
-    OffsetDrawing drawing() const { return {contours, offsets, distances}; }
 };
 
 /// End points of the commands of SVG path data, in the drawing's own y direction.

@@ -76,7 +76,7 @@ double firstStep(const Path& path, double d) {
     return std::copysign(kPart * std::min({std::abs(d), size.x, size.y}), d);
 }
 
-/// Offsets every result of the first step by the rest of the distance.
+/// Offsets every result of the first step by the rest of the distance. No start is searched.
 KernelOffset offsetInSteps(const Path& path, double d, const Attempt& attempt) {
     const double first = firstStep(path, d);
     const KernelOffset between = offsetByKernel(path, first, attempt.shortest);
@@ -119,6 +119,7 @@ KernelOffset offsetAs(const Attempt& attempt, const Path& source, double d) {
     const Placement back = Placement::turning(-attempt.angle, about);
     for (Path& path : offset.results)
         path = back.apply(path);
+    if (offset.start) offset.start = back.apply(*offset.start);
     for (std::vector<std::size_t>& origins : offset.origins) {
         for (std::size_t& origin : origins)
             origin = (origin + start) % source.elements.size();
@@ -136,6 +137,7 @@ void closeGap(Path& path, double closable) {
 /// The closed results, among them those that all but close.
 KernelOffset closedOnes(const KernelOffset& offset, double closable) {
     KernelOffset closed;
+    closed.start = offset.start;
     for (std::size_t i = 0; i < offset.results.size(); ++i) {
         Path path = offset.results[i];
         closeGap(path, closable);

@@ -1,9 +1,12 @@
 #include "CommandLine.h"
 
 #include <CLI/CLI.hpp>
+#include <functional>
 #include <map>
+#include <vector>
 
 #include "InputError.h"
+#include "ShapeCommandLine.h"
 #include "Text.h"
 #include "ToolpathCommandLine.h"
 
@@ -11,7 +14,7 @@ namespace gmpath {
 
 namespace {
 
-constexpr int kFaultyOffsets = 1;
+constexpr int kFaultyResult = 1;
 constexpr int kBadInput = 2;
 
 const std::map<std::string, Side>& sideNames() {
@@ -62,6 +65,51 @@ CLI::App* addOffset(CLI::App& program, OffsetOptions& options) {
     return offset;
 }
 
+/// The options of every subcommand; one of them is used.
+struct Options {
+    InputOptions info;
+    OffsetOptions offset;
+    CornersOptions corners;
+    MeltOptions melt;
+    ToolpathOptions toolpath;
+};
+
+/// A subcommand, and what it does: false when a result has a fault.
+struct Command {
+    const CLI::App* app;
+    std::function<bool(const Console&)> run;
+};
+
+bool runOffsetCommand(const CLI::App& app, OffsetOptions options, const Console& console) {
+    if (app.count("--step") == 0) options.step = options.distance;
+    return runOffset(options, console);
+}
+
+std::vector<Command> addCommands(CLI::App& program, Options& options) {
+    const CLI::App* info = addInfo(program, options.info);
+    const CLI::App* offset = addOffset(program, options.offset);
+    CLI::App* corners = addCorners(program, options.corners);
+    addInputOptions(*corners, options.corners.input);
+    CLI::App* melt = addMelt(program, options.melt);
+    addInputOptions(*melt, options.melt.first);
+    melt->add_option("SECOND", options.melt.second, "the other drawing")->required();
+    CLI::App* toolpath = addToolpath(program, options.toolpath);
+    addInputOptions(*toolpath, options.toolpath.input);
+    const auto runInfoCommand = [&](const Console& console) {
+        runInfo(options.info, console);
+        return true;
+    };
+    return {
+        {info, runInfoCommand},
+        {offset,
+         [=, &options](const Console& console) {
+             return runOffsetCommand(*offset, options.offset, console);
+         }},
+        {corners, [&](const Console& console) { return runCorners(options.corners, console); }},
+        {melt, [&](const Console& console) { return runMelt(options.melt, console); }},
+        {toolpath, [&](const Console& console) { return runToolpath(options.toolpath, console); }}};
+}
+
 int fail(const Console& console, const std::string& cause) {
     console.err << "gmpath: " << printable(cause) << "\n";
     return kBadInput;
@@ -82,23 +130,17 @@ int finishParsing(const CLI::App& program, const CLI::ParseError& error, const C
 }  // namespace
 
 int runCommandLine(int argc, const char* const* argv, const Console& console) {
-    CLI::App program("Offset contours from part drawings.", "gmpath");
+    CLI::App program("Offsets, corners and tool paths from part drawings.", "gmpath");
     program.set_version_flag("--version", std::string("gmpath ") + GMPATH_VERSION);
     program.require_subcommand(1);
     program.footer("Example: gmpath offset bracket.dxf --distance 3 -o bracket.svg");
-    InputOptions infoOptions;
-    OffsetOptions offsetOptions;
-    ToolpathOptions toolpathOptions;
-    const CLI::App* info = addInfo(program, infoOptions);
-    const CLI::App* offset = addOffset(program, offsetOptions);
-    CLI::App* toolpath = addToolpath(program, toolpathOptions);
-    addInputOptions(*toolpath, toolpathOptions.input);
+    Options options;
+    const std::vector<Command> commands = addCommands(program, options);
     try {
         program.parse(argc, argv);
-        if (offset->count("--step") == 0) offsetOptions.step = offsetOptions.distance;
-        if (info->parsed()) runInfo(infoOptions, console);
-        if (toolpath->parsed()) runToolpath(toolpathOptions, console);
-        if (offset->parsed() && !runOffset(offsetOptions, console)) return kFaultyOffsets;
+        for (const Command& command : commands) {
+            if (command.app->parsed() && !command.run(console)) return kFaultyResult;
+        }
     } catch (const CLI::ParseError& error) {
         return finishParsing(program, error, console);
     } catch (const InputError& error) {

@@ -19,6 +19,7 @@ constexpr int kMaxPasses = 10'000;
 constexpr double kLargestDistance = 1e9;
 
 constexpr int kDistanceDigits = 9;
+constexpr int kLegendDigits = 6;
 
 std::vector<double> distancesOf(const OffsetOptions& options) {
     if (options.count < 1 || options.count > kMaxPasses) {
@@ -35,10 +36,16 @@ std::vector<double> distancesOf(const OffsetOptions& options) {
     return distances;
 }
 
-std::string faultLine(const FaultyOffset& faulty) {
-    const std::string side = faulty.distance > 0.0 ? "right" : "left";
-    return "the offset by " + formatReal(std::abs(faulty.distance), kDistanceDigits) + " to the " +
-           side + " " + std::string(faultText(faulty.fault));
+ResultDrawing drawingOf(const Part& part, const std::vector<ContourOffsets>& offsets,
+                        const std::vector<double>& distances) {
+    ResultDrawing drawing{part.contours, {}, {}};
+    for (const ContourOffsets& found : offsets)
+        drawing.results.push_back(found.paths);
+    for (std::size_t pass = 0; pass < distances.size(); ++pass) {
+        drawing.passes.push_back({"offset " + formatReal(distances[pass], kLegendDigits),
+                                  "OFFSET_" + std::to_string(pass + 1)});
+    }
+    return drawing;
 }
 
 void reportContour(const std::string& contour, const std::vector<double>& distances,
@@ -48,7 +55,7 @@ void reportContour(const std::string& contour, const std::vector<double>& distan
         return;
     }
     for (const FaultyOffset& faulty : offsets.faults)
-        console.err << contour << ": " << faultLine(faulty) << "\n";
+        console.err << contour << ": " << faultText(faulty) << "\n";
     for (const std::size_t pass : offsets.emptyPasses) {
         console.err << contour << ": nothing left at distance "
                     << formatReal(distances[pass], kDistanceDigits) << "\n";
@@ -74,6 +81,12 @@ void checkPositive(double value, const std::string& option) {
     }
 }
 
+std::string faultText(const FaultyOffset& faulty) {
+    const std::string side = faulty.distance > 0.0 ? "right" : "left";
+    return "the offset by " + formatReal(std::abs(faulty.distance), kDistanceDigits) + " to the " +
+           side + " " + std::string(faultText(faulty.fault));
+}
+
 Part readInput(const InputOptions& options, const Console& console) {
     checkPositive(options.read.joinTolerance, "--join");
     checkPositive(options.read.scale, "--scale");
@@ -97,7 +110,7 @@ bool runOffset(const OffsetOptions& options, const Console& console) {
     const std::vector<ContourOffsets> offsets =
         offsetContours(part.contours, {options.side, distances},
                        [&](std::size_t done, std::size_t total) { progress.show(done, total); });
-    writeOutputs({part.contours, offsets, distances}, options.outputs);
+    writeOutputs(drawingOf(part, offsets, distances), options.outputs);
     progress.clear();
     reportContours(options, distances, offsets, console);
     return std::all_of(offsets.begin(), offsets.end(),

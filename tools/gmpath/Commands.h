@@ -39,6 +39,9 @@ void checkPositive(double value, const std::string& option);
 /// that cannot be used.
 Part readInput(const InputOptions& options, const Console& console);
 
+/// What is wrong with an offset, in words.
+std::string faultText(const FaultyOffset& faulty);
+
 /// Prints the table of contours. Throws InputError for input that cannot be used.
 void runInfo(const InputOptions& options, const Console& console);
 

@@ -26,13 +26,9 @@ constexpr std::array<int, 8> kPassColours = {1, 5, 3, 6, 30, 4, 200, 94};
 constexpr const char* kLineType = "CONTINUOUS";
 constexpr const char* kSourceLayer = "SOURCE";
 
-std::string passLayer(std::size_t pass) {
-    return "OFFSET_" + std::to_string(pass + 1);
-}
-
 class DxfWriter {
 public:
-    DxfWriter(const OffsetDrawing& drawing, const std::string& fileName)
+    DxfWriter(const ResultDrawing& drawing, const std::string& fileName)
         : m_drawing(drawing), m_out(m_dxf.out(fileName.c_str(), kVersion)) {}
 
     bool run() {
@@ -57,12 +53,12 @@ private:
     }
 
     void writeLayers() {
-        const std::size_t passes = m_drawing.distances.size();
+        const std::size_t passes = m_drawing.passes.size();
         m_out->tableLayers(static_cast<int>(passes) + 2);
         writeLayer("0", kBlack);
         writeLayer(kSourceLayer, kBlack);
         for (std::size_t pass = 0; pass < passes; ++pass) {
-            writeLayer(passLayer(pass), kPassColours[pass % kPassColours.size()]);
+            writeLayer(m_drawing.passes[pass].layer, kPassColours[pass % kPassColours.size()]);
         }
         m_out->tableEnd();
     }
@@ -77,10 +73,9 @@ private:
         m_out->sectionEntities();
         for (const Path& contour : m_drawing.contours)
             writePolyline(contour, kSourceLayer);
-        for (const ContourOffsets& offsets : m_drawing.offsets) {
-            for (const OffsetPath& offset : offsets.paths) {
-                writePolyline(offset.path, passLayer(offset.pass));
-            }
+        for (const std::vector<ResultPath>& results : m_drawing.results) {
+            for (const ResultPath& result : results)
+                writePolyline(result.path, m_drawing.passes[result.pass].layer);
         }
         m_out->sectionEnd();
     }
@@ -102,7 +97,7 @@ private:
         m_dxf.writeVertex(*m_out, DL_VertexData(p.x, p.y, 0.0, bulge));
     }
 
-    const OffsetDrawing& m_drawing;
+    const ResultDrawing& m_drawing;
     DL_Dxf m_dxf;
     std::unique_ptr<DL_WriterA> m_out;
 };
@@ -119,7 +114,7 @@ bool endsWithEndMark(const std::string& fileName) {
 
 }  // namespace
 
-bool writeDxf(const OffsetDrawing& drawing, const std::string& fileName) {
+bool writeDxf(const ResultDrawing& drawing, const std::string& fileName) {
     const ClassicLocale locale;
     return DxfWriter(drawing, fileName).run() && endsWithEndMark(fileName);
 }

@@ -2,13 +2,13 @@
 
 #include <string>
 
-#include "OffsetDrawing.h"
+#include "ResultDrawing.h"
 
 namespace gmpath {
 
-/// Writes the drawing as DXF: polylines with bulges, the sources on layer SOURCE, every pass on a
-/// layer of its own (OFFSET_1, OFFSET_2, ...) with its own colour.
+/// Writes the drawing as DXF: polylines with bulges, the sources on layer SOURCE, every pass on its
+/// layer with a colour of its own.
 /// Returns false when the file cannot be written as a whole.
-bool writeDxf(const OffsetDrawing& drawing, const std::string& fileName);
+bool writeDxf(const ResultDrawing& drawing, const std::string& fileName);
 
 }  // namespace gmpath

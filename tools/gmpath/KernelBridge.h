@@ -1,9 +1,10 @@
 #pragma once
 
 #include <cstddef>
+#include <optional>
 #include <vector>
 
-#include "Path.h"
+#include "KernelShapes.h"
 
 namespace gmpath {
 
@@ -13,13 +14,12 @@ struct KernelOffset {
     /// For every result the index of the source element from which each of its elements comes; an
     /// arc about a corner comes from the element that ends there.
     std::vector<std::vector<std::size_t>> origins;
+    /// The place where the kernel starts a path along the results; nothing where it finds none.
+    std::optional<Vec2> start;
     /// The kernel took the path over; false when its joints are off beyond the kernel's tolerance
     /// or an element cannot be built.
     bool accepted = true;
 };
-
-/// Elements below this length, over which the kernel joins pieces, may tear its offsets.
-constexpr double kShortestForKernel = 3.0 * kKernelTolerance;
 
 /// Offsets a path at the signed distance d, positive to the right of the direction of travel, as
 /// the kernel does it. Distances below the kernel's tolerance give the path itself.

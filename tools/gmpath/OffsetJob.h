@@ -5,7 +5,7 @@
 #include <vector>
 
 #include "OffsetCheck.h"
-#include "Path.h"
+#include "ResultDrawing.h"
 
 namespace gmpath {
 
@@ -26,13 +26,6 @@ struct OffsetRequest {
     std::vector<double> distances;
 };
 
-/// A result contour.
-struct OffsetPath {
-    std::size_t pass;  ///< index of the distance
-    Path path;
-    bool doubtful = false;  ///< one of the results of an offset with a fault
-};
-
 /// An offset that does not stand the check against its source.
 struct FaultyOffset {
     double distance;  ///< signed, positive to the right of the direction of travel
@@ -41,7 +34,7 @@ struct FaultyOffset {
 
 /// What became of one source contour.
 struct ContourOffsets {
-    std::vector<OffsetPath> paths;         ///< by pass
+    std::vector<ResultPath> paths;         ///< by pass, doubtful where the offset has a fault
     std::vector<std::size_t> emptyPasses;  ///< passes that yielded nothing, and rightly so
     std::vector<FaultyOffset> faults;      ///< by pass
     bool accepted = true;                  ///< false when the kernel refused the contour

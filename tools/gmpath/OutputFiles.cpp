@@ -41,7 +41,7 @@ AtomicFile written(const std::vector<OutputFormat>& formats, const std::string& 
     return file;
 }
 
-void writeWholeDxf(const OffsetDrawing& drawing, const AtomicFile& file) {
+void writeWholeDxf(const ResultDrawing& drawing, const AtomicFile& file) {
     if (!writeDxf(drawing, file.besideName())) {
         throw InputError(file.name() + ": cannot be written as a whole");
     }
@@ -72,7 +72,7 @@ void writeOutputs(const std::vector<OutputFormat>& formats, const std::vector<st
         file.commit();
 }
 
-void writeOutputs(const OffsetDrawing& drawing, const std::vector<std::string>& names) {
+void writeOutputs(const ResultDrawing& drawing, const std::vector<std::string>& names) {
     writeOutputs({{".svg", [&](AtomicFile& file) { file.write(svgOf(drawing)); }},
                   {".dxf", [&](const AtomicFile& file) { writeWholeDxf(drawing, file); }}},
                  names);

@@ -5,7 +5,7 @@
 #include <vector>
 
 #include "AtomicFile.h"
-#include "OffsetDrawing.h"
+#include "ResultDrawing.h"
 
 namespace gmpath {
 
@@ -27,6 +27,6 @@ void checkOutputs(const std::vector<std::string>& names, const std::string& inpu
 void writeOutputs(const std::vector<OutputFormat>& formats, const std::vector<std::string>& names);
 
 /// The same for a part and its offsets, as .svg or .dxf.
-void writeOutputs(const OffsetDrawing& drawing, const std::vector<std::string>& names);
+void writeOutputs(const ResultDrawing& drawing, const std::vector<std::string>& names);
 
 }  // namespace gmpath

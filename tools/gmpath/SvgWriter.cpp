@@ -27,18 +27,21 @@ const char* passColour(std::size_t pass) {
     return kPassColours[pass % kPassColours.size()];
 }
 
-bool hasDoubtful(const OffsetDrawing& drawing) {
-    return std::any_of(drawing.offsets.begin(), drawing.offsets.end(),
-                       [](const ContourOffsets& offsets) { return !offsets.faults.empty(); });
+bool hasDoubtful(const ResultDrawing& drawing) {
+    for (const std::vector<ResultPath>& results : drawing.results) {
+        const auto isDoubtful = [](const ResultPath& result) { return result.doubtful; };
+        if (std::any_of(results.begin(), results.end(), isDoubtful)) return true;
+    }
+    return false;
 }
 
-Box boxOf(const OffsetDrawing& drawing) {
+Box boxOf(const ResultDrawing& drawing) {
     Box box;
     for (const Path& contour : drawing.contours)
         box.include(boundingBox(contour));
-    for (const ContourOffsets& offsets : drawing.offsets) {
-        for (const OffsetPath& offset : offsets.paths)
-            box.include(boundingBox(offset.path));
+    for (const std::vector<ResultPath>& results : drawing.results) {
+        for (const ResultPath& result : results)
+            box.include(boundingBox(result.path));
     }
     return box;
 }
@@ -58,13 +61,15 @@ std::string senseName(const Path& path) {
 
 class SvgWriter {
 public:
-    explicit SvgWriter(const OffsetDrawing& drawing)
+    explicit SvgWriter(const ResultDrawing& drawing)
         : m_drawing(drawing), m_depths(nestingDepths(drawing.contours)), m_page(boxOf(drawing)) {}
 
     std::string run() {
         m_svg = m_page.head(styleRules());
         for (std::size_t i = 0; i < m_drawing.contours.size(); ++i)
             writeContour(i);
+        for (std::size_t i = 0; m_drawing.resultsOnTop && i < m_drawing.contours.size(); ++i)
+            writeResults(i);
         return m_svg + m_page.legend(legendEntries()) + "</svg>\n";
     }
 
@@ -76,10 +81,10 @@ private:
         const std::string dash = formatReal(kDashFraction * m_page.diagonal());
         std::string rules = std::string(".source { stroke: ") + kSourceColour +
                             "; stroke-width: " + sourceWidth +
-                            "; }\n.offset { stroke-width: " + offsetWidth +
+                            "; }\n.result { stroke-width: " + offsetWidth +
                             "; }\n.doubtful { stroke-dasharray: " + dash + "; }\n";
         rules += std::string(".source-mark { fill: ") + kSourceColour + "; }\n";
-        for (std::size_t pass = 0; pass < m_drawing.distances.size(); ++pass) {
+        for (std::size_t pass = 0; pass < m_drawing.passes.size(); ++pass) {
             const std::string name = passClass(pass);
             const std::string colour = passColour(pass);
             rules += "." + name + " { stroke: " + colour + "; }\n";
@@ -88,26 +93,36 @@ private:
         return rules +
                "@supports (vector-effect: non-scaling-stroke) {\n"
                "path { vector-effect: non-scaling-stroke; }\n"
-               ".source { stroke-width: 1.8px; }\n.offset { stroke-width: 1.2px; }\n"
+               ".source { stroke-width: " +
+               std::string(m_drawing.resultsOnTop ? "0.8" : "1.8") +
+               "px; }\n.result { stroke-width: 1.2px; }\n"
                ".doubtful { stroke-dasharray: 5px; }\n}\n";
     }
 
     static std::string passClass(std::size_t pass) { return "pass-" + std::to_string(pass + 1); }
 
+    std::string label(std::size_t index) const {
+        return m_drawing.labels.empty() ? std::to_string(index + 1) : m_drawing.labels[index];
+    }
+
     void writeContour(std::size_t index) {
         const Path& contour = m_drawing.contours[index];
-        const std::string number = std::to_string(index + 1);
+        const std::string number = label(index);
         m_svg += "<g id=\"contour-" + number + "\">\n<title>contour " + number + ", layer " +
                  xmlEscaped(printable(contour.layer)) + ", " + senseName(contour) + "</title>\n";
-        for (const OffsetPath& offset : m_drawing.offsets[index].paths) {
-            const std::string style = "offset " + passClass(offset.pass);
-            m_svg += svgPathTag(offset.path, offset.doubtful ? style + " doubtful" : style);
-            m_svg += startMark(offset.path, passClass(offset.pass) + "-mark", m_page.diagonal());
-        }
+        if (!m_drawing.resultsOnTop) writeResults(index);
         m_svg += svgPathTag(contour, "source");
         m_svg += startMark(contour, "source-mark", m_page.diagonal());
         m_svg += numberLabel(contour, number, isOutline(index), m_page.diagonal());
         m_svg += "</g>\n";
+    }
+
+    void writeResults(std::size_t index) {
+        for (const ResultPath& result : m_drawing.results[index]) {
+            const std::string style = "result " + passClass(result.pass);
+            m_svg += svgPathTag(result.path, result.doubtful ? style + " doubtful" : style);
+            m_svg += startMark(result.path, passClass(result.pass) + "-mark", m_page.diagonal());
+        }
     }
 
     /// Numbers stand in the material: inside of outlines, outside of holes.
@@ -116,14 +131,13 @@ private:
     std::vector<SvgLegendEntry> legendEntries() const {
         std::vector<SvgLegendEntry> entries = {{"source", kSourceColour}};
         if (hasDoubtful(m_drawing)) entries.push_back({"dashed: faulty", kSourceColour});
-        for (std::size_t pass = 0; pass < m_drawing.distances.size(); ++pass) {
-            entries.push_back(
-                {"offset " + formatReal(m_drawing.distances[pass], 6), passColour(pass)});
+        for (std::size_t pass = 0; pass < m_drawing.passes.size(); ++pass) {
+            entries.push_back({m_drawing.passes[pass].legend, passColour(pass)});
         }
         return entries;
     }
 
-    const OffsetDrawing& m_drawing;
+    const ResultDrawing& m_drawing;
     std::vector<std::optional<int>> m_depths;
     SvgPage m_page;
     std::string m_svg;
@@ -131,7 +145,7 @@ private:
 
 }  // namespace
 
-std::string svgOf(const OffsetDrawing& drawing) {
+std::string svgOf(const ResultDrawing& drawing) {
     return SvgWriter(drawing).run();
 }
 

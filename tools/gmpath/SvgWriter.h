@@ -2,14 +2,14 @@
 
 #include <string>
 
-#include "OffsetDrawing.h"
+#include "ResultDrawing.h"
 
 namespace gmpath {
 
 /// The drawing as an SVG picture with y upwards: a group for every source contour with its number,
-/// the source dark, every pass in a colour of its own. Arcs are true arcs. Results of
-/// offsets with a fault are dashed. Strokes keep their width however the picture is scaled. A dot
+/// the source dark, every pass in a colour of its own. Arcs are true arcs. Doubtful
+/// results are dashed. Strokes keep their width however the picture is scaled. A dot
 /// marks the start of every contour, an arrow its direction.
-std::string svgOf(const OffsetDrawing& drawing);
+std::string svgOf(const ResultDrawing& drawing);
 
 }  // namespace gmpath

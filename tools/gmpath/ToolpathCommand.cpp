@@ -1,5 +1,6 @@
 #include "ToolpathCommand.h"
 
+#include <algorithm>
 #include <sstream>
 
 #include "InputError.h"
@@ -44,6 +45,8 @@ std::string remark(const ContourCut& cut) {
     const auto add = [&](bool applies, const std::string& what) {
         if (applies) text += (text.empty() ? "" : "; ") + what;
     };
+    for (const FaultyOffset& faulty : cut.faults)
+        add(true, faultText(faulty) + ", not cut");
     add(!cut.keepsOthers, "the cut comes too near to another contour");
     add(cut.leads.shortened > 0, shortenedText(cut.leads));
     add(cut.leads.dropped > 0, droppedText(cut.leads));
@@ -79,7 +82,7 @@ std::string summary(const ToolpathResult& result, Units units) {
 
 }  // namespace
 
-void runToolpath(const ToolpathOptions& options, const Console& console) {
+bool runToolpath(const ToolpathOptions& options, const Console& console) {
     checkOptions(options);
     checkOutputs(options.outputs, options.input.drawing, {".ngc", ".svg"});
     // What the drawing holds besides is told only when the rest is in order.
@@ -93,13 +96,14 @@ void runToolpath(const ToolpathOptions& options, const Console& console) {
         makeToolpath(part.contours, request,
                      [&](std::size_t done, std::size_t total) { progress.show(done, total); });
     const MachineSettings settings = machineSettings(options, units);
-    writeOutputs(
-        {{".ngc", [&](AtomicFile& file) { file.write(gcodeOf(result.moves, settings)); }},
-         {".svg", [&](AtomicFile& file) { file.write(svgOf(part.contours, result.moves)); }}},
-        options.outputs);
+    writeOutputs({{".ngc", [&](AtomicFile& file) { file.write(gcodeOf(result.moves, settings)); }},
+                  {".svg", [&](AtomicFile& file) { file.write(svgOf(part.contours, result)); }}},
+                 options.outputs);
     progress.clear();
     reportContours(options.input.drawing, result.contours, console);
     console.out << summary(result, units);
+    return std::all_of(result.contours.begin(), result.contours.end(),
+                       [](const ContourCut& cut) { return cut.accepted && cut.faults.empty(); });
 }
 
 }  // namespace gmpath

@@ -33,7 +33,8 @@ struct ToolpathOptions {
 
 /// Computes the moves of a tool round every contour and writes the outputs. Contours that the tool
 /// does not fit into, and leads without room, are reported. Throws InputError for input, options
-/// and outputs that cannot be used; then no output is written.
-void runToolpath(const ToolpathOptions& options, const Console& console);
+/// and outputs that cannot be used; then no output is written. False when some offset has a fault,
+/// and is not cut, or could not be made.
+bool runToolpath(const ToolpathOptions& options, const Console& console);
 
 }  // namespace gmpath

@@ -4,7 +4,6 @@
 
 #include "MoveRecorder.h"
 #include "Nesting.h"
-#include "OffsetJob.h"
 #include "PathStart.h"
 #include "ToolpathOrder.h"
 
@@ -19,6 +18,14 @@ struct ContourRuns {
     std::vector<Pass> passes;  ///< none of them empty
     bool accepted = true;
     bool fits = true;
+    std::vector<FaultyOffset> faults;
+    std::vector<Path> doubtful;
+
+    void setAside(double d, ToolRuns found) {
+        faults.push_back({d, found.fault});
+        for (ToolRun& run : found.runs)
+            doubtful.push_back(std::move(run.path));
+    }
 };
 
 ContourRuns runsOf(const Path& contour, int depth, const ToolpathRequest& request) {
@@ -28,9 +35,13 @@ ContourRuns runsOf(const Path& contour, int depth, const ToolpathRequest& reques
         for (const double d : signedDistances(contour, depth, Side::kWaste, distance)) {
             ToolRuns found = toolRuns(contour, d, request.part);
             result.accepted = result.accepted && found.accepted;
-            std::move(found.runs.begin(), found.runs.end(), std::back_inserter(pass));
+            if (found.fault != OffsetFault::kNone) {
+                result.setAside(d, std::move(found));
+            } else {
+                std::move(found.runs.begin(), found.runs.end(), std::back_inserter(pass));
+            }
         }
-        result.fits = !pass.empty();
+        result.fits = !pass.empty() || !result.faults.empty();
         if (!pass.empty()) result.passes.push_back(std::move(pass));
     }
     return result;
@@ -62,7 +73,11 @@ public:
 
     ContourCut cutContour(std::size_t index, const ContourRuns& runs) {
         m_recorder.serve(index);
-        m_cut = {runs.accepted, runs.fits, true, {}};
+        m_cut = {};
+        m_cut.accepted = runs.accepted;
+        m_cut.fits = runs.fits;
+        m_cut.faults = runs.faults;
+        m_cut.doubtful = runs.doubtful;
         for (Pass pass : runs.passes) {
             while (!pass.empty()) {
                 const auto nearest = nearestRun(pass, m_recorder.place());

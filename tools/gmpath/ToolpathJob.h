@@ -3,6 +3,7 @@
 #include <functional>
 
 #include "Leads.h"
+#include "OffsetJob.h"
 #include "Toolpath.h"
 
 namespace gmpath {
@@ -27,9 +28,11 @@ struct LeadTally {
 
 /// What became of a contour.
 struct ContourCut {
-    bool accepted = true;     ///< false when the kernel refused the contour
-    bool fits = true;         ///< false when nothing is left for the last pass
-    bool keepsOthers = true;  ///< false when its cuts come too near to another contour
+    bool accepted = true;              ///< false when the kernel refused the contour
+    bool fits = true;                  ///< false when nothing is left for the last pass
+    bool keepsOthers = true;           ///< false when its cuts come too near to another contour
+    std::vector<FaultyOffset> faults;  ///< offsets that do not stand the check; they are not cut
+    std::vector<Path> doubtful;        ///< the results of those offsets
     LeadTally leads;
 };
 

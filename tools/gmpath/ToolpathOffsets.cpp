@@ -1,48 +1,14 @@
 #include "ToolpathOffsets.h"
 
-#include <optional>
-
-#include "KernelBridge.h"
-#include "KernelShapes.h"
+#include "CheckedOffset.h"
 #include "PathStart.h"
-#include "ShortElements.h"
-#include "gmkernel/GmContour.h"
 
 namespace gmpath {
 
 namespace {
 
-constexpr int kWholeContour = 1'000'000;
-
-/// Elements below this length may tear offsets, so the start is searched without them.
-constexpr double kShortestElement = 3.0 * kKernelTolerance;
-
-/// Offsets taken once with and once without the shortest elements differ by less than this.
+/// A start that lies this near to a run is a point of it.
 constexpr double kSamePlace = 1e-3;
-
-int subContourCount(const GmContour& contour) {
-    int count = 0;
-    while (contour.GetSubContour(count) != nullptr)
-        ++count;
-    return count;
-}
-
-/// Where the kernel starts a path along the offsets at the distance d.
-std::optional<Vec2> startPoint(const Path& contour, double d) {
-    Path source = contour;
-    dropShortElements(source, kShortestElement);
-    GmContour kernel;
-    for (const Element& e : source.elements) {
-        const std::unique_ptr<GmCurve> curve = kernelCurve(e);
-        const long id = kernel.ElementCount();
-        if (!curve->CreationOK() || !kernel.AddElement(curve.get(), false, id)) return std::nullopt;
-    }
-    kernel.Offsetting(d, kWholeContour, !source.closed);
-    int sub = 0;
-    int elem = 0;
-    if (!FindTPCCont(&kernel, subContourCount(kernel), d, sub, elem)) return std::nullopt;
-    return fromKernel(kernel.GetSubContour(sub)->GetElement(elem)->SP());
-}
 
 /// True when the contour lies right of the offset at the distance d from it: stepping to the right
 /// off the longest element comes nearer to the contour.
@@ -78,12 +44,13 @@ void fixStart(std::vector<ToolRun>& runs, Vec2 start) {
 }  // namespace
 
 ToolRuns toolRuns(const Path& contour, double d, PartSide side) {
-    KernelOffset offset = offsetByKernel(contour, d);
-    ToolRuns result{{}, offset.accepted};
+    CheckedOffset checked = offsetChecked(contour, d);
+    KernelOffset& offset = checked.offset;
+    ToolRuns result{{}, offset.accepted, checked.fault};
     for (Path& path : offset.results)
         result.runs.push_back(runAlong(contour, std::move(path), d, side));
     if (result.runs.empty()) return result;
-    if (const std::optional<Vec2> start = startPoint(contour, d)) fixStart(result.runs, *start);
+    if (offset.start) fixStart(result.runs, *offset.start);
     for (ToolRun& run : result.runs)
         run.startFixed = run.startFixed || !run.path.closed;
     return result;

@@ -2,7 +2,7 @@
 
 #include <vector>
 
-#include "Path.h"
+#include "OffsetCheck.h"
 
 namespace gmpath {
 
@@ -21,6 +21,7 @@ struct ToolRun {
 struct ToolRuns {
     std::vector<ToolRun> runs;
     bool accepted = true;  ///< false when the kernel refused the contour
+    OffsetFault fault = OffsetFault::kNone;
 };
 
 /// Offsets a contour at the signed distance d, positive to the right of its direction of travel,

@@ -19,15 +19,20 @@ constexpr const char* kRapidColour = "#868e96";
 constexpr double kStroke = 0.0012;
 constexpr double kThinStroke = 0.0006;
 constexpr double kDash = 0.006;
+constexpr double kShortDash = 0.004;
 constexpr double kPlungeRadius = 0.002;
 
 /// What the picture shows as a whole; the way from the origin may come in from outside.
-Box boxOf(const std::vector<Path>& contours, const Toolpath& moves) {
+Box boxOf(const std::vector<Path>& contours, const ToolpathResult& result) {
     Box box;
     for (const Path& contour : contours)
         box.include(boundingBox(contour));
-    for (const Move& move : moves) {
+    for (const Move& move : result.moves) {
         if (move.kind != MoveKind::kRapid) box.include(boundingBox(move.path));
+    }
+    for (const ContourCut& cut : result.contours) {
+        for (const Path& path : cut.doubtful)
+            box.include(boundingBox(path));
     }
     return box;
 }
@@ -41,22 +46,23 @@ double lowestLevel(const Toolpath& moves) {
 
 class ToolpathSvg {
 public:
-    ToolpathSvg(const std::vector<Path>& contours, const Toolpath& moves)
+    ToolpathSvg(const std::vector<Path>& contours, const ToolpathResult& result)
         : m_contours(contours),
-          m_moves(moves),
-          m_lowest(lowestLevel(moves)),
-          m_page(boxOf(contours, moves)) {}
+          m_result(result),
+          m_lowest(lowestLevel(result.moves)),
+          m_page(boxOf(contours, result)) {}
 
     std::string run() {
         m_svg = m_page.head(styleRules());
         for (const Path& contour : m_contours)
             m_svg += svgPathTag(contour, "source");
-        for (const Move& move : m_moves)
+        for (const Move& move : m_result.moves)
             draw(move);
-        const std::vector<SvgLegendEntry> legend = {{"part", kSourceColour},
-                                                    {"cuts", kCutColour},
-                                                    {"leads", kLeadColour},
-                                                    {"rapid moves", kRapidColour}};
+        std::vector<SvgLegendEntry> legend = {{"part", kSourceColour},
+                                              {"cuts", kCutColour},
+                                              {"leads", kLeadColour},
+                                              {"rapid moves", kRapidColour}};
+        if (drawDoubtful()) legend.insert(legend.begin() + 1, {"dashed: faulty", kSourceColour});
         return m_svg + m_page.legend(legend) + "</svg>\n";
     }
 
@@ -73,12 +79,15 @@ private:
                strokeRule("rapid", kRapidColour, kThinStroke) +
                ".rapid { stroke-dasharray: " + formatReal(kDash * m_page.diagonal()) +
                "; }\n.cut-mark { fill: " + kCutColour + "; }\n" +
-               strokeRule("plunge", kLeadColour, kThinStroke) +
+               strokeRule("doubtful", kSourceColour, kThinStroke) +
+               ".doubtful { stroke-dasharray: " + formatReal(kShortDash * m_page.diagonal()) +
+               "; }\n" + strokeRule("plunge", kLeadColour, kThinStroke) +
                ".plunge { fill: none; }\n"
                "@supports (vector-effect: non-scaling-stroke) {\n"
                "path, circle { vector-effect: non-scaling-stroke; }\n"
                ".source, .cut, .lead { stroke-width: 1.5px; }\n"
                ".rapid { stroke-width: 0.8px; stroke-dasharray: 6px; }\n"
+               ".doubtful { stroke-width: 1.2px; stroke-dasharray: 5px; }\n"
                ".plunge { stroke-width: 0.8px; }\n}\n";
     }
 
@@ -100,6 +109,18 @@ private:
         if (!move.path.elements.empty()) m_place = move.path.elements.back().ep;
     }
 
+    /// Offsets that are not cut because they have a fault; false when there is none.
+    bool drawDoubtful() {
+        bool any = false;
+        for (const ContourCut& cut : m_result.contours) {
+            for (const Path& path : cut.doubtful) {
+                m_svg += svgPathTag(path, "doubtful");
+                any = true;
+            }
+        }
+        return any;
+    }
+
     void drawPlunge() {
         m_svg += "<circle class=\"plunge\" cx=\"" + formatReal(m_place.x) + "\" cy=\"" +
                  formatReal(-m_place.y) + "\" r=\"" +
@@ -112,7 +133,7 @@ private:
     }
 
     const std::vector<Path>& m_contours;
-    const Toolpath& m_moves;
+    const ToolpathResult& m_result;
     double m_lowest;
     SvgPage m_page;
     Vec2 m_place;
@@ -121,8 +142,8 @@ private:
 
 }  // namespace
 
-std::string svgOf(const std::vector<Path>& contours, const Toolpath& moves) {
-    return ToolpathSvg(contours, moves).run();
+std::string svgOf(const std::vector<Path>& contours, const ToolpathResult& result) {
+    return ToolpathSvg(contours, result).run();
 }
 
 }  // namespace gmpath

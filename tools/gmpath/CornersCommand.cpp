@@ -1,0 +1,71 @@
+#include "CornersCommand.h"
+
+#include "InputError.h"
+#include "OutputFiles.h"
+#include "Text.h"
+
+namespace gmpath {
+
+namespace {
+
+constexpr int kLegendDigits = 6;
+
+CornerRequest requestOf(const CornersOptions& options) {
+    const auto of = [&](CornerKind kind, double value, const std::string& option) {
+        checkPositive(value, option);
+        return CornerRequest{kind, value, options.choice};
+    };
+    if (options.radius) return of(CornerKind::kRounding, *options.radius, "--radius");
+    if (options.chamfer) return of(CornerKind::kChamferDistance, *options.chamfer, "--chamfer");
+    if (!options.chamferLength) {
+        throw InputError("give one of --radius, --chamfer, --chamfer-length");
+    }
+    return of(CornerKind::kChamferLength, *options.chamferLength, "--chamfer-length");
+}
+
+PassName nameOf(const CornerRequest& request) {
+    const std::string value = formatReal(request.value, kLegendDigits);
+    const bool rounds = request.kind == CornerKind::kRounding;
+    return {(rounds ? "rounded by " : "chamfer ") + value, "CORNERS"};
+}
+
+/// What is to be told about a contour, empty when all went well.
+std::string remark(const CornerResult& result) {
+    if (!result.accepted) return "the kernel cannot take it over";
+    if (result.notDone == 0) return {};
+    return "no room at " + std::to_string(result.notDone) + " of " +
+           counted(result.done + result.notDone, "corner");
+}
+
+}  // namespace
+
+bool runCorners(const CornersOptions& options, const Console& console) {
+    const CornerRequest request = requestOf(options);
+    checkOutputs(options.outputs, options.input.drawing);
+    const Part part = readInput(options.input, console);
+    ResultDrawing drawing{part.contours, {}, {nameOf(request)}, {}, true};
+    std::vector<CornerResult> results;
+    for (const Path& contour : part.contours) {
+        results.push_back(breakCorners(contour, request));
+        drawing.results.push_back({{0, results.back().path, !results.back().accepted}});
+    }
+    writeOutputs(drawing, options.outputs);
+
+    std::size_t done = 0;
+    std::size_t notDone = 0;
+    bool accepted = true;
+    for (std::size_t i = 0; i < results.size(); ++i) {
+        done += results[i].done;
+        notDone += results[i].notDone;
+        accepted = accepted && results[i].accepted;
+        const std::string text = remark(results[i]);
+        if (text.empty()) continue;
+        console.err << "gmpath: " << printable(options.input.drawing) << ": contour " << i + 1
+                    << ": " << text << "\n";
+    }
+    console.out << counted(results.size(), "contour") << ", " << counted(done, "corner")
+                << " done, " << notDone << " not done\n";
+    return accepted;
+}
+
+}  // namespace gmpath
