@@ -9,7 +9,10 @@
 #include <vector>
 
 #include "DrawingText.h"
+#include "PathShapes.h"
 #include "Scratch.h"
+
+using path_shapes::rectangle;
 
 namespace {
 
@@ -86,6 +89,31 @@ TEST_F(Program, ToolpathWritesProgramAndPicture) {
     }
 }
 
+TEST_F(Program, CornersAndMeltSayWhatTheyDid) {
+    using drawing_text::drawing;
+    using drawing_text::lightPolyline;
+    m_scratch.store("a.dxf", drawing(lightPolyline(rectangle({0, 0}, {10, 10}).elements, true)));
+    m_scratch.store("b.dxf", drawing(lightPolyline(rectangle({6, 2}, {9, 30}).elements, true) +
+                                     lightPolyline(rectangle({1, 1}, {2, 2}).elements, true)));
+    const Outcome corners = run("corners b.dxf --chamfer 1.2 -o c.svg -o c.dxf");
+    EXPECT_EQ(corners.exitCode, 0);
+    EXPECT_EQ(corners.out, "2 contours, 4 corners done, 4 not done\n");
+    EXPECT_EQ(corners.err, "gmpath: b.dxf: contour 2: no room at 4 of 4 corners\n");
+    EXPECT_NE(run("info c.dxf").out.find("CORNERS"), std::string::npos);
+    const Outcome melt = run("melt a.dxf b.dxf -o m.svg -o m.dxf");
+    EXPECT_EQ(melt.exitCode, 0);
+    EXPECT_EQ(melt.out,
+              "A1 + B1: 2 loops (1 outline, 1 common part)\nA1 + B2: no loops, B2 lies inside\n"
+              "2 pairs, 1 melted\n");
+    EXPECT_NE(run("info m.dxf").out.find("COMMON"), std::string::npos);
+    EXPECT_NE(m_scratch.content("m.svg").find("id=\"contour-B2\""), std::string::npos);
+    // Flush along two sides: the kernel's loops leave out the outline.
+    m_scratch.store("c.dxf", drawing(lightPolyline(rectangle({5, 0}, {15, 10}).elements, true)));
+    const Outcome flush = run("melt a.dxf c.dxf -o m.svg");
+    EXPECT_EQ(flush.exitCode, 1);
+    EXPECT_EQ(flush.err, "gmpath: A1 + B1: the loops do not make up both contours\n");
+}
+
 TEST_F(Program, FaultyOffsetsAreNamedAndDashed) {
     // A polygon that crosses itself has no closed offset.
     const std::vector<gmpath::Element> crossing = {
@@ -149,7 +177,13 @@ TEST_F(Program, BadInputIsOneLineAndExitCodeTwo) {
         {"toolpath " + kBracket + " --tool 4 --climb --conventional -o a.ngc", "excludes"},
         {"toolpath feet.dxf --tool 4 -o a.ngc", "feet"},
         {"", "subcommand"},
-        {"melt " + kBracket, ""},
+        {"corners " + kBracket + " -o a.svg", "--radius"},
+        {"corners " + kBracket + " --radius 1 --chamfer 2 -o a.svg", "excludes"},
+        {"corners " + kBracket + " --chamfer-length nan -o a.svg", "--chamfer-length"},
+        {"melt " + kBracket + " -o a.svg", "SECOND"},
+        {"melt " + kBracket + " none.dxf -o a.svg", "none.dxf"},
+        {"melt bare.dxf " + kBracket + " -o a.svg", "bare.dxf"},
+        {"melt " + kBracket + " " + kBracket + " -o a.ngc", ".svg or .dxf"},
     };
     for (const auto& [arguments, cause] : cases) {
         SCOPED_TRACE(arguments);

@@ -1,6 +1,7 @@
 #include "MeltCommand.h"
 
 #include <algorithm>
+#include <sstream>
 
 #include "MeltJob.h"
 #include "OutputFiles.h"
@@ -70,10 +71,13 @@ ResultDrawing drawingOf(const Part& first, const Part& second,
 bool runMelt(const MeltOptions& options, const Console& console) {
     checkOutputs(options.outputs, options.first.drawing);
     checkOutputs(options.outputs, options.second);
-    const Part first = readInput(options.first, console);
+    // What the drawings hold besides is told only when both can be read.
+    std::ostringstream remarks;
+    const Part first = readInput(options.first, {console.out, remarks});
     InputOptions secondInput = options.first;
     secondInput.drawing = options.second;
-    const Part second = readInput(secondInput, console);
+    const Part second = readInput(secondInput, {console.out, remarks});
+    console.err << remarks.str();
     const std::vector<MeltedPair> pairs = meltContours(first.contours, second.contours);
     writeOutputs(drawingOf(first, second, pairs), options.outputs);
 

@@ -17,9 +17,11 @@ namespace {
 constexpr std::array<const char*, 8> kPassColours = {"#d9480f", "#1c7ed6", "#2b8a3e", "#9c36b5",
                                                      "#e0a100", "#0c8599", "#c2255c", "#6741d9"};
 constexpr const char* kSourceColour = "#212529";
+constexpr const char* kSourceBelowColour = "#868e96";
 
 /// Sizes as fractions of the picture's diagonal.
 constexpr double kSourceStrokeFraction = 0.0014;
+constexpr double kSourceBelowStrokeFraction = 0.0005;
 constexpr double kOffsetStrokeFraction = 0.0009;
 constexpr double kDashFraction = 0.004;
 
@@ -76,14 +78,16 @@ public:
 private:
     /// Where strokes can keep their width they do; elsewhere it follows the size of the drawing.
     std::string styleRules() const {
-        const std::string sourceWidth = formatReal(kSourceStrokeFraction * m_page.diagonal());
+        const bool below = m_drawing.resultsOnTop;
+        const double sourceFraction = below ? kSourceBelowStrokeFraction : kSourceStrokeFraction;
+        const std::string sourceWidth = formatReal(sourceFraction * m_page.diagonal());
         const std::string offsetWidth = formatReal(kOffsetStrokeFraction * m_page.diagonal());
         const std::string dash = formatReal(kDashFraction * m_page.diagonal());
-        std::string rules = std::string(".source { stroke: ") + kSourceColour +
+        std::string rules = ".source { stroke: " + sourceColour() +
                             "; stroke-width: " + sourceWidth +
                             "; }\n.result { stroke-width: " + offsetWidth +
                             "; }\n.doubtful { stroke-dasharray: " + dash + "; }\n";
-        rules += std::string(".source-mark { fill: ") + kSourceColour + "; }\n";
+        rules += ".source-mark { fill: " + sourceColour() + "; }\n";
         for (std::size_t pass = 0; pass < m_drawing.passes.size(); ++pass) {
             const std::string name = passClass(pass);
             const std::string colour = passColour(pass);
@@ -94,9 +98,13 @@ private:
                "@supports (vector-effect: non-scaling-stroke) {\n"
                "path { vector-effect: non-scaling-stroke; }\n"
                ".source { stroke-width: " +
-               std::string(m_drawing.resultsOnTop ? "0.8" : "1.8") +
+               std::string(below ? "0.7" : "1.8") +
                "px; }\n.result { stroke-width: 1.2px; }\n"
                ".doubtful { stroke-dasharray: 5px; }\n}\n";
+    }
+
+    std::string sourceColour() const {
+        return m_drawing.resultsOnTop ? kSourceBelowColour : kSourceColour;
     }
 
     static std::string passClass(std::size_t pass) { return "pass-" + std::to_string(pass + 1); }
@@ -129,7 +137,7 @@ private:
     bool isOutline(std::size_t index) const { return m_depths[index].value_or(0) % 2 == 0; }
 
     std::vector<SvgLegendEntry> legendEntries() const {
-        std::vector<SvgLegendEntry> entries = {{"source", kSourceColour}};
+        std::vector<SvgLegendEntry> entries = {{"source", sourceColour()}};
         if (hasDoubtful(m_drawing)) entries.push_back({"dashed: faulty", kSourceColour});
         for (std::size_t pass = 0; pass < m_drawing.passes.size(); ++pass) {
             entries.push_back({m_drawing.passes[pass].legend, passColour(pass)});
