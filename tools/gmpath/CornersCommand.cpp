@@ -26,7 +26,7 @@ CornerRequest requestOf(const CornersOptions& options) {
 PassName nameOf(const CornerRequest& request) {
     const std::string value = formatReal(request.value, kLegendDigits);
     const bool rounds = request.kind == CornerKind::kRounding;
-    return {(rounds ? "rounded by " : "chamfer ") + value, "CORNERS"};
+    return {(rounds ? "rounded by " : "chamfer ") + value, ""};
 }
 
 /// What is to be told about a contour, empty when all went well.

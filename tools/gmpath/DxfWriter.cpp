@@ -5,6 +5,7 @@
 #include <array>
 #include <fstream>
 #include <iterator>
+#include <map>
 #include <memory>
 
 #include "ClassicLocale.h"
@@ -53,14 +54,30 @@ private:
     }
 
     void writeLayers() {
-        const std::size_t passes = m_drawing.passes.size();
-        m_out->tableLayers(static_cast<int>(passes) + 2);
-        writeLayer("0", kBlack);
-        writeLayer(kSourceLayer, kBlack);
-        for (std::size_t pass = 0; pass < passes; ++pass) {
-            writeLayer(m_drawing.passes[pass].layer, kPassColours[pass % kPassColours.size()]);
-        }
+        const std::map<std::string, int> layers = layerColours();
+        m_out->tableLayers(static_cast<int>(layers.size()));
+        for (const auto& [name, colour] : layers)
+            writeLayer(name, colour);
         m_out->tableEnd();
+    }
+
+    std::map<std::string, int> layerColours() const {
+        std::map<std::string, int> colours = {{"0", kBlack}};
+        if (!m_drawing.replacesSources) colours[kSourceLayer] = kBlack;
+        for (const std::vector<ResultPath>& results : m_drawing.results) {
+            for (const ResultPath& result : results)
+                colours.emplace(layerOf(result), kBlack);
+        }
+        for (std::size_t pass = 0; pass < m_drawing.passes.size(); ++pass) {
+            const std::string& layer = m_drawing.passes[pass].layer;
+            if (!layer.empty()) colours[layer] = kPassColours[pass % kPassColours.size()];
+        }
+        return colours;
+    }
+
+    const std::string& layerOf(const ResultPath& result) const {
+        const std::string& layer = m_drawing.passes[result.pass].layer;
+        return layer.empty() ? result.path.layer : layer;
     }
 
     void writeLayer(const std::string& name, int colour) {
@@ -71,11 +88,13 @@ private:
 
     void writeEntities() {
         m_out->sectionEntities();
-        for (const Path& contour : m_drawing.contours)
-            writePolyline(contour, kSourceLayer);
+        if (!m_drawing.replacesSources) {
+            for (const Path& contour : m_drawing.contours)
+                writePolyline(contour, kSourceLayer);
+        }
         for (const std::vector<ResultPath>& results : m_drawing.results) {
             for (const ResultPath& result : results)
-                writePolyline(result.path, m_drawing.passes[result.pass].layer);
+                writePolyline(result.path, layerOf(result));
         }
         m_out->sectionEnd();
     }

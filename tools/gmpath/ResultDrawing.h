@@ -18,7 +18,7 @@ struct ResultPath {
 /// Names of a pass in drawings.
 struct PassName {
     std::string legend;
-    std::string layer;
+    std::string layer;  ///< empty for results that stay on the layers of their paths
 };
 
 /// Source contours and what came of them, as the writers put them into a file.
@@ -28,8 +28,9 @@ struct ResultDrawing {
     std::vector<PassName> passes;
     /// One entry a contour, of letters and digits; without entries contours are numbered from 1.
     std::vector<std::string> labels = {};
-    /// Results follow the sources closely and are drawn over them.
-    bool resultsOnTop = false;
+    /// The results take the place of the sources: pictures show them over the sources, other
+    /// drawings without them.
+    bool replacesSources = false;
 };
 
 }  // namespace gmpath

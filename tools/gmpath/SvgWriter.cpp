@@ -70,7 +70,7 @@ public:
         m_svg = m_page.head(styleRules());
         for (std::size_t i = 0; i < m_drawing.contours.size(); ++i)
             writeContour(i);
-        for (std::size_t i = 0; m_drawing.resultsOnTop && i < m_drawing.contours.size(); ++i)
+        for (std::size_t i = 0; m_drawing.replacesSources && i < m_drawing.contours.size(); ++i)
             writeResults(i);
         return m_svg + m_page.legend(legendEntries()) + "</svg>\n";
     }
@@ -78,7 +78,7 @@ public:
 private:
     /// Where strokes can keep their width they do; elsewhere it follows the size of the drawing.
     std::string styleRules() const {
-        const bool below = m_drawing.resultsOnTop;
+        const bool below = m_drawing.replacesSources;
         const double sourceFraction = below ? kSourceBelowStrokeFraction : kSourceStrokeFraction;
         const std::string sourceWidth = formatReal(sourceFraction * m_page.diagonal());
         const std::string offsetWidth = formatReal(kOffsetStrokeFraction * m_page.diagonal());
@@ -104,7 +104,7 @@ private:
     }
 
     std::string sourceColour() const {
-        return m_drawing.resultsOnTop ? kSourceBelowColour : kSourceColour;
+        return m_drawing.replacesSources ? kSourceBelowColour : kSourceColour;
     }
 
     static std::string passClass(std::size_t pass) { return "pass-" + std::to_string(pass + 1); }
@@ -118,7 +118,7 @@ private:
         const std::string number = label(index);
         m_svg += "<g id=\"contour-" + number + "\">\n<title>contour " + number + ", layer " +
                  xmlEscaped(printable(contour.layer)) + ", " + senseName(contour) + "</title>\n";
-        if (!m_drawing.resultsOnTop) writeResults(index);
+        if (!m_drawing.replacesSources) writeResults(index);
         m_svg += svgPathTag(contour, "source");
         m_svg += startMark(contour, "source-mark", m_page.diagonal());
         m_svg += numberLabel(contour, number, isOutline(index), m_page.diagonal());
