@@ -1,5 +1,7 @@
 #include "SvgPage.h"
 
+#include <algorithm>
+
 #include "SvgSymbols.h"
 #include "Text.h"
 
@@ -13,6 +15,12 @@ constexpr double kPi = 3.14159265358979323846;
 constexpr double kMarginFraction = 0.03;
 constexpr double kLegendFraction = 0.014;
 
+/// Sizes of the legend as multiples of its text size.
+constexpr double kEntryWidth = 9.0;
+constexpr double kLineHeight = 1.5;
+
+constexpr std::size_t kMostLegendLines = 4;
+
 std::string flipped(Vec2 p) {
     return formatReal(p.x) + " " + formatReal(-p.y);
 }
@@ -25,10 +33,25 @@ double SvgPage::legendSize() const {
     return kLegendFraction * m_diagonal;
 }
 
-std::string SvgPage::head(const std::string& rules) const {
+std::size_t SvgPage::entriesPerLine() const {
+    const double fitting = m_drawn.size().x / (kEntryWidth * legendSize());
+    constexpr double kMost = 100.0;
+    return fitting > 1.0 ? static_cast<std::size_t>(std::min(fitting, kMost)) : 1;
+}
+
+std::string SvgPage::picture(const std::string& rules, const std::string& body,
+                             const std::vector<SvgLegendEntry>& legend) const {
+    const std::size_t perLine = entriesPerLine();
+    const std::size_t lines = (legend.size() + perLine - 1) / perLine;
+    const std::size_t shown = std::min(lines, kMostLegendLines);
+    return head(rules, shown) + body + legendText(legend) + "</svg>\n";
+}
+
+std::string SvgPage::head(const std::string& rules, std::size_t legendLines) const {
     const Box page = m_drawn.grown(kMarginFraction * m_diagonal);
-    const double legendHeight = 2.0 * legendSize();
-    const std::string width = formatReal(page.size().x);
+    const double size = legendSize();
+    const double legendHeight = (0.5 + kLineHeight * static_cast<double>(legendLines)) * size;
+    const std::string width = formatReal(std::max(page.size().x, (kEntryWidth + 1.0) * size));
     const std::string height = formatReal(page.size().y + legendHeight);
     const std::string left = formatReal(page.low.x);
     const std::string top = formatReal(-page.high.y);
@@ -42,14 +65,16 @@ std::string SvgPage::head(const std::string& rules) const {
            "\" width=\"" + width + "\" height=\"" + height + "\" fill=\"#ffffff\"/>\n";
 }
 
-std::string SvgPage::legend(const std::vector<SvgLegendEntry>& entries) const {
-    constexpr double kEntryWidth = 9.0;  // in text sizes
+std::string SvgPage::legendText(const std::vector<SvgLegendEntry>& entries) const {
     const double size = legendSize();
-    const double perLine = m_drawn.size().x / (kEntryWidth * size);
-    const double y = m_drawn.low.y - kMarginFraction * m_diagonal - size;
+    const double top = m_drawn.low.y - kMarginFraction * m_diagonal - size;
+    const std::size_t perLine = entriesPerLine();
+    const std::size_t shown = std::min(entries.size(), kMostLegendLines * perLine);
     std::string svg = "<g id=\"legend\">\n";
-    for (std::size_t i = 0; i < entries.size() && static_cast<double>(i) <= perLine; ++i) {
-        const Vec2 at{m_drawn.low.x + static_cast<double>(i) * kEntryWidth * size, y};
+    for (std::size_t i = 0; i < shown; ++i) {
+        const auto column = static_cast<double>(i % perLine);
+        const auto line = static_cast<double>(i / perLine);
+        const Vec2 at{m_drawn.low.x + column * kEntryWidth * size, top - line * kLineHeight * size};
         svg += textTag(at, size, "fill=\"" + entries[i].colour + "\"", entries[i].text);
     }
     return svg + "</g>\n";

@@ -1,5 +1,6 @@
 #pragma once
 
+#include <cstddef>
 #include <string>
 #include <vector>
 
@@ -21,15 +22,17 @@ public:
 
     double diagonal() const { return m_diagonal; }
 
-    /// The opening of the picture up to its background. `rules` are style rules, one a line,
-    /// besides those for all paths and texts.
-    std::string head(const std::string& rules) const;
-
-    /// A line of text under the picture: what each colour stands for. Ends where the page does.
-    std::string legend(const std::vector<SvgLegendEntry>& entries) const;
+    /// The whole picture: page and background, the drawn `body`, the legend under it. `rules` are
+    /// style rules, one a line, besides those for all paths and texts. The legend takes as many
+    /// lines as it needs, up to four; entries beyond them are left out.
+    std::string picture(const std::string& rules, const std::string& body,
+                        const std::vector<SvgLegendEntry>& legend) const;
 
 private:
     double legendSize() const;
+    std::size_t entriesPerLine() const;
+    std::string head(const std::string& rules, std::size_t legendLines) const;
+    std::string legendText(const std::vector<SvgLegendEntry>& entries) const;
 
     Box m_drawn;
     double m_diagonal;

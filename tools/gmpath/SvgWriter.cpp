@@ -67,12 +67,11 @@ public:
         : m_drawing(drawing), m_depths(nestingDepths(drawing.contours)), m_page(boxOf(drawing)) {}
 
     std::string run() {
-        m_svg = m_page.head(styleRules());
         for (std::size_t i = 0; i < m_drawing.contours.size(); ++i)
             writeContour(i);
         for (std::size_t i = 0; m_drawing.replacesSources && i < m_drawing.contours.size(); ++i)
             writeResults(i);
-        return m_svg + m_page.legend(legendEntries()) + "</svg>\n";
+        return m_page.picture(styleRules(), m_svg, legendEntries());
     }
 
 private:

@@ -53,7 +53,6 @@ public:
           m_page(boxOf(contours, result)) {}
 
     std::string run() {
-        m_svg = m_page.head(styleRules());
         for (const Path& contour : m_contours)
             m_svg += svgPathTag(contour, "source");
         for (const Move& move : m_result.moves)
@@ -63,7 +62,7 @@ public:
                                               {"leads", kLeadColour},
                                               {"rapid moves", kRapidColour}};
         if (drawDoubtful()) legend.insert(legend.begin() + 1, {"dashed: faulty", kSourceColour});
-        return m_svg + m_page.legend(legend) + "</svg>\n";
+        return m_page.picture(styleRules(), m_svg, legend);
     }
 
 private:
