@@ -101,14 +101,13 @@ Loops loopsOf(CurveList const& curves, Passages& passages, bool closed) {
 }  // namespace
 
 int GmContour::VarParallelContours(GmVec const& v) {
-    const GmVec shift(v);
     SplitArcsQuadrant();
-    if (shift.Length() < m_scdPrec) {
+    if (v.Length() < m_scdPrec) {
         CopyContourToSubContour();
         return m_pSubConts->GetCount();
     }
     CurveList curves;
-    shiftElements(*this, shift, curves);
+    shiftElements(*this, v, curves);
     closeGaps(curves, m_bClosed);
     removeCollapsed(curves);
     Passages passages;

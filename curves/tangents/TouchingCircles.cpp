@@ -2,6 +2,7 @@
 /// Circles through points and circles that touch lines and circles.
 #include <cmath>
 
+#include "curves/CarrierHits.h"
 #include "gmkernel/GmCircle.h"
 #include "gmkernel/GmLine.h"
 
@@ -43,12 +44,12 @@ GmCircle::GmCircle(GmLine const& l1, GmLine const& l2, GmLine const& l3) : GmCir
 
 GmCircle::GmCircle(GmLine const& l1, GmLine const& l2, double r) : GmCircle() {
     if (!l1.CreationOK() || !l2.CreationOK()) return;
-    const GmLine carrier(l1);
-    if (carrier.IntersectionWithLine(l2) == 0) return;
+    const auto crossing = gmkernel_detail::carrierHits(l1, l2);
+    if (crossing.begin() == crossing.end()) return;
     const GmVec bisector(l1.Dir().Sym(l2.Dir()));
     const double angle = l1.Dir().RAngle(l2.Dir());
     const double dist = std::fabs(r / std::sin(angle / 2.0));
-    Define(GmPoint(carrier.GetSolution(0) + dist * bisector), upAxis(), std::fabs(r));
+    Define(GmPoint(*crossing.begin() + dist * bisector), upAxis(), std::fabs(r));
 }
 
 GmCircle::GmCircle(GmCircle const& c, GmLine const& l, double r, bool bRight, bool bOutside,
@@ -70,7 +71,7 @@ void GmCircle::CreateTangCircle(GmCircle const& c, GmLine const& l, double r, bo
     const GmCircle centres = centresTouching(c, r, bOutside);
     const int count = centres.IntersectionWithLine(GmLine(l, bRight ? r : -r));
     if (count == 0) {
-        Undefine();
+        GmCircle::Undefine();
         return;
     }
     GmPoint m = centres.GetSolution(0);
@@ -85,7 +86,7 @@ void GmCircle::CreateTangCircle(GmCircle const& c1, GmCircle const& c2, double r
     const GmCircle centres = centresTouching(c1, r, bOutside1);
     const int count = centres.IntersectionWithCircle(centresTouching(c2, r, bOutside2));
     if (count == 0) {
-        Undefine();
+        GmCircle::Undefine();
         return;
     }
     GmPoint m = centres.GetSolution(0);
