@@ -5,7 +5,9 @@
 /// gives up to two passages, one from each boundary onto the other. A walk follows one boundary to
 /// the next passage, changes over, and so on until it is back where it started.
 #include <memory>
+#include <vector>
 
+#include "contour/CurveBox.h"
 #include "contour/GmContourArray.h"
 #include "contour/melt/LoopContour.h"
 #include "contour/melt/PassageWalk.h"
@@ -27,11 +29,21 @@ bool isClosedChain(GmContour const& contour) {
     return true;
 }
 
+std::vector<CurveBox> reachesOf(GmContour const& contour) {
+    std::vector<CurveBox> reaches;
+    for (int i = 0; i < contour.ElementCount(); ++i)
+        reaches.push_back(reachOf(*contour.GetElement(i)));
+    return reaches;
+}
+
 void addPassagesBetween(Passages& passages, GmContour const& a, GmContour const& b) {
     const int countA = static_cast<int>(a.ElementCount());
+    const std::vector<CurveBox> reachesB = reachesOf(b);
     for (int i = 0; i < countA; ++i) {
+        GmCurve const& e = *a.GetElement(i);
+        const CurveBox reach = reachOf(e);
         for (int j = 0; j < b.ElementCount(); ++j) {
-            GmCurve const& e = *a.GetElement(i);
+            if (!reach.overlaps(reachesB[static_cast<std::size_t>(j)])) continue;
             GmCurve const& f = *b.GetElement(j);
             e.Intersection(&f);
             for (GmPoint const& p : e.GetPtSol())

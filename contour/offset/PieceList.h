@@ -5,7 +5,7 @@
 
 #include "contour/ContourElements.h"
 #include "contour/offset/OffsetElement.h"
-#include "contour/offset/PieceBox.h"
+#include "contour/CurveBox.h"
 
 namespace gmkernel_detail {
 
@@ -22,7 +22,7 @@ struct Piece {
 
     GmOffsetElement element;
     /// Pieces whose boxes are apart cannot cross.
-    PieceBox reach{};
+    CurveBox reach{};
     /// The point that stands for the piece when its distance from the source is judged.
     GmPoint halving;
     /// At its last test the piece kept its distance from every element then in the span. A split

@@ -4,6 +4,7 @@
 /// Every element moves by a vector that the quadrant of its direction chooses. Neighbours are
 /// trimmed or bridged; where the resulting chain crosses itself, walks from crossing to crossing
 /// take it apart into loops, of which those with the sense of the source are kept.
+#include "contour/CurveBox.h"
 #include "contour/GmContourArray.h"
 #include "contour/melt/LoopContour.h"
 #include "contour/melt/PassageWalk.h"
@@ -32,9 +33,15 @@ void addPassages(Passages& passages, CurveList const& curves, int i, int k, bool
 }
 
 void addPassagesAmong(Passages& passages, CurveList const& curves, bool closed) {
+    std::vector<CurveBox> reaches;
+    for (int i = 0; i < curves.Count(); ++i)
+        reaches.push_back(reachOf(curves[i]));
     for (int i = 0; i < curves.Count(); ++i) {
-        for (int k = i + 1; k < curves.Count(); ++k)
+        const CurveBox& reach = reaches[static_cast<std::size_t>(i)];
+        for (int k = i + 1; k < curves.Count(); ++k) {
+            if (!reach.overlaps(reaches[static_cast<std::size_t>(k)])) continue;
             addPassages(passages, curves, i, k, closed);
+        }
     }
 }
 

@@ -108,7 +108,7 @@ TEST(Insertion, BoxesCoverEveryPointThatAMembershipTestAccepts) {
                   below(2) == 0 ? GmBase::eRotCW : GmBase::eRotCCW);
         if (below(2) == 0) arc.SetSP(on(anyAngle()));
         if (below(2) == 0) arc.SetEP(on(anyAngle()));
-        const PieceBox box = reachOf(arc);
+        const CurveBox box = reachOf(arc);
         for (int k = 0; k < 100; ++k) {
             const GmPoint p = on(anyAngle());
             if (!arc.Element(p)) continue;

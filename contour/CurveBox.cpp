@@ -1,4 +1,4 @@
-#include "contour/offset/PieceBox.h"
+#include "contour/CurveBox.h"
 
 #include "gmkernel/GmArc.h"
 #include "gmkernel/GmRect.h"
@@ -33,9 +33,9 @@ GmRect arcReach(GmArc const& arc) {
 
 }  // namespace
 
-PieceBox reachOf(GmCurve const& piece) {
+CurveBox reachOf(GmCurve const& curve) {
     const GmRect box =
-        piece.IsArc() ? arcReach(static_cast<GmArc const&>(piece)) : piece.BoundingRect();
+        curve.IsArc() ? arcReach(static_cast<GmArc const&>(curve)) : curve.BoundingRect();
     return {box.Left() - kReachMargin, box.Right() + kReachMargin, box.Bottom() - kReachMargin,
             box.Top() + kReachMargin};
 }
