@@ -9,7 +9,6 @@ using namespace gmpath;
 
 namespace {
 
-constexpr double kPi = 3.14159265358979323846;
 constexpr double kRadiusTolerance = 1e-5;
 
 /// Signed sweep of an arc in radians.
@@ -89,6 +88,8 @@ private:
         move.centre = m_place + Vec2{valueOf('I', 0.0), valueOf('J', 0.0)};
         m_feed = valueOf('F', m_feed);
         m_motion = -1;
+        m_placed = m_placed || (m_words.count('X') > 0 && m_words.count('Y') > 0);
+        expect(m_placed || move.toZ >= m_safeZ, "X and Y before the tool goes down");
         expect(m_modes.size() == 6 && m_spindle, "modes and spindle set");
         expect(std::isfinite(length(move.to) + length(move.centre) + move.toZ), "finite numbers");
         move.kind == 0 ? checkRapid(move) : checkFeed(move);
@@ -124,6 +125,7 @@ private:
     bool m_spindle = false;
     bool m_ended = false;
     Vec2 m_place;
+    bool m_placed = false;
     double m_z = 0.0;
     double m_feed = 0.0;
 };

@@ -24,8 +24,8 @@ struct GcodeProgram {
 };
 
 /// Runs a program in the head. Faults are: words that the machine does not know, moves before the
-/// modes and the spindle are set or behind the end, arcs whose ends lie at radii that differ by
-/// more than 1e-5 or that turn by more than half a circle, rapid moves in x and y below the safe
-/// height or downwards, feeds sideways above the surface or without a speed, minus zeros, and an
-/// end below the safe height or with the spindle on.
+/// modes and the spindle are set or behind the end, going down from where the machine stands, arcs
+/// whose ends lie at radii that differ by more than 1e-5 or that turn by more than half a circle,
+/// rapid moves in x and y below the safe height or downwards, feeds sideways above the surface or
+/// without a speed, minus zeros, and an end below the safe height or with the spindle on.
 GcodeProgram readGcode(const std::string& text, double safeZ);

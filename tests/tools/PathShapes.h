@@ -7,7 +7,7 @@
 /// Paths for tests.
 namespace path_shapes {
 
-constexpr double kPi = 3.14159265358979323846;
+using gmpath::kPi;
 
 inline gmpath::Path polygon(const std::vector<gmpath::Vec2>& corners, bool closed = true) {
     gmpath::Path path{{}, closed, "0"};

@@ -112,7 +112,7 @@ TEST_F(Program, CornersAndMeltSayWhatTheyDid) {
     m_scratch.store("c.dxf", drawing(lightPolyline(rectangle({5, 0}, {15, 10}).elements, true)));
     const Outcome flush = run("melt a.dxf c.dxf -o m.svg");
     EXPECT_EQ(flush.exitCode, 1);
-    EXPECT_EQ(flush.err, "gmpath: A1 + B1: the loops do not make up both contours\n");
+    EXPECT_EQ(flush.err, "gmpath: A1 + B1: the loops are not outline and common parts\n");
 }
 
 TEST_F(Program, FaultyOffsetsAreNamedAndDashed) {
@@ -169,6 +169,7 @@ TEST_F(Program, BadInputIsOneLineAndExitCodeTwo) {
         {"toolpath " + kBracket + " --tool nan -o a.ngc", "--tool"},
         {"toolpath " + kBracket + " --tool 4 -o a.dxf", ".ngc or .svg"},
         {"toolpath " + kBracket + " --tool 4 --stock -1 -o a.ngc", "--stock"},
+        {"toolpath " + kBracket + " --tool 4 --lead 3 -o a.ngc", "--lead"},
         {"toolpath " + kBracket + " --tool 4 --lead spiral -o a.ngc", "--lead"},
         {"toolpath " + kBracket + " --tool 4 --lead-angle inf -o a.ngc", "--lead-angle"},
         {"toolpath " + kBracket + " --tool 4 --depth 20 --step-down 0.01 -o a.ngc", "--step-down"},

@@ -17,6 +17,10 @@ namespace {
 
 const Path kAngle = polygon({{0, 0}, {10, 0}, {10, 4}, {4, 4}, {4, 10}, {0, 10}});
 
+CornerResult broken(const Path& path, const CornerRequest& request) {
+    return breakCorners({path}, request).front();
+}
+
 /// The area that a corner of 90 degrees loses.
 double cutOff(CornerKind kind, double value) {
     switch (kind) {
@@ -42,7 +46,7 @@ TEST(Corners, ChosenOnesLoseOrGainWhatTheirShapeTells) {
         for (const CornerKind kind :
              {CornerKind::kRounding, CornerKind::kChamferDistance, CornerKind::kChamferLength}) {
             for (const auto& c : choices) {
-                const CornerResult result = breakCorners(path, {kind, 1.5, c.choice});
+                const CornerResult result = broken(path, {kind, 1.5, c.choice});
                 EXPECT_EQ(result.done, static_cast<std::size_t>(c.convex + c.concave));
                 EXPECT_EQ(result.notDone, 0U);
                 EXPECT_TRUE(result.path.closed);
@@ -55,16 +59,30 @@ TEST(Corners, ChosenOnesLoseOrGainWhatTheirShapeTells) {
 }
 
 TEST(Corners, WithoutRoomAreCountedAndStay) {
-    const CornerResult none = breakCorners(kAngle, {CornerKind::kChamferDistance, 10.5});
+    const CornerResult none = broken(kAngle, {CornerKind::kChamferDistance, 10.5});
     EXPECT_EQ(none.done, 0U);
     EXPECT_EQ(none.notDone, 6U);
     EXPECT_EQ(none.path.elements.size(), kAngle.elements.size());
-    EXPECT_EQ(breakCorners(circle({3, 3}, 2), {CornerKind::kRounding, 1}).done, 0U);
+    EXPECT_EQ(broken(circle({3, 3}, 2), {CornerKind::kRounding, 1}).done, 0U);
     // Open paths have no inside: every corner counts. The bend of half a degree is none.
     const Path open = polygon({{0, 0}, {10, 0}, {20, 0.08}, {20, 10}, {30, 10}}, false);
-    const CornerResult some = breakCorners(open, {CornerKind::kRounding, 1, CornerChoice::kConvex});
+    const CornerResult some = broken(open, {CornerKind::kRounding, 1, CornerChoice::kConvex});
     EXPECT_EQ(some.done, 2U);
     EXPECT_FALSE(some.path.closed);
+}
+
+TEST(Corners, TouchNeitherTheirContourNorAnother) {
+    // A spike comes near to the inner corner from within; a small hole lies in an outer corner,
+    // another one would be cut by the rounding.
+    const Path spiked =
+        polygon({{0, 0}, {30, 0}, {30, 5}, {5, 5}, {5, 15}, {5.8, 5.9}, {8, 15}, {5, 30}, {0, 30}});
+    const CornerResult result = broken(spiked, {CornerKind::kRounding, 4, CornerChoice::kConcave});
+    EXPECT_EQ(result.done, 0U);
+    const Path plate = rectangle({0, 0}, {30, 20});
+    const std::vector<CornerResult> results = breakCorners(
+        {plate, circle({0.6, 0.6}, 0.3), circle({28.5, 18.5}, 0.5)}, {CornerKind::kRounding, 5});
+    EXPECT_EQ(results[0].done, 2U);
+    EXPECT_EQ(results[0].notDone, 2U);
 }
 
 TEST(Melt, SortsLoopsOfEveryPairOfContours) {
@@ -94,5 +112,12 @@ TEST(Melt, AnswersPairsWithoutLoops) {
     EXPECT_EQ(meltContours({square}, {cap}).at(0).outcome, MeltOutcome::kApart);
     EXPECT_EQ(meltContours({square}, {circle({5, 5}, 2)}).at(0).outcome,
               MeltOutcome::kSecondInside);
+    EXPECT_EQ(meltContours({circle({5, 5}, 2)}, {circle({5, 5}, 2)}).at(0).outcome,
+              MeltOutcome::kSame);
+    // A corner on a side is no crossing; what the kernel makes of that does not pass for loops.
+    const Path diamond = polygon({{5, 0}, {10, 5}, {5, 10}, {0, 5}});
+    const Path wedge = polygon({{10, 5}, {4, 7}, {4, 3}});
+    for (const Path& touching : {diamond, wedge, square})
+        EXPECT_NE(meltContours({square}, {touching}).at(0).outcome, MeltOutcome::kLoops);
     EXPECT_TRUE(meltContours({square}, {polygon({{1, 1}, {5, 5}, {30, 4}}, false)}).empty());
 }

@@ -163,6 +163,17 @@ TEST(Toolpath, LeadsGiveWayToThePartAndItsNeighbours) {
     longest.lead.length = 1e9;
     const ToolpathResult hole = toolpath({contours[0], circle({40, 20}, 5)}, longest);
     EXPECT_EQ(hole.contours[1].leads.dropped, 2U);
+    // Nor does a tight arc pass between two looks at the wall of a hole little wider than the tool.
+    const std::vector<Path> slot = {rectangle({-90, -90}, {90, 90}), rectangle({0, 0}, {12, 6.03})};
+    ToolpathRequest tight = request(3.0, LeadKind::kArc);
+    tight.lead.radius = 0.02;
+    tight.lead.angle = 180.0;
+    for (const Path& lead : movesOfKind(toolpath(slot, tight).moves, MoveKind::kLead)) {
+        for (int i = 0; i <= 100; ++i) {
+            for (const Element& e : lead.elements)
+                EXPECT_GT(distance(slot[1], pointAt(e, 0.01 * i)), 3.0 - 2e-3);
+        }
+    }
     // Left alone, a lead has the size and the angle that were asked for.
     const ToolpathResult free = toolpath({contours[0]}, request(2.5, LeadKind::kArc));
     const std::vector<Path> leads = movesOfKind(free.moves, MoveKind::kLead);
@@ -292,7 +303,7 @@ TEST(GcodeWriter, RandomArcsStayConsistentWhenRounded) {
 TEST(GcodeWriter, CommentsCannotEndEarly) {
     const std::string text =
         gcodeOf({}, {Units::kInches, 1.0, 1.0, {}, 0.25, "a) M3 (b\n\xC3\xA9.dxf"});
-    EXPECT_EQ(text.substr(0, text.find('\n')), "(a] M3 [b???.dxf)");
+    EXPECT_EQ(text.substr(0, text.find('\n')), "(part a] M3 [b???.dxf)");
 }
 
 TEST(DrawingUnits, HeaderDecides) {

@@ -6,6 +6,7 @@
 #include <vector>
 
 #include "InputError.h"
+#include "NamedOption.h"
 #include "ShapeCommandLine.h"
 #include "Text.h"
 #include "ToolpathCommandLine.h"
@@ -49,13 +50,9 @@ CLI::App* addOffset(CLI::App& program, OffsetOptions& options) {
     offset->add_option("--count", options.count, "number of passes")->capture_default_str();
     offset->add_option("--step", options.step,
                        "distance from one pass to the next [the first distance]");
-    offset
-        ->add_option("--side", options.side,
-                     "waste (outside of outlines, inside of holes; open contours both), right, "
-                     "left, inside, outside or both")
-        ->type_name("NAME")
-        ->transform(CLI::Transformer(sideNames()).description(""))
-        ->default_str("waste");
+    addNamedOption(*offset, "--side", options.side, sideNames(),
+                   "waste (outside of outlines, inside of holes; open contours both), right, left, "
+                   "inside, outside or both [waste]");
     offset->add_option("-o,--output", options.outputs, "output file (.svg or .dxf), repeatable")
         ->required()
         ->allow_extra_args(false);

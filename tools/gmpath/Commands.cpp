@@ -66,8 +66,9 @@ void reportContours(const OffsetOptions& options, const std::vector<double>& dis
                     const std::vector<ContourOffsets>& offsets, const Console& console) {
     std::size_t paths = 0;
     for (std::size_t i = 0; i < offsets.size(); ++i) {
-        reportContour("gmpath: " + options.input.drawing + ": contour " + std::to_string(i + 1),
-                      distances, offsets[i], console);
+        reportContour(
+            "gmpath: " + printable(options.input.drawing) + ": contour " + std::to_string(i + 1),
+            distances, offsets[i], console);
         paths += offsets[i].paths.size();
     }
     console.out << counted(offsets.size(), "contour") << ", " << counted(paths, "offset") << "\n";
@@ -94,7 +95,7 @@ Part readInput(const InputOptions& options, const Console& console) {
     if (part.skipped.unusable.empty()) return part;
     const std::string line = options.drawing + ": " + unusableLine(part.skipped);
     if (options.strict) throw InputError(line);
-    console.err << "gmpath: " << line << "\n";
+    console.err << "gmpath: " << printable(line) << "\n";
     return part;
 }
 

@@ -2,6 +2,7 @@
 
 #include <cmath>
 
+#include "CornerRoom.h"
 #include "KernelShapes.h"
 #include "Measure.h"
 #include "gmkernel/GmContour.h"
@@ -10,7 +11,7 @@ namespace gmpath {
 
 namespace {
 
-constexpr double kSmallestBend = 3.14159265358979323846 / 180.0;
+constexpr double kSmallestBend = kPi / 180.0;
 
 /// The angle by which the path turns between two elements, positive to the left.
 double bend(const Element& first, const Element& second) {
@@ -38,6 +39,45 @@ GmContour::eTransType kernelType(CornerKind kind) {
     return GmContour::eTransRadius;
 }
 
+/// The element that a contour made itself, of a contour whose other elements it did not; -1 when
+/// there is none.
+int insertedElement(const GmContour& contour) {
+    for (int i = 0; i < contour.ElementCount(); ++i) {
+        if (contour.GetContElement(i)->bInserted) return i;
+    }
+    return -1;
+}
+
+/// Puts a transition into the corner where the element `index` ends, if there is room.
+bool breakCorner(GmContour& contour, std::size_t index, const CornerRoom& room,
+                 const CornerRequest& request) {
+    GmContour attempt(contour);
+    const int first = static_cast<int>(index);
+    const Vec2 corner = fromKernel(attempt.GetElement(first)->EP());
+    if (!attempt.AddTrans(kernelType(request.kind), first, request.value, true)) return false;
+    const int made = insertedElement(attempt);
+    if (made < 0 || !room.allows(attempt, made, corner)) return false;
+    contour = attempt;
+    return true;
+}
+
+CornerResult cornersBroken(const Path& contour, const CornerRoom& room,
+                           const CornerRequest& request) {
+    CornerResult result{contour};
+    const SimplifiedPath source = simplifiedForKernel(contour);
+    GmContour kernel;
+    result.accepted = fillContour(kernel, source);
+    if (!result.accepted) return result;
+    const std::vector<std::size_t> corners = cornersOf(source.path, request.choice);
+    // From the last one to the first, so that new elements do not move the corners still to do.
+    for (auto corner = corners.rbegin(); corner != corners.rend(); ++corner) {
+        const bool done = breakCorner(kernel, *corner, room, request);
+        ++(done ? result.done : result.notDone);
+    }
+    if (result.done > 0) result.path = pathFromKernel(kernel, contour.layer).path;
+    return result;
+}
+
 }  // namespace
 
 std::vector<std::size_t> cornersOf(const Path& path, CornerChoice choice) {
@@ -52,21 +92,12 @@ std::vector<std::size_t> cornersOf(const Path& path, CornerChoice choice) {
     return corners;
 }
 
-CornerResult breakCorners(const Path& contour, const CornerRequest& request) {
-    CornerResult result{contour};
-    const SimplifiedPath source = simplifiedForKernel(contour);
-    GmContour kernel;
-    result.accepted = fillContour(kernel, source);
-    if (!result.accepted) return result;
-    const std::vector<std::size_t> corners = cornersOf(source.path, request.choice);
-    // From the last one to the first, so that new elements do not move the corners still to do.
-    for (auto corner = corners.rbegin(); corner != corners.rend(); ++corner) {
-        const bool done = kernel.AddTrans(kernelType(request.kind), static_cast<int>(*corner),
-                                          request.value, true);
-        ++(done ? result.done : result.notDone);
-    }
-    if (result.done > 0) result.path = pathFromKernel(kernel, contour.layer).path;
-    return result;
+std::vector<CornerResult> breakCorners(const std::vector<Path>& contours,
+                                       const CornerRequest& request) {
+    std::vector<CornerResult> results;
+    for (std::size_t i = 0; i < contours.size(); ++i)
+        results.push_back(cornersBroken(contours[i], CornerRoom(contours, i), request));
+    return results;
 }
 
 }  // namespace gmpath

@@ -40,7 +40,11 @@ struct CornerResult {
 /// Joints that bend by less than a degree are no corners.
 std::vector<std::size_t> cornersOf(const Path& path, CornerChoice choice);
 
-/// Rounds or chamfers the corners of a contour.
-CornerResult breakCorners(const Path& contour, const CornerRequest& request);
+/// Rounds or chamfers the corners of every contour, from the last corner of a contour to its first.
+/// A transition has room where it fits between its two elements and touches nothing else: neither
+/// the rest of its contour nor another contour. One result a contour. Cost: the square of the
+/// number of elements.
+std::vector<CornerResult> breakCorners(const std::vector<Path>& contours,
+                                       const CornerRequest& request);
 
 }  // namespace gmpath

@@ -44,11 +44,9 @@ bool runCorners(const CornersOptions& options, const Console& console) {
     checkOutputs(options.outputs, options.input.drawing);
     const Part part = readInput(options.input, console);
     ResultDrawing drawing{part.contours, {}, {nameOf(request)}, {}, true};
-    std::vector<CornerResult> results;
-    for (const Path& contour : part.contours) {
-        results.push_back(breakCorners(contour, request));
-        drawing.results.push_back({{0, results.back().path, !results.back().accepted}});
-    }
+    const std::vector<CornerResult> results = breakCorners(part.contours, request);
+    for (const CornerResult& result : results)
+        drawing.results.push_back({{0, result.path, !result.accepted}});
     writeOutputs(drawing, options.outputs);
 
     std::size_t done = 0;

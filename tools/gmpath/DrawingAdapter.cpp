@@ -6,7 +6,6 @@ namespace gmpath {
 
 namespace {
 
-constexpr double kPi = 3.14159265358979323846;
 constexpr double kRadiansPerDegree = kPi / 180.0;
 
 /// Largest sideways part of a plane's unit normal that still counts as upright.

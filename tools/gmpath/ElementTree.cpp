@@ -25,6 +25,14 @@ bool ElementTree::comesNearer(Vec2 p, double r) const {
     return !m_nodes.empty() && comesNearer(0, p, r);
 }
 
+double ElementTree::distanceWithin(Vec2 p, double farthest) const {
+    return m_nodes.empty() ? farthest : distanceWithin(0, p, farthest);
+}
+
+Box ElementTree::box() const {
+    return m_nodes.empty() ? Box() : m_nodes.front().box;
+}
+
 void ElementTree::build(std::size_t first, std::size_t last) {
     const std::size_t index = m_nodes.size();
     m_nodes.push_back({{}, first, last, 0});
@@ -48,6 +56,17 @@ bool ElementTree::comesNearer(std::size_t index, Vec2 p, double r) const {
     const auto isNearer = [&](const Element& e) { return distance(e, p) < r; };
     return std::any_of(m_elements.begin() + static_cast<std::ptrdiff_t>(node.first),
                        m_elements.begin() + static_cast<std::ptrdiff_t>(node.last), isNearer);
+}
+
+double ElementTree::distanceWithin(std::size_t index, Vec2 p, double farthest) const {
+    const Node& node = m_nodes[index];
+    if (!(distance(node.box, p) < farthest)) return farthest;
+    if (node.second != 0) {
+        return distanceWithin(node.second, p, distanceWithin(index + 1, p, farthest));
+    }
+    for (std::size_t i = node.first; i < node.last; ++i)
+        farthest = std::min(farthest, distance(m_elements[i], p));
+    return farthest;
 }
 
 }  // namespace gmpath

@@ -16,6 +16,12 @@ public:
     /// True when some element comes nearer to p than r.
     bool comesNearer(Vec2 p, double r) const;
 
+    /// The distance from p to the nearest element, at most `farthest`.
+    double distanceWithin(Vec2 p, double farthest) const;
+
+    /// The box of all elements.
+    Box box() const;
+
 private:
     /// The box of a run of elements. The boxes of its halves are the next node and `second`; short
     /// runs are not halved.
@@ -28,6 +34,7 @@ private:
 
     void build(std::size_t first, std::size_t last);
     bool comesNearer(std::size_t index, Vec2 p, double r) const;
+    double distanceWithin(std::size_t index, Vec2 p, double farthest) const;
 
     std::vector<Element> m_elements;
     std::vector<Node> m_nodes;

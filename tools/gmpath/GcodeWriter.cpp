@@ -1,6 +1,7 @@
 #include "GcodeWriter.h"
 
 #include <cmath>
+#include <optional>
 
 #include "Text.h"
 
@@ -62,7 +63,7 @@ public:
 private:
     void writeHead() {
         const bool inches = m_settings.units == Units::kInches;
-        m_text += comment(m_settings.partName);
+        m_text += comment("part " + m_settings.partName);
         m_text += comment("tool diameter " + formatReal(m_settings.toolDiameter) +
                           (inches ? " in" : " mm"));
         m_text += inches ? "G20\n" : "G21\n";
@@ -84,7 +85,7 @@ private:
             m_text += word('Z', move.z) + feedWord(move.kind) + "\n";
         }
         for (const Element& e : move.path.elements)
-            write(move.kind, {m_place, rounded(e.ep), e.bulge});
+            write(move.kind, {m_place.value_or(Vec2{}), rounded(e.ep), e.bulge});
     }
 
     void write(MoveKind kind, const Element& e) {
@@ -126,7 +127,7 @@ private:
 
     const MachineSettings& m_settings;
     std::string m_text;
-    Vec2 m_place;
+    std::optional<Vec2> m_place;  ///< unknown until the first move to a point
     double m_feed = 0.0;
     std::optional<std::size_t> m_contour;
 };

@@ -11,8 +11,6 @@ namespace gmpath {
 
 namespace {
 
-constexpr double kPi = 3.14159265358979323846;
-
 /// The arc as elements that start and end exactly at the kernel's end points.
 void appendKernelArc(std::vector<Element>& elements, const GmArc& arc) {
     const Vec2 m = fromKernel(arc.M());

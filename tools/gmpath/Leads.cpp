@@ -10,7 +10,7 @@ namespace gmpath {
 
 namespace {
 
-constexpr int kHalvings = 3;
+constexpr int kHalvings = 6;
 
 int kernelKind(LeadKind kind) {
     constexpr int kPerpendicularMove = 1;
@@ -97,7 +97,8 @@ Lead clearLead(const Path& cut, LeadEnd end, const LeadShape& shape, PartSide pa
     LeadShape tried = shape;
     for (int halving = 0; halving <= kHalvings; ++halving) {
         const Path path = leadPath(cut, end, tried, part);
-        if (!path.elements.empty() && obstacles.keepClear(path, clearance)) {
+        if (path.elements.empty()) return {{}, 0.0, false, halving == 0};
+        if (obstacles.keepClear(path, clearance)) {
             const double size = shape.kind == LeadKind::kArc ? tried.radius : tried.length;
             return {path, size, halving > 0};
         }

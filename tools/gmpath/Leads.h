@@ -27,10 +27,11 @@ struct Lead {
     Path path;          ///< ends, or starts, exactly at the end of the cut; empty without a lead
     double size = 0.0;  ///< length or radius that is left
     bool shortened = false;
+    bool tooSmall = false;  ///< there is none because one of the size asked for cannot be built
 };
 
 /// The lead to the start of a cut or off its end. When it comes nearer to an obstacle than the
-/// clearance it is halved in size, up to three times; then it is left out.
+/// clearance it is halved in size, up to six times; then it is left out.
 Lead clearLead(const Path& cut, LeadEnd end, const LeadShape& shape, PartSide part,
                const Obstacles& obstacles, double clearance);
 

@@ -15,6 +15,11 @@ struct Box {
     void include(const Box& other);
     /// True when the other box lies in this one, borders included. An empty box lies in every box.
     bool holds(const Box& other) const;
+    /// True when the boxes have a point in common. An empty box has none.
+    bool overlaps(const Box& other) const {
+        return low.x <= other.high.x && other.low.x <= high.x && low.y <= other.high.y &&
+               other.low.y <= high.y;
+    }
     /// The box grown by `margin` on every side.
     Box grown(double margin) const;
 };

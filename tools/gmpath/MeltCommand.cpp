@@ -35,8 +35,12 @@ std::string outcomeText(const MeltedPair& pair) {
             return "no loops, " + labelOf("A", pair.first) + " lies inside";
         case MeltOutcome::kSecondInside:
             return "no loops, " + labelOf("B", pair.second) + " lies inside";
+        case MeltOutcome::kSame:
+            return "no loops, they are the same";
+        case MeltOutcome::kRefused:
+            return "the kernel cannot take one of them over";
         case MeltOutcome::kFailed:
-            return "the loops do not make up both contours";
+            return "the loops are not outline and common parts";
         case MeltOutcome::kApart:
             break;
     }
@@ -84,7 +88,8 @@ bool runMelt(const MeltOptions& options, const Console& console) {
     std::size_t melted = 0;
     bool sound = true;
     for (const MeltedPair& pair : pairs) {
-        const bool failed = pair.outcome == MeltOutcome::kFailed;
+        const bool failed =
+            pair.outcome == MeltOutcome::kFailed || pair.outcome == MeltOutcome::kRefused;
         melted += pair.outcome == MeltOutcome::kLoops ? 1 : 0;
         sound = sound && !failed;
         if (failed)

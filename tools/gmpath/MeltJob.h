@@ -24,7 +24,9 @@ enum class MeltOutcome {
     kApart,         ///< they do not overlap
     kFirstInside,   ///< the first lies inside the second
     kSecondInside,  ///< the second lies inside the first
-    kFailed         ///< they meet, and the loops do not have the areas that they must have
+    kSame,          ///< they run along each other all the way
+    kFailed,        ///< they meet, and the loops are not outline and common parts of them
+    kRefused        ///< the kernel cannot take one of them over
 };
 
 /// Two contours, by index, whose boxes overlap.
@@ -38,9 +40,10 @@ struct MeltedPair {
 /// Melts the closed contours of one list with those of the other, pair by pair; pairs whose boxes
 /// are apart are left out. All contours count as counter-clockwise.
 ///
-/// The outlines less the holes they close in, and the common parts, together have the areas of both
-/// contours. Where the kernel's loops do not, as when sides lie flush on each other, the pair
-/// counts as failed, with the loops that came.
+/// The loops are compared with their contours: there is one outline, besides holes that both close
+/// in; no point of an outline lies inside a contour, none of a common part outside; and the areas
+/// add up to those of the contours. Where the kernel's loops do not, as when sides lie flush on
+/// each other or a corner on a side, the pair counts as failed, with the loops that came.
 std::vector<MeltedPair> meltContours(const std::vector<Path>& first,
                                      const std::vector<Path>& second);
 

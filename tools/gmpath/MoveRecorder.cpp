@@ -7,7 +7,7 @@ MoveRecorder::MoveRecorder(double safeZ) : m_safeZ(safeZ) {
 }
 
 void MoveRecorder::rapidTo(Vec2 p) {
-    if (distance(m_place, p) < kKernelTolerance) return;
+    if (m_placed && distance(m_place, p) < kKernelTolerance) return;
     lift();
     follow(MoveKind::kRapid, {{{m_place, p}}, false, {}});
 }
@@ -20,6 +20,7 @@ void MoveRecorder::follow(MoveKind kind, const Path& path) {
     if (path.elements.empty()) return;
     m_moves.push_back({kind, path, m_z, m_contour});
     m_place = path.elements.back().ep;
+    m_placed = true;
 }
 
 void MoveRecorder::lift() {

@@ -7,7 +7,8 @@ namespace gmpath {
 /// Writes down the moves of a tool and knows where it is.
 class MoveRecorder {
 public:
-    /// The tool rises to the safe height above the origin first.
+    /// The tool rises to the safe height first. Where it stands is not known until it has gone to a
+    /// point; up to then it counts as standing above the origin.
     explicit MoveRecorder(double safeZ);
 
     Vec2 place() const { return m_place; }
@@ -34,6 +35,7 @@ private:
 
     double m_safeZ;
     Vec2 m_place;
+    bool m_placed = false;  ///< the tool has gone to a point
     double m_z = 0.0;
     std::size_t m_contour = 0;
     Toolpath m_moves;

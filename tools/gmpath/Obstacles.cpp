@@ -1,7 +1,9 @@
 // Clearance is tested by marching along the path. The distance to the contours changes by no more
 // than the way gone, so from a point with room to spare the march may go on by as much as there is
-// to spare. Where there is none, as beside the edge that is being cut, it goes on by a small part
-// of the clearance; a corner between two such steps is missed by the square of that part.
+// to spare. Where there is none, as beside the edge that is being cut, it goes on by a step s so
+// small that what lies between two points is hardly nearer: the distance dips by at most
+// s^2/8 (1/r + 1/c) there, r the radius of the path and c the clearance, which is how far the
+// centre of the distance's own curve, a corner of the obstacle, is away.
 
 #include "Obstacles.h"
 
@@ -11,38 +13,30 @@ namespace gmpath {
 
 namespace {
 
-/// Least step of the march and its slack, in clearances.
-constexpr double kLeastStep = 0.02;
-constexpr double kRelativeSlack = 5e-5;
-
 /// An element that is not through after so many steps, enormous beside the clearance and near to an
 /// obstacle all along, counts as too near.
 constexpr int kMostSteps = 100'000;
 
-/// Offsets keep their distance within this, in units of the drawing.
-constexpr double kOffsetSlack = 5.0 * kKernelTolerance;
+/// Half the accuracy of offsets, in units of the drawing and in its sizes: one half for the points
+/// of the march, one for what lies between them.
+constexpr double kLeastSlack = 5e-4;
+constexpr double kSlackOfSize = 5e-7;
 
-double distanceToBox(const Box& box, Vec2 p) {
-    const Vec2 nearest{std::clamp(p.x, box.low.x, box.high.x),
-                       std::clamp(p.y, box.low.y, box.high.y)};
-    return distance(nearest, p);
-}
-
-bool overlap(const Box& a, const Box& b) {
-    return a.low.x <= b.high.x && b.low.x <= a.high.x && a.low.y <= b.high.y && b.low.y <= a.high.y;
+double leastStep(const Element& e, double clearance, double slack) {
+    return std::sqrt(8.0 * slack / (1.0 / radius(e) + 1.0 / clearance));
 }
 
 /// March along the element; `distanceAt` tells the distance of a point from all that is near.
 template <typename DistanceAt>
-bool staysAway(const Element& e, double clearance, const DistanceAt& distanceAt) {
+bool staysAway(const Element& e, double clearance, double slack, const DistanceAt& distanceAt) {
     const double len = length(e);
-    const double slack = kOffsetSlack + kRelativeSlack * clearance;
+    const double least = leastStep(e, clearance, slack);
     double along = 0.0;
     for (int step = 0; step < kMostSteps; ++step) {
         const double found = distanceAt(pointAt(e, len > 0.0 ? along / len : 0.0));
         if (found < clearance - slack) return false;
         if (along >= len) return true;
-        along = std::min(len, along + std::max(found - clearance, kLeastStep * clearance));
+        along = std::min(len, along + std::max(found - clearance, least));
     }
     return false;
 }
@@ -50,16 +44,20 @@ bool staysAway(const Element& e, double clearance, const DistanceAt& distanceAt)
 }  // namespace
 
 Obstacles::Obstacles(const std::vector<Path>& contours) {
-    for (const Path& path : contours)
-        m_obstacles.push_back({&path, boundingBox(path)});
+    Box all;
+    for (const Path& path : contours) {
+        m_obstacles.emplace_back(path.elements);
+        all.include(m_obstacles.back().box());
+    }
+    m_slack = std::max(kLeastSlack, kSlackOfSize * length(all.size()));
 }
 
-Obstacles::Nearby Obstacles::nearby(const Element& e, double reach,
-                                    std::optional<std::size_t> except) const {
+std::vector<const ElementTree*> Obstacles::nearby(const Element& e, double reach,
+                                                  std::optional<std::size_t> except) const {
     const Box room = boundingBox({{e}, false, {}}).grown(reach);
-    Nearby found;
+    std::vector<const ElementTree*> found;
     for (std::size_t i = 0; i < m_obstacles.size(); ++i) {
-        if (i != except && overlap(room, m_obstacles[i].box)) found.push_back(&m_obstacles[i]);
+        if (i != except && room.overlaps(m_obstacles[i].box())) found.push_back(&m_obstacles[i]);
     }
     return found;
 }
@@ -67,16 +65,15 @@ Obstacles::Nearby Obstacles::nearby(const Element& e, double reach,
 bool Obstacles::keepClear(const Path& path, double clearance,
                           std::optional<std::size_t> except) const {
     const auto keepsClear = [&](const Element& e) {
-        const Nearby obstacles = nearby(e, clearance, except);
+        const std::vector<const ElementTree*> obstacles = nearby(e, clearance, except);
+        // Twice the clearance is room enough to tell of.
         const auto room = [&](Vec2 p) {
-            double nearest = HUGE_VAL;
-            for (const Obstacle* obstacle : obstacles) {
-                if (distanceToBox(obstacle->box, p) >= nearest) continue;
-                nearest = std::min(nearest, distance(*obstacle->path, p));
-            }
+            double nearest = 2.0 * clearance;
+            for (const ElementTree* obstacle : obstacles)
+                nearest = obstacle->distanceWithin(p, nearest);
             return nearest;
         };
-        return staysAway(e, clearance, room);
+        return obstacles.empty() || staysAway(e, clearance, m_slack, room);
     };
     return std::all_of(path.elements.begin(), path.elements.end(), keepsClear);
 }

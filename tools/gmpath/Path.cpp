@@ -7,8 +7,6 @@ namespace gmpath {
 
 namespace {
 
-constexpr double kPi = 3.14159265358979323846;
-
 /// Arcs that turn further than this are halved.
 constexpr double kMaxSweep = 300.0 / 180.0 * kPi;
 
@@ -35,6 +33,12 @@ double length(const Path& path) {
     for (const Element& e : path.elements)
         sum += length(e);
     return sum;
+}
+
+const Element& longestElement(const Path& path) {
+    return *std::max_element(
+        path.elements.begin(), path.elements.end(),
+        [](const Element& a, const Element& b) { return length(a) < length(b); });
 }
 
 Path reversed(const Path& path) {

@@ -20,6 +20,9 @@ std::size_t arcCount(const Path& path);
 /// Length along the path, 0 for a path without elements.
 double length(const Path& path);
 
+/// The longest element, the first of equal ones; the path must have an element.
+const Element& longestElement(const Path& path);
+
 /// The path run the other way; closed paths keep their start point.
 Path reversed(const Path& path);
 

@@ -6,8 +6,6 @@ namespace gmpath {
 
 namespace {
 
-constexpr double kPi = 3.14159265358979323846;
-
 /// Nearer to a joint than this no element is split.
 constexpr double kJointReach = 10.0 * kKernelTolerance;
 

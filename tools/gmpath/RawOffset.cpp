@@ -6,8 +6,6 @@ namespace gmpath {
 
 namespace {
 
-constexpr double kPi = 3.14159265358979323846;
-
 /// A corner that turns back this nearly, in radians, opens to both sides.
 constexpr double kTurnsBack = 1e-6;
 

@@ -9,8 +9,6 @@ namespace gmpath {
 
 namespace {
 
-constexpr double kPi = 3.14159265358979323846;
-
 /// Sizes as fractions of the picture's diagonal.
 constexpr double kMarginFraction = 0.03;
 constexpr double kLegendFraction = 0.014;

@@ -24,7 +24,8 @@ struct Move {
 };
 
 /// The moves of a whole job, each from where the one before ends. The surface of the material is at
-/// z = 0, the first move goes up to the safe height above the origin.
+/// z = 0. The first move goes up to the safe height, the second to a point from wherever the tool
+/// stands, which counts as the origin.
 using Toolpath = std::vector<Move>;
 
 /// Length of all moves of a kind, up and down included.

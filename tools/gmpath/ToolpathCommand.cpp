@@ -55,6 +55,13 @@ std::string remark(const ContourCut& cut) {
 
 void reportContours(const std::string& drawing, const std::vector<ContourCut>& cuts,
                     const Console& console) {
+    const auto twoSided = std::count_if(cuts.begin(), cuts.end(),
+                                        [](const ContourCut& cut) { return cut.bothSides; });
+    if (twoSided > 0) {
+        console.err << "gmpath: " << printable(drawing) << ": "
+                    << counted(static_cast<std::size_t>(twoSided), "open contour")
+                    << " cut on both sides\n";
+    }
     for (std::size_t i = 0; i < cuts.size(); ++i) {
         const std::string text = remark(cuts[i]);
         if (text.empty()) continue;
@@ -102,8 +109,9 @@ bool runToolpath(const ToolpathOptions& options, const Console& console) {
     progress.clear();
     reportContours(options.input.drawing, result.contours, console);
     console.out << summary(result, units);
-    return std::all_of(result.contours.begin(), result.contours.end(),
-                       [](const ContourCut& cut) { return cut.accepted && cut.faults.empty(); });
+    return std::all_of(result.contours.begin(), result.contours.end(), [](const ContourCut& cut) {
+        return cut.accepted && cut.faults.empty() && cut.keepsOthers;
+    });
 }
 
 }  // namespace gmpath

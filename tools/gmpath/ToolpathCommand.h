@@ -34,7 +34,7 @@ struct ToolpathOptions {
 /// Computes the moves of a tool round every contour and writes the outputs. Contours that the tool
 /// does not fit into, and leads without room, are reported. Throws InputError for input, options
 /// and outputs that cannot be used; then no output is written. False when some offset has a fault,
-/// and is not cut, or could not be made.
+/// and is not cut, or could not be made, and when a cut comes too near to another contour.
 bool runToolpath(const ToolpathOptions& options, const Console& console);
 
 }  // namespace gmpath

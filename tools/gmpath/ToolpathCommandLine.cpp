@@ -3,6 +3,8 @@
 #include <map>
 #include <string>
 
+#include "NamedOption.h"
+
 namespace gmpath {
 
 namespace {
@@ -37,11 +39,8 @@ void addPassOptions(CLI::App& command, ToolpathOptions& options) {
 }
 
 void addLeadOptions(CLI::App& command, ToolpathOptions& options) {
-    command
-        .add_option("--lead", options.lead,
-                    "none, line (along the cut), perpendicular or arc [none]")
-        ->type_name("NAME")
-        ->transform(CLI::Transformer(leadNames()).description(""));
+    addNamedOption(command, "--lead", options.lead, leadNames(),
+                   "none, line (along the cut), perpendicular or arc [none]");
     command.add_option("--lead-length", options.leadLength,
                        "length of straight leads [radius of the tool]");
     command.add_option("--lead-radius", options.leadRadius,
@@ -58,9 +57,8 @@ void addMachineOptions(CLI::App& command, ToolpathOptions& options) {
     command.add_option("--feed", options.feed, "speed of cuts a minute [1000 mm, 40 in]");
     command.add_option("--plunge", options.plunge, "speed downwards a minute [a third of --feed]");
     command.add_option("--spindle", options.spindle, "turns of the tool a minute");
-    command.add_option("--units", options.units, "mm or inch [those of the drawing, else mm]")
-        ->type_name("NAME")
-        ->transform(CLI::Transformer(unitNames()).description(""));
+    addNamedOption(command, "--units", options.units, unitNames(),
+                   "mm or inch [those of the drawing, else mm]");
 }
 
 }  // namespace

@@ -18,6 +18,7 @@ struct ContourRuns {
     std::vector<Pass> passes;  ///< none of them empty
     bool accepted = true;
     bool fits = true;
+    bool bothSides = false;
     std::vector<FaultyOffset> faults;
     std::vector<Path> doubtful;
 
@@ -31,8 +32,10 @@ struct ContourRuns {
 ContourRuns runsOf(const Path& contour, int depth, const ToolpathRequest& request) {
     ContourRuns result;
     for (const double distance : request.distances) {
+        const std::vector<double> sides = signedDistances(contour, depth, Side::kWaste, distance);
+        const std::size_t faultsBefore = result.faults.size();
         Pass pass;
-        for (const double d : signedDistances(contour, depth, Side::kWaste, distance)) {
+        for (const double d : sides) {
             ToolRuns found = toolRuns(contour, d, request.part);
             result.accepted = result.accepted && found.accepted;
             if (found.fault != OffsetFault::kNone) {
@@ -41,7 +44,8 @@ ContourRuns runsOf(const Path& contour, int depth, const ToolpathRequest& reques
                 std::move(found.runs.begin(), found.runs.end(), std::back_inserter(pass));
             }
         }
-        result.fits = !pass.empty() || !result.faults.empty();
+        result.bothSides = sides.size() > 1;
+        result.fits = !pass.empty() || result.faults.size() > faultsBefore;
         if (!pass.empty()) result.passes.push_back(std::move(pass));
     }
     return result;
@@ -76,6 +80,7 @@ public:
         m_cut = {};
         m_cut.accepted = runs.accepted;
         m_cut.fits = runs.fits;
+        m_cut.bothSides = runs.bothSides;
         m_cut.faults = runs.faults;
         m_cut.doubtful = runs.doubtful;
         for (Pass pass : runs.passes) {
@@ -110,7 +115,8 @@ private:
         if (m_request.lead.kind == LeadKind::kNone) return {};
         Lead lead = clearLead(cut, end, m_request.lead, m_request.part, m_obstacles, clearance());
         const bool made = !lead.path.elements.empty();
-        ++(made ? m_cut.leads.made : m_cut.leads.dropped);
+        std::size_t& missing = lead.tooSmall ? m_cut.leads.tooSmall : m_cut.leads.dropped;
+        ++(made ? m_cut.leads.made : missing);
         if (lead.shortened) {
             ++m_cut.leads.shortened;
             m_cut.leads.smallest = std::min(m_cut.leads.smallest, lead.size);

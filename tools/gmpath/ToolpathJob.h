@@ -22,7 +22,8 @@ struct ToolpathRequest {
 struct LeadTally {
     std::size_t made = 0;  ///< the shortened ones included
     std::size_t shortened = 0;
-    std::size_t dropped = 0;
+    std::size_t dropped = 0;     ///< for want of room
+    std::size_t tooSmall = 0;    ///< left out because they are too small to be built
     double smallest = HUGE_VAL;  ///< least size of the shortened ones
 };
 
@@ -30,6 +31,7 @@ struct LeadTally {
 struct ContourCut {
     bool accepted = true;              ///< false when the kernel refused the contour
     bool fits = true;                  ///< false when nothing is left for the last pass
+    bool bothSides = false;            ///< the contour has no waste side and is cut on both
     bool keepsOthers = true;           ///< false when its cuts come too near to another contour
     std::vector<FaultyOffset> faults;  ///< offsets that do not stand the check; they are not cut
     std::vector<Path> doubtful;        ///< the results of those offsets

@@ -13,14 +13,11 @@ constexpr double kSamePlace = 1e-3;
 /// True when the contour lies right of the offset at the distance d from it: stepping to the right
 /// off the longest element comes nearer to the contour.
 bool liesOnRight(const Path& contour, const Path& offset, double d) {
-    const Element* longest = &offset.elements.front();
-    for (const Element& e : offset.elements) {
-        if (length(e) > length(*longest)) longest = &e;
-    }
     constexpr double kStepOfDistance = 0.01;
-    const Vec2 p = halvingPoint(*longest);
+    const Element& longest = longestElement(offset);
+    const Vec2 p = halvingPoint(longest);
     // The chord of an arc runs like the tangent at its halving point.
-    const Vec2 step = kStepOfDistance * std::abs(d) * rightNormal(unit(longest->ep - longest->sp));
+    const Vec2 step = kStepOfDistance * std::abs(d) * rightNormal(unit(longest.ep - longest.sp));
     return distance(contour, p + step) < distance(contour, p - step);
 }
 

@@ -1,5 +1,6 @@
 #include "ToolpathSettings.h"
 
+#include <algorithm>
 #include <cmath>
 #include <filesystem>
 
@@ -109,7 +110,8 @@ MachineSettings machineSettings(const ToolpathOptions& options, Units units) {
     MachineSettings settings;
     settings.units = units;
     settings.feed = options.feed.value_or(defaultsOf(units).feed);
-    settings.plunge = options.plunge.value_or(kPlungeOfFeed * settings.feed);
+    settings.plunge =
+        options.plunge.value_or(std::max(kPlungeOfFeed * settings.feed, kSmallestProgramValue));
     settings.spindle = options.spindle;
     settings.toolDiameter = options.tool;
     settings.partName = std::filesystem::path(options.input.drawing).filename().string();

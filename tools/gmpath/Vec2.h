@@ -4,6 +4,8 @@
 
 namespace gmpath {
 
+constexpr double kPi = 3.14159265358979323846;
+
 /// A point or a vector of the drawing plane, in drawing units.
 struct Vec2 {
     double x = 0.0;
