@@ -33,6 +33,10 @@ GmRect arcReach(GmArc const& arc) {
 
 }  // namespace
 
+CurveBox boxOf(GmPoint const& p) {
+    return {p.X(), p.X(), p.Y(), p.Y()};
+}
+
 CurveBox reachOf(GmCurve const& curve) {
     const GmRect box =
         curve.IsArc() ? arcReach(static_cast<GmArc const&>(curve)) : curve.BoundingRect();

@@ -1,5 +1,7 @@
 #pragma once
 
+#include <algorithm>
+
 #include "gmkernel/GmCurve.h"
 
 namespace gmkernel_detail {
@@ -16,7 +18,20 @@ struct CurveBox {
         return left <= other.right && other.left <= right && bottom <= other.top &&
                other.bottom <= top;
     }
+    /// Bounds that are no number change nothing.
+    void include(CurveBox const& other) {
+        left = std::min(left, other.left);
+        right = std::max(right, other.right);
+        bottom = std::min(bottom, other.bottom);
+        top = std::max(top, other.top);
+    }
+    CurveBox grown(double margin) const {
+        return {left - margin, right + margin, bottom - margin, top + margin};
+    }
 };
+
+/// The box of a single point.
+CurveBox boxOf(GmPoint const& p);
 
 /// The box of every point that the membership tests of a segment or an arc can accept: its bounding
 /// rectangle, grown by twice the loosest membership tolerance. Curves whose boxes are apart have no

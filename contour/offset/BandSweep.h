@@ -1,8 +1,8 @@
 #pragma once
 
-#include "contour/offset/PieceList.h"
+#include "contour/offset/ActivePieces.h"
+#include "contour/offset/Removal.h"
 #include "gmkernel/GmContElement.h"
-#include "gmkernel/GmContour.h"
 
 namespace gmkernel_detail {
 
@@ -22,14 +22,14 @@ public:
     PieceList finish();
 
 private:
-    bool advanceSpan(GmCurve const& element);
+    void advanceSpan(GmCurve const& element);
     void retire();
 
     double m_d;
     int m_spanSize;
-    int m_index = -1;      ///< index of the newest element
-    GmContour m_span;      ///< clones of the most recent elements
-    PieceList m_active;    ///< pieces still cut by and tested against new ones
+    int m_index = -1;   ///< index of the newest element
+    SourceSpan m_span;  ///< clones of the most recent elements
+    ActivePieces m_active;
     PieceList m_finished;  ///< retired pieces
 };
 

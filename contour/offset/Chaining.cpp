@@ -11,13 +11,23 @@ constexpr double kJointGap = 3.0;
 /// Pieces below this length are left out of the results, in length units.
 constexpr double kShortestPiece = 0.001;
 
-bool startsAt(Piece const& piece, GmPoint const& p) {
-    return piece.element.curve().SP().Dist(p) < kJointGap * GmBase::m_scdPrec;
-}
+/// Tells the pieces that start at a point, most of the others by their boxes.
+class StartsAt {
+public:
+    explicit StartsAt(GmPoint const& p) : m_point(p), m_box(boxOf(p)) {}
+
+    bool operator()(Piece const& piece) const {
+        return m_box.overlaps(piece.reach) &&
+               piece.element.curve().SP().Dist(m_point) < kJointGap * GmBase::m_scdPrec;
+    }
+
+private:
+    GmPoint m_point;
+    CurveBox m_box;
+};
 
 bool anyStartsAt(PieceList const& pieces, GmPoint const& p) {
-    return std::any_of(pieces.begin(), pieces.end(),
-                       [&](Piece const& piece) { return startsAt(piece, p); });
+    return std::any_of(pieces.begin(), pieces.end(), StartsAt(p));
 }
 
 /// The piece with the smallest identifier, the first of equals, alone in a new chain.
@@ -44,7 +54,7 @@ void growBackward(PieceList& chain, PieceList& pieces) {
 /// The piece that goes on at a point: the only one that starts there, or of several the first that
 /// leads on to another piece, else the first. The end of the list when there is none.
 PieceList::iterator nextPiece(PieceList& pieces, GmPoint const& end) {
-    const auto starts = [&](Piece const& piece) { return startsAt(piece, end); };
+    const StartsAt starts(end);
     const auto first = std::find_if(pieces.begin(), pieces.end(), starts);
     if (first == pieces.end()) return first;
     if (std::find_if(std::next(first), pieces.end(), starts) == pieces.end()) return first;

@@ -4,8 +4,8 @@
 #include <utility>
 
 #include "contour/ContourElements.h"
-#include "contour/offset/OffsetElement.h"
 #include "contour/CurveBox.h"
+#include "contour/offset/OffsetElement.h"
 
 namespace gmkernel_detail {
 

@@ -10,28 +10,38 @@ namespace {
 
 /// Is a point nearer to one of the last `count` elements of the span than `threshold`? The newest
 /// elements, which are the most likely ones, come first.
-bool isNear(GmPoint const& p, GmContour const& span, int count, double threshold) {
-    const int size = static_cast<int>(span.ElementCount());
+bool isNear(GmPoint const& p, SourceSpan const& span, int count, double threshold) {
+    const CurveBox place = boxOf(p);
+    const int size = static_cast<int>(span.nearby.size());
     for (int i = size - 1; i >= size - count; --i) {
-        if (Distance(p, *span.GetElement(i)) < threshold) return true;
+        if (!place.overlaps(span.nearby[static_cast<std::size_t>(i)])) continue;
+        if (Distance(p, *span.elements.GetElement(i)) < threshold) return true;
     }
     return false;
 }
 
-}  // namespace
-
-void removeNearPieces(PieceList& active, GmContour const& span, bool spanGrew, double d) {
-    const double threshold = std::fabs(std::fabs(d) - GmBase::m_scdPrecCalc);
-    const int all = static_cast<int>(span.ElementCount());
-    const int newest = spanGrew && all > 0 ? 1 : 0;
-    for (auto piece = active.begin(); piece != active.end();) {
+void removeFromRun(PieceRun& run, SourceSpan const& span, int newest, double threshold) {
+    const int all = static_cast<int>(span.nearby.size());
+    for (auto piece = run.pieces.begin(); piece != run.pieces.end();) {
         const int count = piece->keepsDistance ? newest : all;
         if (isNear(piece->halving, span, count, threshold)) {
-            piece = active.erase(piece);
+            piece = run.pieces.erase(piece);
         } else {
             piece->keepsDistance = true;
             ++piece;
         }
+    }
+    run.settled = true;
+}
+
+}  // namespace
+
+void removeNearPieces(ActivePieces& active, SourceSpan const& span, double d) {
+    const double threshold = std::fabs(std::fabs(d) - GmBase::m_scdPrecCalc);
+    const int newest = span.grew && !span.nearby.empty() ? 1 : 0;
+    for (PieceRun& run : active.runs()) {
+        const bool reached = newest > 0 && span.nearby.back().overlaps(run.reach);
+        if (!run.settled || reached) removeFromRun(run, span, newest, threshold);
     }
 }
 
