@@ -70,8 +70,9 @@ std::string SvgPage::legendText(const std::vector<SvgLegendEntry>& entries) cons
     const std::size_t shown = std::min(entries.size(), kMostLegendLines * perLine);
     std::string svg = "<g id=\"legend\">\n";
     for (std::size_t i = 0; i < shown; ++i) {
-        const auto column = static_cast<double>(i % perLine);
-        const auto line = static_cast<double>(i / perLine);
+        const std::size_t above = i / perLine;
+        const auto line = static_cast<double>(above);
+        const auto column = static_cast<double>(i - above * perLine);
         const Vec2 at{m_drawn.low.x + column * kEntryWidth * size, top - line * kLineHeight * size};
         svg += textTag(at, size, "fill=\"" + entries[i].colour + "\"", entries[i].text);
     }
