@@ -181,6 +181,7 @@ TEST_F(Program, BadInputIsOneLineAndExitCodeTwo) {
         {"", "subcommand"},
         {"corners " + kBracket + " -o a.svg", "--radius"},
         {"corners " + kBracket + " --radius 1 --chamfer 2 -o a.svg", "excludes"},
+        {"corners " + kBracket + " --radius 1 --bend nan -o a.svg", "--bend"},
         {"corners " + kBracket + " --chamfer-length nan -o a.svg", "--chamfer-length"},
         {"melt " + kBracket + " -o a.svg", "SECOND"},
         {"melt " + kBracket + " none.dxf -o a.svg", "none.dxf"},

@@ -64,11 +64,14 @@ TEST(Corners, WithoutRoomAreCountedAndStay) {
     EXPECT_EQ(none.notDone, 6U);
     EXPECT_EQ(none.path.elements.size(), kAngle.elements.size());
     EXPECT_EQ(broken(circle({3, 3}, 2), {CornerKind::kRounding, 1}).done, 0U);
-    // Open paths have no inside: every corner counts. The bend of half a degree is none.
+    // Open paths have no inside: every corner counts. The bend of half a degree is none,
+    // unless it is asked for.
     const Path open = polygon({{0, 0}, {10, 0}, {20, 0.08}, {20, 10}, {30, 10}}, false);
     const CornerResult some = broken(open, {CornerKind::kRounding, 1, CornerChoice::kConvex});
     EXPECT_EQ(some.done, 2U);
     EXPECT_FALSE(some.path.closed);
+    const CornerRequest slight{CornerKind::kChamferDistance, 1, CornerChoice::kAll, 0.005};
+    EXPECT_EQ(broken(open, slight).done, 3U);
 }
 
 TEST(Corners, TouchNeitherTheirContourNorAnother) {

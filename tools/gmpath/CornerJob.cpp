@@ -11,8 +11,6 @@ namespace gmpath {
 
 namespace {
 
-constexpr double kSmallestBend = kPi / 180.0;
-
 /// The angle by which the path turns between two elements, positive to the left.
 double bend(const Element& first, const Element& second) {
     const Vec2 leaving = tangentEnd(first);
@@ -20,11 +18,11 @@ double bend(const Element& first, const Element& second) {
     return std::atan2(cross(leaving, entering), dot(leaving, entering));
 }
 
-bool isWanted(double turn, Sense sense, CornerChoice choice) {
-    if (std::abs(turn) < kSmallestBend) return false;
-    if (choice == CornerChoice::kAll || sense == Sense::kNone) return true;
+bool isWanted(double turn, Sense sense, const CornerRequest& request) {
+    if (std::abs(turn) < request.leastBend) return false;
+    if (request.choice == CornerChoice::kAll || sense == Sense::kNone) return true;
     const bool turnsWith = (turn > 0.0) == (sense == Sense::kCounterClockwise);
-    return turnsWith == (choice == CornerChoice::kConvex);
+    return turnsWith == (request.choice == CornerChoice::kConvex);
 }
 
 GmContour::eTransType kernelType(CornerKind kind) {
@@ -68,7 +66,7 @@ CornerResult cornersBroken(const Path& contour, const CornerRoom& room,
     GmContour kernel;
     result.accepted = fillContour(kernel, source);
     if (!result.accepted) return result;
-    const std::vector<std::size_t> corners = cornersOf(source.path, request.choice);
+    const std::vector<std::size_t> corners = cornersOf(source.path, request);
     // From the last one to the first, so that new elements do not move the corners still to do.
     for (auto corner = corners.rbegin(); corner != corners.rend(); ++corner) {
         const bool done = breakCorner(kernel, *corner, room, request);
@@ -80,14 +78,14 @@ CornerResult cornersBroken(const Path& contour, const CornerRoom& room,
 
 }  // namespace
 
-std::vector<std::size_t> cornersOf(const Path& path, CornerChoice choice) {
+std::vector<std::size_t> cornersOf(const Path& path, const CornerRequest& request) {
     const std::size_t count = path.elements.size();
     const std::size_t joints = path.closed || count == 0 ? count : count - 1;
     const Sense turn = sense(path);
     std::vector<std::size_t> corners;
     for (std::size_t i = 0; i < joints; ++i) {
         const double angle = bend(path.elements[i], path.elements[(i + 1) % count]);
-        if (isWanted(angle, turn, choice)) corners.push_back(i);
+        if (isWanted(angle, turn, request)) corners.push_back(i);
     }
     return corners;
 }

@@ -25,6 +25,9 @@ struct CornerRequest {
     CornerKind kind = CornerKind::kRounding;
     double value = 0.0;  ///< positive, in units of the contours
     CornerChoice choice = CornerChoice::kAll;
+    /// Joints that bend by less are no corners, in radians. Drawings are full of arcs that leave
+    /// their neighbours not quite smoothly.
+    double leastBend = 5.0 / 180.0 * kPi;
 };
 
 /// A contour with its corners done.
@@ -37,8 +40,7 @@ struct CornerResult {
 };
 
 /// The joints of a path that are corners to be done: the indices of the elements that end there.
-/// Joints that bend by less than a degree are no corners.
-std::vector<std::size_t> cornersOf(const Path& path, CornerChoice choice);
+std::vector<std::size_t> cornersOf(const Path& path, const CornerRequest& request);
 
 /// Rounds or chamfers the corners of every contour, from the last corner of a contour to its first.
 /// A transition has room where it fits between its two elements and touches nothing else: neither

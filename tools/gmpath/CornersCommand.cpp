@@ -9,11 +9,15 @@ namespace gmpath {
 namespace {
 
 constexpr int kLegendDigits = 6;
+constexpr double kHalfTurn = 180.0;
 
 CornerRequest requestOf(const CornersOptions& options) {
+    if (!(options.bend > 0.0 && options.bend < kHalfTurn)) {
+        throw InputError("--bend: not a number above 0 and below 180");
+    }
     const auto of = [&](CornerKind kind, double value, const std::string& option) {
         checkPositive(value, option);
-        return CornerRequest{kind, value, options.choice};
+        return CornerRequest{kind, value, options.choice, options.bend / kHalfTurn * kPi};
     };
     if (options.radius) return of(CornerKind::kRounding, *options.radius, "--radius");
     if (options.chamfer) return of(CornerKind::kChamferDistance, *options.chamfer, "--chamfer");

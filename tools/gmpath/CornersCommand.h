@@ -16,6 +16,7 @@ struct CornersOptions {
     std::optional<double> chamfer;
     std::optional<double> chamferLength;
     CornerChoice choice = CornerChoice::kAll;
+    double bend = 5.0;  ///< degrees; joints that bend by less are no corners
     std::vector<std::string> outputs;
 };
 

@@ -33,6 +33,8 @@ CLI::App* addCorners(CLI::App& program, CornersOptions& options) {
             "--concave", [&options] { options.choice = CornerChoice::kConcave; },
             "only corners that turn against it")
         ->excludes(convex);
+    corners->add_option("--bend", options.bend, "joints that bend by fewer degrees are no corners")
+        ->capture_default_str();
     addOutputs(*corners, options.outputs);
     corners->footer("Example: gmpath corners bracket.dxf --radius 2 --convex -o rounded.dxf");
     return corners;
