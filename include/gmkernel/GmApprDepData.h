@@ -41,7 +41,7 @@ struct GmApprDepData {
     /// Radius of the arc of kinds 3 and 4, in length units.
     double dRadius = 0.0;
 
-    /// Opening angle of the arc of kind 3, in degrees. 0 gives a full circle.
+    /// Opening angle of the arc of kind 3, in degrees. Known limit: 0 gives a full circle.
     double dAngle = 0.0;
 
     /// Radius of the arc that kind 5 may choose, in length units.

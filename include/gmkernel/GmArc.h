@@ -141,6 +141,9 @@ public:
     /// Do the ends coincide in the x-y plane (within m_scdPrecCalc)?
     bool IsFullCircle() const;
     /// The point at the fraction i/n of the sweep; on a full circle always the start.
+    ///
+    /// Known limit: an end within 1e-4 of an axis through the centre counts at the angle of the
+    /// axis, here and in HP().
     GmPoint SectionPoint(int i, int n) const;
     /// The point halfway along the arc.
     GmPoint HP() const;

@@ -116,8 +116,9 @@ public:
     /// The nearest point of the curve on the line through centre and point; for the centre itself
     /// SP() (undefined on a full circle). Replaces the solution list.
     GmPoint NP(GmPoint const& p) const override;
-    /// The tangent through a point of the circle (within m_scdPrec), directed clockwise about the
-    /// centre; else undefined.
+    /// The tangent through a point of the circle (within m_scdPrec); else undefined.
+    ///
+    /// Known limit: it is directed clockwise about the centre, on arcs of either sense.
     GmLine Tangent(GmPoint const& p) const override;
     /// The circumference.
     double Length() const override;
@@ -158,8 +159,9 @@ public:
     double Dist(GmCircle const& circle) const;
     /// Intersects the full circle with the carrier of a straight curve; the points replace the
     /// solution list. Only touching is judged by the curve itself: a stretch has to reach the
-    /// point. A line up to m_scdPrec outside the circle touches it; one parallel to the y axis only
-    /// up to about 1e-9 / R outside.
+    /// point. A line up to m_scdPrec outside the circle touches it.
+    ///
+    /// Known limit: a line parallel to the y axis touches only up to about 1e-9 / R outside.
     /// @return 0, 1 (touching) or 2
     int IntersectionWithLine(GmLine const& line) const;
     /// Intersects two full circles; the points replace the solution list, the one on the right of

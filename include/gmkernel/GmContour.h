@@ -83,8 +83,10 @@ public:
     bool Element(GmPoint const& p, double eps) const override;
     /// Element(p, m_scdPrec).
     bool Element(GmPoint const& p) const override;
-    /// The smallest distance of an element from the point; 1e30 without elements. An arc counts
-    /// with its full circle, so this can fall below the distance that MinDist() finds.
+    /// The smallest distance of an element from the point; 1e30 without elements.
+    ///
+    /// Known limit: an arc counts with its full circle, so this can fall below the distance that
+    /// MinDist() finds.
     double Dist(GmPoint const& p) const override;
     /// The point of the contour nearest to `p`; of equally near elements the first one answers.
     /// Without elements, and when no distance is a finite number, undefined.
@@ -114,9 +116,10 @@ public:
     bool Out(GmPoint const& p) override;
     /// Not provided for contours: an undefined point.
     GmPoint NP(GmPoint const& p) const override;
-    /// The tangent line of the last element that contains the point, see LastPointElem(): along a
-    /// segment, clockwise about the centre of every arc. Undefined for a point off the contour, and
-    /// for one that lies more than m_scdPrec off an arc.
+    /// The tangent line of the last element that contains the point, see LastPointElem(). Undefined
+    /// for a point off the contour, and for one that lies more than m_scdPrec off an arc.
+    ///
+    /// Known limit: it runs along a segment, but clockwise about the centre of every arc.
     GmLine Tangent(GmPoint const& p) const override;
     /// Not provided for contours, null: see Offsetting().
     GmCurve* GetParallel(double d) const override;
@@ -265,8 +268,10 @@ public:
                             double value, bool bIdOfFirst);
     /// Rounds the corners between consecutive elements, in a closed contour that between the last
     /// and the first one too. A corner stays sharp where no circle of the radius touches each
-    /// element in exactly one point. New arcs are marked as inserted; their identifier and index
-    /// are their position.
+    /// element in exactly one point. New arcs are marked as inserted.
+    ///
+    /// Known limit: identifier and index of a new arc are its position at that time, so an
+    /// identifier may occur twice.
     /// @param dRadius the radius in length units; between segments it counts by its magnitude,
     ///        beside an arc it has to be positive
     /// @param nMode for closed contours: below 0 only corners that turn with the contour, above 0
@@ -324,7 +329,12 @@ public:
     /// results or none. A corner carries the identifier of the element that ends there. The result
     /// of an open contour goes on with the half circle around its end. A distance below m_scdPrec
     /// in magnitude stores a copy, one that is not finite nothing. The elements of this contour are
-    /// not changed. Cost: the number of elements times the number of pieces in the span, twice.
+    /// not changed. Cost: for each element the runs of pieces in the span, and the pieces near it.
+    ///
+    /// Known limits: results can be lost or stay open beside sides that are tilted from the
+    /// vertical by about 1e-6 or less, beside a first element shorter than 0.001, where an arc
+    /// nearly vanishes, and beside arcs that leave their chord by 1e-3 or less. What would be
+    /// bounded by rounded corners alone is not stored.
     /// @param d the distance in length units
     /// @param nSpan how many of the most recent elements a piece is cut by and tested against
     /// @param bKeepOpen keeps open results of a closed contour that is offset to its inside;
