@@ -1,4 +1,4 @@
-#include "support/Contours.h"
+#include "tests/support/Contours.h"
 
 #include <gtest/gtest.h>
 

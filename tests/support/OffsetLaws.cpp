@@ -1,4 +1,4 @@
-#include "support/OffsetLaws.h"
+#include "tests/support/OffsetLaws.h"
 
 #include <gtest/gtest.h>
 
@@ -9,7 +9,7 @@
 
 #include "gmkernel/GmArc.h"
 #include "gmkernel/GmStretch.h"
-#include "support/Contours.h"
+#include "tests/support/Contours.h"
 
 namespace offset_laws {
 

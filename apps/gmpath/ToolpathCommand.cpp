@@ -1,0 +1,117 @@
+#include "apps/gmpath/ToolpathCommand.h"
+
+#include <algorithm>
+#include <sstream>
+
+#include "apps/gmpath/Progress.h"
+#include "apps/gmpath/ToolpathSettings.h"
+#include "drawing/InputError.h"
+#include "drawing/Text.h"
+#include "drawing/files/OutputFiles.h"
+#include "machining/picture/ToolpathPicture.h"
+
+namespace gmpath {
+
+namespace {
+
+constexpr int kSizeDigits = 4;
+constexpr int kLengthDecimals = 1;
+
+Units unitsOf(const ToolpathOptions& options, const Part& part) {
+    if (options.units) return *options.units;
+    try {
+        return machineUnits(part.units);
+    } catch (const InputError& error) {
+        throw InputError(options.input.drawing + ": " + error.what());
+    }
+}
+
+std::string shortenedText(const LeadTally& leads) {
+    const std::string size = formatReal(leads.smallest, kSizeDigits);
+    if (leads.shortened == 1) return "lead shortened to " + size;
+    return std::to_string(leads.shortened) + " leads shortened, the smallest to " + size;
+}
+
+std::string droppedText(const LeadTally& leads) {
+    if (leads.dropped == 1) return "no room for a lead, dropped";
+    return "no room for " + std::to_string(leads.dropped) + " leads, dropped";
+}
+
+/// What is to be told about a contour, empty when all went well.
+std::string remark(const ContourCut& cut) {
+    if (!cut.accepted) return "the kernel cannot take it over";
+    if (!cut.fits) return "the tool does not fit";
+    std::string text;
+    const auto add = [&](bool applies, const std::string& what) {
+        if (applies) text += (text.empty() ? "" : "; ") + what;
+    };
+    for (const FaultyOffset& faulty : cut.faults)
+        add(true, faultText(faulty) + ", not cut");
+    add(!cut.keepsOthers, "the cut comes too near to another contour");
+    add(cut.leads.shortened > 0, shortenedText(cut.leads));
+    add(cut.leads.dropped > 0, droppedText(cut.leads));
+    return text;
+}
+
+void reportContours(const std::string& drawing, const std::vector<ContourCut>& cuts,
+                    const Console& console) {
+    const auto twoSided = std::count_if(cuts.begin(), cuts.end(),
+                                        [](const ContourCut& cut) { return cut.bothSides; });
+    if (twoSided > 0) {
+        console.err << "gmpath: " << printable(drawing) << ": "
+                    << counted(static_cast<std::size_t>(twoSided), "open contour")
+                    << " cut on both sides\n";
+    }
+    for (std::size_t i = 0; i < cuts.size(); ++i) {
+        const std::string text = remark(cuts[i]);
+        if (text.empty()) continue;
+        console.err << "gmpath: " << printable(drawing) << ": contour " << i + 1 << ": " << text
+                    << "\n";
+    }
+}
+
+std::string summary(const ToolpathResult& result, Units units) {
+    LeadTally leads;
+    for (const ContourCut& cut : result.contours) {
+        leads.made += cut.leads.made;
+        leads.shortened += cut.leads.shortened;
+        leads.dropped += cut.leads.dropped;
+    }
+    const std::string unit = units == Units::kInches ? " in" : " mm";
+    const auto lengthText = [&](MoveKind kind) {
+        return formatFixed(travel(result.moves, kind), kLengthDecimals) + unit;
+    };
+    return counted(result.contours.size(), "contour") + ", cuts " + lengthText(MoveKind::kCut) +
+           ", rapid moves " + lengthText(MoveKind::kRapid) + ", " + counted(leads.made, "lead") +
+           " (" + std::to_string(leads.shortened) + " shortened), " +
+           std::to_string(leads.dropped) + " dropped\n";
+}
+
+}  // namespace
+
+bool runToolpath(const ToolpathOptions& options, const Console& console) {
+    checkOptions(options);
+    checkOutputs(options.outputs, options.input.drawing, {".ngc", ".svg"});
+    // What the drawing holds besides is told only when the rest is in order.
+    std::ostringstream remarks;
+    const Part part = readInput(options.input, {console.out, remarks});
+    const Units units = unitsOf(options, part);
+    const ToolpathRequest request = toolpathRequest(options, units);
+    console.err << remarks.str();
+    Progress progress(console.err, console.showProgress);
+    const ToolpathResult result =
+        makeToolpath(part.contours, request,
+                     [&](std::size_t done, std::size_t total) { progress.show(done, total); });
+    const MachineSettings settings = machineSettings(options, units);
+    writeOutputs({{".ngc", [&](AtomicFile& file) { file.write(gcodeOf(result.moves, settings)); }},
+                  {".svg", [&](AtomicFile& file) { file.write(svgOf(part.contours, result)); }}},
+                 options.outputs);
+    progress.clear();
+    reportContours(options.input.drawing, result.contours, console);
+    console.out << summary(result, units);
+    return std::all_of(result.contours.begin(), result.contours.end(), [](const ContourCut& cut) {
+        return cut.accepted && cut.faults.empty() && cut.keepsOthers;
+    });
+}
+
+}  // namespace gmpath

@@ -1,0 +1,14 @@
+#include <unistd.h>
+
+#include <iostream>
+
+#include "apps/gmpath/CommandLine.h"
+
+int main(int argc, char** argv) {
+    const gmpath::Console console{std::cout, std::cerr, isatty(STDERR_FILENO) != 0};
+    const int exitCode = gmpath::runCommandLine(argc, argv, console);
+    if (std::cout.flush()) return exitCode;
+    constexpr int kLostOutput = 2;
+    std::cerr << "gmpath: the output cannot be written\n";
+    return kLostOutput;
+}

@@ -1,0 +1,36 @@
+#pragma once
+
+#include <cstddef>
+#include <string>
+#include <vector>
+
+#include "region/model/Path.h"
+
+namespace gmpath {
+
+/// A path that came of a source contour.
+struct ResultPath {
+    std::size_t pass;  ///< index of the pass
+    Path path;
+    bool doubtful = false;  ///< there is a fault in what it belongs to
+};
+
+/// Names of a pass in drawings.
+struct PassName {
+    std::string legend;
+    std::string layer;  ///< empty for results that stay on the layers of their paths
+};
+
+/// Source contours and what came of them, as the writers put them into a file.
+struct ResultDrawing {
+    std::vector<Path> contours;                    ///< at least one
+    std::vector<std::vector<ResultPath>> results;  ///< one entry a contour
+    std::vector<PassName> passes;
+    /// One entry a contour, of letters and digits; without entries contours are numbered from 1.
+    std::vector<std::string> labels = {};
+    /// The results take the place of the sources: pictures show them over the sources, other
+    /// drawings without them.
+    bool replacesSources = false;
+};
+
+}  // namespace gmpath

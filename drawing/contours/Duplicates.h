@@ -1,0 +1,15 @@
+#pragma once
+
+#include <cstddef>
+#include <vector>
+
+#include "region/model/Path.h"
+
+namespace gmpath {
+
+/// Drops paths that run over the same course as an earlier path of the same layer, whichever way
+/// they run and wherever a closed one starts, and returns how many. Points count as the same within
+/// the kernel's tolerance. Paths that overlap only in part are kept.
+std::size_t dropDuplicates(std::vector<Path>& paths);
+
+}  // namespace gmpath

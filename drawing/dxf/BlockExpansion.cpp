@@ -1,0 +1,117 @@
+#include "drawing/dxf/BlockExpansion.h"
+
+#include <algorithm>
+#include <cmath>
+
+#include "drawing/InputError.h"
+
+namespace gmpath {
+
+namespace {
+
+/// Blocks placed in blocks multiply; past this many steps the drawing is taken for a mistake.
+constexpr std::size_t kMaxPlaced = 2'000'000;
+
+/// Blocks nested deeper than this are taken for a mistake.
+constexpr std::size_t kMaxDepth = 64;
+
+/// Coordinates beyond this leave too few digits for the kernel's tolerance.
+constexpr double kLargestCoordinate = 1e9;
+
+bool isWithin(Vec2 p) {
+    return std::abs(p.x) <= kLargestCoordinate && std::abs(p.y) <= kLargestCoordinate;
+}
+
+bool isWithin(const Path& path) {
+    return std::all_of(path.elements.begin(), path.elements.end(), [](const Element& e) {
+        return isWithin(e.sp) && isWithin(e.ep) && isWithin(halvingPoint(e));
+    });
+}
+
+class Expansion {
+public:
+    explicit Expansion(const Drawing& drawing) : m_drawing(drawing) {}
+
+    ExpandedDrawing run(const Placement& placement) {
+        expand(m_drawing.model, placement, "0");
+        return std::move(m_result);
+    }
+
+private:
+    void expand(const Block& block, const Placement& placement, const std::string& layer) {
+        for (const auto& [kind, count] : block.skipped.unusable) {
+            skip({kind.kind, placedLayer(kind.layer, layer), kind.reason}, count);
+        }
+        for (const Path& path : block.paths)
+            addPath(path, placement, layer);
+        for (const BlockReference& reference : block.references) {
+            expandReference(reference, placement, placedLayer(reference.layer, layer));
+        }
+    }
+
+    void addPath(const Path& path, const Placement& placement, const std::string& layer) {
+        countPlaced();
+        Path placed = placement.apply(path);
+        placed.layer = placedLayer(path.layer, layer);
+        if (isWithin(placed)) {
+            m_result.paths.push_back(std::move(placed));
+        } else {
+            skip({"path", placed.layer, "beyond the largest coordinate"}, 1);
+        }
+    }
+
+    void expandReference(const BlockReference& reference, const Placement& placement,
+                         const std::string& layer) {
+        const auto found = m_drawing.blocks.find(reference.block);
+        if (found == m_drawing.blocks.end()) {
+            return skip({"INSERT", layer, "block is not defined"}, 1);
+        }
+        const bool recursive =
+            std::find(m_open.begin(), m_open.end(), &found->second) != m_open.end();
+        if (recursive) return skip({"INSERT", layer, "block places itself"}, 1);
+        if (m_open.size() >= kMaxDepth) return skip({"INSERT", layer, "nested too deeply"}, 1);
+        if (!Placement::ofReference(reference, {}, 0, 0)) {
+            return skip({"INSERT", layer, "scale is not uniform"}, 1);
+        }
+        m_open.push_back(&found->second);
+        expandCells(reference, found->second, placement, layer);
+        m_open.pop_back();
+    }
+
+    void expandCells(const BlockReference& reference, const Block& block,
+                     const Placement& placement, const std::string& layer) {
+        for (int row = 0; row < reference.rows; ++row) {
+            for (int column = 0; column < reference.columns; ++column) {
+                countPlaced();
+                const auto cell = Placement::ofReference(reference, block.base, column, row);
+                expand(block, placement.after(*cell), layer);
+            }
+        }
+    }
+
+    static std::string placedLayer(const std::string& own, const std::string& ofReference) {
+        return own == "0" ? ofReference : own;
+    }
+
+    void skip(const SkippedKind& kind, std::size_t count) {
+        m_result.skipped.unusable[kind] += count;
+    }
+
+    void countPlaced() {
+        if (++m_placed <= kMaxPlaced) return;
+        throw InputError("the blocks of the drawing multiply beyond all measure");
+    }
+
+    const Drawing& m_drawing;
+    std::vector<const Block*> m_open;  ///< blocks being placed, outermost first
+    std::size_t m_placed = 0;
+    ExpandedDrawing m_result;
+};
+
+}  // namespace
+
+ExpandedDrawing expandBlocks(const Drawing& drawing, const Placement& placement) {
+    return Expansion(drawing).run(placement);
+}
+
+}  // namespace gmpath

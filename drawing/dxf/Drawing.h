@@ -1,0 +1,40 @@
+#pragma once
+
+#include <map>
+#include <string>
+#include <vector>
+
+#include "drawing/SkipReport.h"
+#include "region/model/Path.h"
+
+namespace gmpath {
+
+/// A block placed in the drawing or in another block: scaled, turned by `angle`, then moved to
+/// `at`, `columns` times `rows` over. Spacing is measured along the turned axes.
+struct BlockReference {
+    std::string block;
+    std::string layer;
+    Vec2 at;
+    Vec2 scale{1.0, 1.0};
+    double angle = 0.0;  ///< radians
+    int columns = 1;
+    int rows = 1;
+    Vec2 spacing;
+    bool mirrored = false;  ///< drawn on the back of the plane: x runs the other way
+};
+
+/// What a block, or the drawing itself, holds, in drawing order.
+struct Block {
+    Vec2 base;                               ///< the point that comes to lie where it is placed
+    std::vector<Path> paths;                 ///< lines, arcs, circles, polylines as drawn
+    std::vector<BlockReference> references;  ///< blocks placed inside
+    SkipReport skipped;                      ///< entities that cannot be used
+};
+
+/// A drawing as read, before its blocks are placed.
+struct Drawing {
+    Block model;                          ///< the drawing itself
+    std::map<std::string, Block> blocks;  ///< definitions by name
+};
+
+}  // namespace gmpath

@@ -1,0 +1,232 @@
+#include "drawing/dxf/DxfSanitizer.h"
+
+#include <algorithm>
+#include <cmath>
+#include <cstdlib>
+#include <initializer_list>
+#include <optional>
+
+#include "drawing/Text.h"
+
+namespace gmpath {
+
+namespace {
+
+/// Coordinates beyond this leave too few digits for the kernel's tolerance.
+constexpr double kLargestNumber = 1e9;
+
+/// Longest name of a layer or block that is handed on.
+constexpr std::size_t kLongestName = 255;
+
+constexpr int kLayerCode = 8;
+
+/// What an entity kind must and may hold, by group code.
+struct EntityKind {
+    std::string_view name;
+    std::vector<int> required;
+    std::vector<int> optional;
+};
+
+const std::vector<EntityKind>& usableKinds() {
+    static const std::vector<EntityKind> kinds = {
+        {"LINE", {10, 20, 11, 21}, {}},
+        {"ARC", {10, 20, 40, 50, 51}, {210, 220, 230}},
+        {"CIRCLE", {10, 20, 40}, {210, 220, 230}},
+        {"LWPOLYLINE", {10, 20}, {70, 42, 210, 220, 230}},
+        {"POLYLINE", {}, {70, 210, 220, 230}},
+        {"VERTEX", {10, 20}, {42}},
+        {"INSERT", {2, 10, 20}, {41, 42, 50, 70, 71, 44, 45, 210, 220, 230}},
+        {"BLOCK", {2}, {10, 20}},
+    };
+    return kinds;
+}
+
+bool isNameCode(int code) {
+    return code == 2 || code == kLayerCode;
+}
+bool isIntegerCode(int code) {
+    return code == 70 || code == 71;
+}
+
+/// Parts of other entities, and windows onto the drawing from its sheet.
+bool isNoEntityOfItsOwn(std::string_view kind) {
+    return kind == "VERTEX" || kind == "SEQEND" || kind == "VIEWPORT";
+}
+
+/// A run of groups that starts with the entity's kind.
+struct Record {
+    std::string_view kind;
+    const DxfGroup* first = nullptr;  ///< first group behind the kind
+    const DxfGroup* last = nullptr;   ///< one behind the last group
+
+    std::string_view value(int code) const {
+        const auto* found =
+            std::find_if(first, last, [&](const DxfGroup& g) { return g.code == code; });
+        return found == last ? std::string_view{} : trimmed(found->value).substr(0, kLongestName);
+    }
+    bool has(int code) const {
+        return std::any_of(first, last, [&](const DxfGroup& g) { return g.code == code; });
+    }
+    int integer(int code) const { return parseInteger(value(code)).value_or(0); }
+    std::string layer() const { return has(kLayerCode) ? std::string(value(kLayerCode)) : "0"; }
+};
+
+std::vector<Record> recordsOf(const std::vector<DxfGroup>& groups) {
+    std::vector<Record> records;
+    for (const DxfGroup& group : groups) {
+        if (group.code == 0) records.push_back({trimmed(group.value), &group + 1, &group + 1});
+        if (group.code != 0 && !records.empty()) records.back().last = &group + 1;
+    }
+    return records;
+}
+
+bool contains(const std::vector<int>& codes, int code) {
+    return std::find(codes.begin(), codes.end(), code) != codes.end();
+}
+
+bool isHandedOn(const EntityKind& kind, int code) {
+    return code == kLayerCode || contains(kind.required, code) || contains(kind.optional, code);
+}
+
+bool isSound(const DxfGroup& group) {
+    if (isNameCode(group.code)) return true;
+    if (isIntegerCode(group.code)) return parseInteger(group.value).has_value();
+    const std::optional<double> number = parseReal(group.value);
+    return number && std::abs(*number) <= kLargestNumber;
+}
+
+/// Why the record cannot be used, empty when it can.
+std::string fault(const EntityKind& kind, const Record& record) {
+    for (const int code : kind.required) {
+        if (record.value(code).empty()) return "incomplete";
+    }
+    const auto broken = [&](const DxfGroup& g) { return isHandedOn(kind, g.code) && !isSound(g); };
+    if (std::any_of(record.first, record.last, broken)) return "broken number";
+    if (record.integer(67) == 1) return "in the paper space";
+    if (record.integer(60) == 1) return "hidden";
+    constexpr int kMeshFlags = 16 | 64;
+    const bool mesh = kind.name == "POLYLINE" && (record.integer(70) & kMeshFlags) != 0;
+    return mesh ? "a mesh" : "";
+}
+
+class Filter {
+public:
+    explicit Filter(std::vector<Record> records) : m_records(std::move(records)) {}
+
+    FilteredDrawing run() {
+        while (m_next < m_records.size()) {
+            const Record& record = m_records[m_next++];
+            if (record.kind == "SECTION") {
+                enterSection(record);
+            } else if (m_inside) {
+                filter(record);
+            }
+        }
+        write("0", "EOF");
+        return std::move(m_result);
+    }
+
+private:
+    void enterSection(const Record& record) {
+        const std::string_view name = record.value(2);
+        m_inside = name == "BLOCKS" || name == "ENTITIES";
+        m_block.clear();
+    }
+
+    void filter(const Record& record) {
+        if (record.kind == "ENDSEC" || record.kind == "EOF") {
+            m_inside = false;
+        } else if (record.kind == "ENDBLK") {
+            write("0", "ENDBLK");
+            m_block.clear();
+        } else if (record.kind == "POLYLINE") {
+            filterPolyline(record);
+        } else if (!isNoEntityOfItsOwn(record.kind)) {
+            filterEntity(record);
+        }
+    }
+
+    void filterEntity(const Record& record) {
+        const EntityKind* kind = usableKind(record.kind);
+        if (kind == nullptr) return skip(record, "kind cannot be used");
+        if (record.kind == "BLOCK") m_block = std::string(record.value(2));
+        const std::string reason = fault(*kind, record);
+        if (reason.empty() || record.kind == "BLOCK") {
+            write(*kind, record);
+        } else {
+            skip(record, reason);
+        }
+    }
+
+    /// A polyline stands and falls with its vertices, which follow as records of their own.
+    void filterPolyline(const Record& polyline) {
+        std::vector<const Record*> vertices;
+        while (m_next < m_records.size() && m_records[m_next].kind == "VERTEX") {
+            vertices.push_back(&m_records[m_next++]);
+        }
+        std::string reason = fault(*usableKind("POLYLINE"), polyline);
+        const EntityKind& vertexKind = *usableKind("VERTEX");
+        for (const Record* vertex : vertices) {
+            if (reason.empty()) reason = fault(vertexKind, *vertex);
+        }
+        if (!reason.empty()) return skip(polyline, reason);
+        write(*usableKind("POLYLINE"), polyline);
+        constexpr int kSplineFrameFlag = 16;
+        for (const Record* vertex : vertices) {
+            if ((vertex->integer(70) & kSplineFrameFlag) == 0) write(vertexKind, *vertex);
+        }
+        write("0", "SEQEND");
+    }
+
+    static const EntityKind* usableKind(std::string_view name) {
+        const auto& kinds = usableKinds();
+        const auto found = std::find_if(kinds.begin(), kinds.end(),
+                                        [&](const EntityKind& k) { return k.name == name; });
+        return found == kinds.end() ? nullptr : &*found;
+    }
+
+    void skip(const Record& record, const std::string& reason) {
+        const std::string kind(record.kind.substr(0, kLongestName));
+        ++m_result.skipped[m_block].unusable[{kind, record.layer(), reason}];
+    }
+
+    void write(const EntityKind& kind, const Record& record) {
+        write("0", record.kind);
+        if (kind.name == "LWPOLYLINE") {
+            const auto vertices = std::count_if(record.first, record.last,
+                                                [](const DxfGroup& g) { return g.code == 10; });
+            write("90", std::to_string(vertices));
+        }
+        for (const DxfGroup* g = record.first; g != record.last; ++g) {
+            if (isHandedOn(kind, g->code)) writeValue(*g);
+        }
+    }
+
+    void writeValue(const DxfGroup& group) {
+        std::string value(trimmed(group.value).substr(0, kLongestName));
+        if (!isNameCode(group.code)) {
+            value = formatReal(parseReal(group.value).value_or(0.0), kAllDigits);
+        }
+        write(std::to_string(group.code), value);
+    }
+
+    void write(std::string_view code, std::string_view value) {
+        m_result.text.append(code).append("\n").append(value).append("\n");
+    }
+
+    static constexpr int kAllDigits = 17;
+
+    std::vector<Record> m_records;
+    std::size_t m_next = 0;
+    bool m_inside = false;  ///< inside a section that holds entities
+    std::string m_block;    ///< block being defined, empty in the drawing itself
+    FilteredDrawing m_result;
+};
+
+}  // namespace
+
+FilteredDrawing filterDrawing(const std::vector<DxfGroup>& groups) {
+    return Filter(recordsOf(groups)).run();
+}
+
+}  // namespace gmpath

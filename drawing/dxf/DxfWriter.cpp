@@ -1,0 +1,141 @@
+#include "drawing/dxf/DxfWriter.h"
+
+#include <dxflib/dl_dxf.h>
+
+#include <array>
+#include <fstream>
+#include <iterator>
+#include <map>
+#include <memory>
+
+#include "drawing/Text.h"
+#include "drawing/dxf/ClassicLocale.h"
+
+namespace gmpath {
+
+namespace {
+
+/// The oldest version with layers and bulges, which every program reads: it needs neither handles
+/// nor objects.
+constexpr DL_Codes::version kVersion = DL_Codes::AC1009;
+
+constexpr int kBlack = 7;
+
+/// Colour numbers of the passes; further passes start again at the first.
+constexpr std::array<int, 8> kPassColours = {1, 5, 3, 6, 30, 4, 200, 94};
+
+constexpr const char* kLineType = "CONTINUOUS";
+constexpr const char* kSourceLayer = "SOURCE";
+
+class DxfWriter {
+public:
+    DxfWriter(const ResultDrawing& drawing, const std::string& fileName)
+        : m_drawing(drawing), m_out(m_dxf.out(fileName.c_str(), kVersion)) {}
+
+    bool run() {
+        if (m_out == nullptr) return false;
+        m_dxf.writeHeader(*m_out);
+        m_out->sectionEnd();
+        writeTables();
+        writeEntities();
+        m_out->dxfEOF();
+        m_out->close();
+        return true;
+    }
+
+private:
+    void writeTables() {
+        m_out->sectionTables();
+        m_out->tableLinetypes(1);
+        m_dxf.writeLinetype(*m_out, DL_LinetypeData(kLineType, "", 0, 0, 0.0));
+        m_out->tableEnd();
+        writeLayers();
+        m_out->sectionEnd();
+    }
+
+    void writeLayers() {
+        const std::map<std::string, int> layers = layerColours();
+        m_out->tableLayers(static_cast<int>(layers.size()));
+        for (const auto& [name, colour] : layers)
+            writeLayer(name, colour);
+        m_out->tableEnd();
+    }
+
+    std::map<std::string, int> layerColours() const {
+        std::map<std::string, int> colours = {{"0", kBlack}};
+        if (!m_drawing.replacesSources) colours[kSourceLayer] = kBlack;
+        for (const std::vector<ResultPath>& results : m_drawing.results) {
+            for (const ResultPath& result : results)
+                colours.emplace(layerOf(result), kBlack);
+        }
+        for (std::size_t pass = 0; pass < m_drawing.passes.size(); ++pass) {
+            const std::string& layer = m_drawing.passes[pass].layer;
+            if (!layer.empty()) colours[layer] = kPassColours[pass % kPassColours.size()];
+        }
+        return colours;
+    }
+
+    const std::string& layerOf(const ResultPath& result) const {
+        const std::string& layer = m_drawing.passes[result.pass].layer;
+        return layer.empty() ? result.path.layer : layer;
+    }
+
+    void writeLayer(const std::string& name, int colour) {
+        constexpr int kDefaultWidth = -3;
+        m_dxf.writeLayer(*m_out, DL_LayerData(name, 0),
+                         DL_Attributes(name, colour, kDefaultWidth, kLineType, 1.0));
+    }
+
+    void writeEntities() {
+        m_out->sectionEntities();
+        if (!m_drawing.replacesSources) {
+            for (const Path& contour : m_drawing.contours)
+                writePolyline(contour, kSourceLayer);
+        }
+        for (const std::vector<ResultPath>& results : m_drawing.results) {
+            for (const ResultPath& result : results)
+                writePolyline(result.path, layerOf(result));
+        }
+        m_out->sectionEnd();
+    }
+
+    void writePolyline(const Path& path, const std::string& layer) {
+        constexpr int kByLayer = 256;
+        constexpr int kWidthByLayer = -1;
+        const DL_Attributes attributes(layer, kByLayer, kWidthByLayer, "BYLAYER", 1.0);
+        const int vertices = static_cast<int>(path.elements.size()) + (path.closed ? 0 : 1);
+        m_dxf.writePolyline(*m_out, DL_PolylineData(vertices, 0, 0, path.closed ? 1 : 0),
+                            attributes);
+        for (const Element& e : path.elements)
+            writeVertex(e.sp, e.bulge);
+        if (!path.closed) writeVertex(path.elements.back().ep, 0.0);
+        m_dxf.writePolylineEnd(*m_out);
+    }
+
+    void writeVertex(Vec2 p, double bulge) {
+        m_dxf.writeVertex(*m_out, DL_VertexData(p.x, p.y, 0.0, bulge));
+    }
+
+    const ResultDrawing& m_drawing;
+    DL_Dxf m_dxf;
+    std::unique_ptr<DL_WriterA> m_out;
+};
+
+/// The DXF library does not tell of failed writes, so the end of the file is looked at.
+bool endsWithEndMark(const std::string& fileName) {
+    std::ifstream stream(fileName, std::ios::binary | std::ios::ate);
+    constexpr std::streamoff kTail = 8;
+    if (!stream || stream.tellg() < kTail) return false;
+    stream.seekg(-kTail, std::ios::end);
+    const std::string tail(std::istreambuf_iterator<char>(stream), {});
+    return tail.find("EOF") != std::string::npos;
+}
+
+}  // namespace
+
+bool writeDxf(const ResultDrawing& drawing, const std::string& fileName) {
+    const ClassicLocale locale;
+    return DxfWriter(drawing, fileName).run() && endsWithEndMark(fileName);
+}
+
+}  // namespace gmpath

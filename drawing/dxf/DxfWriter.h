@@ -1,0 +1,14 @@
+#pragma once
+
+#include <string>
+
+#include "drawing/ResultDrawing.h"
+
+namespace gmpath {
+
+/// Writes the drawing as DXF: polylines with bulges, the sources (unless results take their place)
+/// on layer SOURCE, every pass on its layer with a colour of its own.
+/// Returns false when the file cannot be written as a whole.
+bool writeDxf(const ResultDrawing& drawing, const std::string& fileName);
+
+}  // namespace gmpath

@@ -1,0 +1,34 @@
+#pragma once
+
+#include <string>
+#include <vector>
+
+#include "drawing/SkipReport.h"
+#include "drawing/dxf/DrawingUnits.h"
+#include "region/model/Path.h"
+
+namespace gmpath {
+
+struct ReadOptions {
+    /// Ends that lie at most this far apart are joined, in units of the drawing; positive.
+    double joinTolerance = 1e-3;
+    /// Factor from units of the drawing to units of the result; positive.
+    double scale = 1.0;
+};
+
+/// What a part drawing holds.
+struct Part {
+    std::vector<Path> contours;  ///< at least one, each with at least one element
+    SkipReport skipped;
+    DrawingUnits units;
+};
+
+/// Reads a part drawing (DXF in text form) and builds its contours.
+/// Throws InputError, with the file's name and the cause, for a file that is missing, unreadable,
+/// empty, truncated or no DXF file, and for a drawing without contours.
+Part readPart(const std::string& fileName, const ReadOptions& options);
+
+/// The same for the text of a drawing. The causes come without a file name.
+Part partFromText(const std::string& text, const ReadOptions& options);
+
+}  // namespace gmpath

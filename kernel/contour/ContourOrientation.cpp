@@ -1,0 +1,65 @@
+#include <cmath>
+
+#include "gmkernel/GmArc.h"
+#include "gmkernel/GmContour.h"
+#include "kernel/contour/ContourElements.h"
+#include "kernel/values/Constants.h"
+
+// The sense of rotation is the sign of the area of a polygon through the joints and through points
+// of the arcs, by the sum of cross products of neighbouring radius vectors (the shoelace formula).
+
+namespace {
+
+// Twice the area swept by the radius vector from `reference` along the points given to MoveTo().
+class SweptArea {
+public:
+    SweptArea(GmPoint const& reference, GmPoint const& start)
+        : m_reference(reference), m_radius(start - reference) {}
+
+    void MoveTo(GmPoint const& p) {
+        const GmVec radius = p - m_reference;
+        m_doubled += (m_radius % radius).Z();
+        m_radius = radius;
+    }
+
+    double Doubled() const { return m_doubled; }
+
+private:
+    GmPoint m_reference;
+    GmVec m_radius;
+    double m_doubled = 0.0;
+};
+
+// Four chords a half-turn, at least two. A sweep that is no number gives two.
+int ChordCount(GmArc const& arc) {
+    const double chords = std::fabs(arc.Ang()) * 4.0 / gmkernel_detail::kPi;
+    return chords >= 2.0 && chords <= 8.0 ? static_cast<int>(chords) : 2;
+}
+
+double DoubledArea(GmContour const& contour, GmPoint const& reference) {
+    const GmPoint start = gmkernel_detail::ChainStart(contour);
+    SweptArea area(reference, start);
+    for (int i = 0; i < contour.ElementCount(); ++i) {
+        GmCurve const& element = *contour.GetElement(i);
+        if (element.IsArc()) {
+            GmArc const& arc = static_cast<GmArc const&>(element);
+            const int chords = ChordCount(arc);
+            for (int k = 1; k < chords; ++k)
+                area.MoveTo(arc.SectionPoint(k, chords));
+        }
+        area.MoveTo(element.EP());
+    }
+    if (!contour.IsClosed()) area.MoveTo(start);
+    return area.Doubled();
+}
+
+}  // namespace
+
+GmBase::eRotDir GmContour::Dir(GmPoint const& r) {
+    if (ElementCount() == 0) return eRotNone;
+    const GmPoint start = gmkernel_detail::ChainStart(*this);
+    double area = DoubledArea(*this, r);
+    if (area == 0.0 && !(r == start)) area = DoubledArea(*this, start);
+    if (area < 0.0) return eRotCW;
+    return area > 0.0 ? eRotCCW : eRotNone;
+}

@@ -1,0 +1,75 @@
+#include <cmath>
+
+#include "gmkernel/GmContour.h"
+#include "kernel/contour/ContourElements.h"
+
+using gmkernel_detail::ChainStart;
+
+namespace {
+
+// Two starts are equally near within this number: of distances in the search by one point, of
+// squared distances in the search with a second point.
+constexpr double kTie = 1e-4;
+
+// Index of the element whose start is nearest, -1 without elements.
+int NearestStart(GmContour const& contour, GmPoint const& p) {
+    int nearest = -1;
+    double best = -1.0;
+    for (int i = 0; i < contour.ElementCount(); ++i) {
+        const double dist = contour.GetElement(i)->SP().Dist(p);
+        if (!(best < 0.0) && !(best - dist > kTie)) continue;
+        best = dist;
+        nearest = i;
+    }
+    return nearest;
+}
+
+}  // namespace
+
+GmPoint GmContour::NearPoint(GmPoint const& p) {
+    const int nearest = NearestStart(*this, p);
+    return nearest < 0 ? GmPoint() : GetElement(nearest)->SP();
+}
+
+int GmContour::NearPointElem(GmPoint const& p) {
+    return NearestStart(*this, p);
+}
+
+int GmContour::NearPointElem(GmPoint const& p, GmPoint const& q) {
+    int nearest = -1;
+    double best = -1.0;
+    double nearestToQ = 0.0;
+    for (int i = 0; i < ElementCount(); ++i) {
+        const GmPoint start = GetElement(i)->SP();
+        const double dist = start.Dist2(p);
+        const double startToQ = start.Dist2(q);
+        const bool bNearer = best - dist > kTie || best < 0.0;
+        const bool bTieTaken = std::fabs(best - dist) < kTie && !(nearestToQ - startToQ >= kTie);
+        if (bNearer) best = dist;
+        if (!bNearer && !bTieTaken) continue;
+        nearestToQ = startToQ;
+        nearest = i;
+    }
+    return nearest;
+}
+
+GmPoint GmContour::FarPoint(GmPoint const& p) {
+    if (ElementCount() == 0) return GmPoint();
+    GmPoint farthest = ChainStart(*this);
+    double best = farthest.Dist(p);
+    for (int i = 0; i < ElementCount(); ++i) {
+        const GmPoint end = GetElement(i)->EP();
+        const double dist = end.Dist(p);
+        if (!(dist - best > kTie)) continue;
+        best = dist;
+        farthest = end;
+    }
+    return farthest;
+}
+
+int GmContour::LastPointElem(GmPoint const& p) const {
+    int i = static_cast<int>(ElementCount()) - 1;
+    while (i >= 0 && !GetElement(i)->Element(p))
+        --i;
+    return i;
+}

@@ -1,0 +1,109 @@
+/// @file
+/// Melting two closed contours: the loops that their boundaries form together.
+///
+/// The elements of both contours are numbered in one row, this contour's first. Every crossing
+/// gives up to two passages, one from each boundary onto the other. A walk follows one boundary to
+/// the next passage, changes over, and so on until it is back where it started.
+#include <memory>
+#include <vector>
+
+#include "gmkernel/GmContour.h"
+#include "kernel/contour/GmContourArray.h"
+#include "kernel/contour/walk/LoopContour.h"
+#include "kernel/contour/walk/PassageWalk.h"
+#include "kernel/curves/CurveBox.h"
+
+namespace {
+
+using namespace gmkernel_detail;
+
+constexpr int kNotClosed = -1;
+constexpr int kDidNotComeBack = -2;
+
+bool isClosedChain(GmContour const& contour) {
+    if (!contour.IsClosed()) return false;
+    for (int i = 0; i < contour.ElementCount(); ++i) {
+        GmCurve const& element = *contour.GetElement(i);
+        if (!element.IsStretch() && !element.IsArc()) return false;
+    }
+    return true;
+}
+
+std::vector<CurveBox> reachesOf(GmContour const& contour) {
+    std::vector<CurveBox> reaches;
+    for (int i = 0; i < contour.ElementCount(); ++i)
+        reaches.push_back(reachOf(*contour.GetElement(i)));
+    return reaches;
+}
+
+void addPassagesBetween(Passages& passages, GmContour const& a, GmContour const& b) {
+    const int countA = static_cast<int>(a.ElementCount());
+    const std::vector<CurveBox> reachesB = reachesOf(b);
+    for (int i = 0; i < countA; ++i) {
+        GmCurve const& e = *a.GetElement(i);
+        const CurveBox reach = reachOf(e);
+        for (int j = 0; j < b.ElementCount(); ++j) {
+            if (!reach.overlaps(reachesB[static_cast<std::size_t>(j)])) continue;
+            GmCurve const& f = *b.GetElement(j);
+            e.Intersection(&f);
+            for (GmPoint const& p : e.GetPtSol())
+                passages.AddCrossing(e, i, f, countA + j, p);
+        }
+    }
+}
+
+/// Both boundaries as one row of elements; each goes round by itself.
+WalkTrack trackAlong(GmContour const& a, GmContour const& b) {
+    const int countA = static_cast<int>(a.ElementCount());
+    const int count = countA + static_cast<int>(b.ElementCount());
+    WalkTrack track;
+    track.curveCount = count;
+    track.curveAt = [&a, &b, countA](int index) -> GmCurve const& {
+        return index < countA ? *a.GetElement(index) : *b.GetElement(index - countA);
+    };
+    track.following = [countA, count](int index) {
+        if (index == countA - 1) return 0;
+        return index == count - 1 ? countA : index + 1;
+    };
+    return track;
+}
+
+Loops loopsBetween(GmContour const& a, GmContour const& b) {
+    Passages passages;
+    addPassagesBetween(passages, a, b);
+    WalkTrack track = trackAlong(a, b);
+    Loops loops;
+    for (int i = 0; i < passages.Count(); ++i) {
+        if (passages[i].bUsed) continue;
+        auto loop = std::make_unique<LoopContour>();
+        track.append = [&loop](GmCurve& piece) { loop->AddRealElem(&piece); };
+        loops.cameBack = walkLoop(passages, i, track);
+        if (!loops.cameBack) break;
+        loops.contours.push_back(std::move(loop));
+    }
+    return loops;
+}
+
+}  // namespace
+
+int GmContour::MeltContours(GmContour* other, bool bSameSense) {
+    if (!other || !isClosedChain(*this) || !isClosedChain(*other)) return kNotClosed;
+    const GmPoint origin(0.0, 0.0, 0.0);
+    const eRotDir sense = Dir(origin);
+    Loops loops = loopsBetween(*this, *other);
+    // Only now, since the other contour may be one of the sub-contours.
+    RemoveAllSubConts();
+    for (std::unique_ptr<GmContour>& loop : loops.contours) {
+        if (!bSameSense || loop->Dir(origin) == sense) m_pSubConts->Take(std::move(loop));
+    }
+    return loops.cameBack ? m_pSubConts->GetCount() : kDidNotComeBack;
+}
+
+int GmContour::SplitContours(GmContour* other) {
+    return MeltContours(other, false);
+}
+
+int GmContour::FindNextPoint(GmPoint p, GmCurve* curve, int index,
+                             KxArray<GmContIntPoint*, GmContIntPoint*> const& passages) const {
+    return curve ? gmkernel_detail::nextPassage(p, *curve, index, passages) : -1;
+}

@@ -1,0 +1,67 @@
+#include "kernel/contour/offset/BandSweep.h"
+
+#include <cmath>
+#include <limits>
+
+#include "kernel/contour/offset/BandPieces.h"
+#include "kernel/contour/offset/Insertion.h"
+
+namespace gmkernel_detail {
+
+namespace {
+
+/// The box of the points that may be nearer to a source element than |d|; everywhere for elements
+/// that are neither segments nor arcs.
+CurveBox nearbyOf(GmCurve const& element, double d) {
+    constexpr double kEverywhere = std::numeric_limits<double>::max();
+    if (!element.IsStretch() && !element.IsArc())
+        return {-kEverywhere, kEverywhere, -kEverywhere, kEverywhere};
+    return reachOf(element).grown(std::fabs(d));
+}
+
+}  // namespace
+
+void BandSweep::add(GmContElement const& record) {
+    ++m_index;
+    advanceSpan(*record.pCurve);
+    for (GmOffsetElement& piece :
+         bandPieces(*record.pCurve, m_index, static_cast<int>(record.lId), m_d)) {
+        insertPiece(m_active, std::move(piece));
+    }
+    removeNearPieces(m_active, m_span, m_d);
+    retire();
+}
+
+/// Appends an element to the span, if it joins, and lets the oldest one leave.
+void BandSweep::advanceSpan(GmCurve const& element) {
+    const bool appended = m_span.elements.AddElement(&element, false, 0);
+    if (appended) m_span.nearby.push_back(nearbyOf(element, m_d));
+    if (m_index >= m_spanSize && !m_span.nearby.empty()) {
+        m_span.elements.RemoveElement(0);
+        m_span.nearby.erase(m_span.nearby.begin());
+    }
+    m_span.grew = appended && !m_span.nearby.empty();
+}
+
+/// Moves the pieces of elements that are leaving the span to the finished ones.
+void BandSweep::retire() {
+    const long long oldestKept = static_cast<long long>(m_index) - m_spanSize + 1;
+    if (oldestKept < 0) return;
+    for (PieceRun& run : m_active.runs()) {
+        for (auto piece = run.pieces.begin(); piece != run.pieces.end();) {
+            const auto current = piece++;
+            if (current->element.source() > oldestKept) continue;
+            m_finished.splice(m_finished.end(), run.pieces, current);
+        }
+    }
+    m_active.dropEmptyRuns();
+}
+
+PieceList BandSweep::finish() {
+    for (PieceRun& run : m_active.runs())
+        m_finished.splice(m_finished.end(), run.pieces);
+    m_finished.remove_if([](Piece const& piece) { return !piece.element.kept(); });
+    return std::move(m_finished);
+}
+
+}  // namespace gmkernel_detail

@@ -1,0 +1,36 @@
+#pragma once
+
+#include "gmkernel/GmContElement.h"
+#include "kernel/contour/offset/ActivePieces.h"
+#include "kernel/contour/offset/Removal.h"
+
+namespace gmkernel_detail {
+
+/// Walks along a source contour and turns its bands into the pieces that may bound the results.
+///
+/// Each element adds its band pieces to the active list, where they cut each other and where those
+/// too near to the span are removed; pieces of elements that left the span are retired.
+class BandSweep {
+public:
+    /// @param d the offset distance, positive to the right
+    /// @param span how many of the most recent elements cut and test pieces; none for 0 or less
+    BandSweep(double d, int span) : m_d(d), m_spanSize(span) {}
+
+    /// Takes the next element of the source.
+    void add(GmContElement const& record);
+    /// Ends the walk: the pieces of the kept side, in the order in which they were retired.
+    PieceList finish();
+
+private:
+    void advanceSpan(GmCurve const& element);
+    void retire();
+
+    double m_d;
+    int m_spanSize;
+    int m_index = -1;   ///< index of the newest element
+    SourceSpan m_span;  ///< clones of the most recent elements
+    ActivePieces m_active;
+    PieceList m_finished;  ///< retired pieces
+};
+
+}  // namespace gmkernel_detail

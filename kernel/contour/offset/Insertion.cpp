@@ -1,0 +1,60 @@
+#include "kernel/contour/offset/Insertion.h"
+
+#include <algorithm>
+#include <iterator>
+#include <vector>
+
+namespace gmkernel_detail {
+
+namespace {
+
+using Points = std::vector<GmPoint>;
+
+/// Splits a piece at points of its curve, taken in order along the curve. Points equal to an end
+/// split nothing. The parts before each point are inserted before the piece, which keeps the rest.
+void splitPiece(PieceRun& run, PieceList::iterator piece, Points& points) {
+    GmCurve& curve = piece->element.curve();
+    std::stable_sort(points.begin(), points.end(), less_than_curve(&curve));
+
+    bool split = false;
+    for (GmPoint const& p : points) {
+        if (p == curve.SP() || p == curve.EP()) continue;
+        GmOffsetElement part(piece->element);
+        part.curve().SetEP(p);
+        run.reach.include(run.pieces.insert(piece, Piece(std::move(part)))->reach);
+        curve.SetSP(p);
+        split = true;
+    }
+    if (!split) return;
+    piece->measure();
+    run.reach.include(piece->reach);
+    run.settled = false;
+}
+
+/// Cuts the pieces of a run where they cross the added one, and collects the points.
+void cutRun(PieceRun& run, Piece const& added, Points& ofAdded) {
+    Points ofOld;
+    for (auto old = run.pieces.begin(); old != run.pieces.end(); ++old) {
+        if (!added.reach.overlaps(old->reach)) continue;
+        ::Intersection(added.element.curve(), old->element.curve(), ofOld);
+        ofAdded.insert(ofAdded.end(), ofOld.begin(), ofOld.end());
+        splitPiece(run, old, ofOld);
+    }
+}
+
+}  // namespace
+
+void insertPiece(ActivePieces& active, GmOffsetElement element) {
+    Piece added(std::move(element));
+    Points ofAdded;
+    for (PieceRun& run : active.runs()) {
+        if (added.reach.overlaps(run.reach)) cutRun(run, added, ofAdded);
+    }
+    PieceRun& last = active.lastRun();
+    last.reach.include(added.reach);
+    last.settled = false;
+    last.pieces.push_back(std::move(added));
+    splitPiece(last, std::prev(last.pieces.end()), ofAdded);
+}
+
+}  // namespace gmkernel_detail

@@ -1,0 +1,62 @@
+/// @file
+/// Offsetting a contour at a constant distance.
+///
+/// A band construction: the points at distance |d| from the contour are bounded by the boundaries
+/// of the elements' bands. All band pieces are cut at their mutual crossings, so that each
+/// remaining piece lies wholly at the distance or wholly too near, and its halving point decides.
+/// What keeps its distance on the chosen side is chained into the results.
+///
+/// The bands of single elements are exact, but caps touch the offsets of their neighbours, so the
+/// distance test must not be strict: it leaves the calculation tolerance. Cost: quadratic in the
+/// number of elements, with box tests only for pieces that are apart.
+#include <cmath>
+
+#include "gmkernel/GmContour.h"
+#include "kernel/contour/GmContourArray.h"
+#include "kernel/contour/offset/BandSweep.h"
+#include "kernel/contour/offset/Chaining.h"
+#include "kernel/contour/offset/ResultContour.h"
+
+namespace {
+
+using namespace gmkernel_detail;
+
+/// The span that lets every element cut and test every piece.
+constexpr int kWholeContour = 1000000;
+
+bool goesInside(GmBase::eRotDir sense, double d) {
+    return (sense == GmBase::eRotCW && d > 0.0) || (sense == GmBase::eRotCCW && d < 0.0);
+}
+
+}  // namespace
+
+int GmContour::Offsetting(double d, int nSpan, bool bKeepOpen) {
+    if (std::fabs(d) < m_scdPrec) {
+        CopyContourToSubContour();
+        return m_pSubConts->GetCount();
+    }
+    if (!std::isfinite(d)) {
+        RemoveAllSubConts();
+        return 0;
+    }
+    const bool insideOnly = IsClosed() && !bKeepOpen && goesInside(Dir(GmPoint(0.0, 0.0, 0.0)), d);
+
+    BandSweep sweep(d, insideOnly ? kWholeContour : nSpan);
+    for (int i = 0; i < ElementCount(); ++i) {
+        sweep.add(*GetContElement(i));
+    }
+    PieceList pieces = sweep.finish();
+
+    RemoveAllSubConts();
+    while (!pieces.empty()) {
+        const PieceList chain = takeChain(pieces);
+        std::unique_ptr<GmContour> result = resultContour(chain);
+        if (!hasOffset(chain) || (insideOnly && !result->IsClosed())) continue;
+        m_pSubConts->Take(std::move(result));
+    }
+    return m_pSubConts->GetCount();
+}
+
+int GmContour::ParallelContours(double d, bool /*unused*/, bool /*unused*/, bool /*unused*/) {
+    return Offsetting(d, kWholeContour, false);
+}

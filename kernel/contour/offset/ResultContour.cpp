@@ -1,0 +1,49 @@
+#include "kernel/contour/offset/ResultContour.h"
+
+#include <algorithm>
+
+#include "gmkernel/GmContElement.h"
+#include "gmkernel/GmStretch.h"
+#include "kernel/contour/ContourElements.h"
+
+namespace gmkernel_detail {
+
+namespace {
+
+void append(GmContour& contour, std::unique_ptr<GmCurve> curve, int id, bool inserted) {
+    auto record = std::make_unique<GmContElement>();
+    record->pCurve = curve.get();
+    record->lId = id;
+    record->lIndex = contour.ElementCount();
+    record->bInserted = inserted;
+    if (!contour.AddElement(record.get(), false)) return;
+    // The contour owns both now.
+    static_cast<void>(curve.release());
+    static_cast<void>(record.release());
+}
+
+void bridgeGap(GmContour& contour, GmPoint const& to, int id) {
+    if (contour.ElementCount() == 0) return;
+    const GmPoint from = ChainEnd(contour);
+    if (from != to) append(contour, std::make_unique<GmStretch>(from, to), id, true);
+}
+
+}  // namespace
+
+std::unique_ptr<GmContour> resultContour(PieceList const& chain) {
+    auto contour = std::make_unique<GmContour>();
+    for (Piece const& piece : chain) {
+        GmOffsetElement const& element = piece.element;
+        bridgeGap(*contour, element.curve().SP(), element.id());
+        append(*contour, std::unique_ptr<GmCurve>(element.curve().Clone()), element.id(),
+               element.auxiliary());
+    }
+    return contour;
+}
+
+bool hasOffset(PieceList const& chain) {
+    return std::any_of(chain.begin(), chain.end(),
+                       [](Piece const& piece) { return !piece.element.auxiliary(); });
+}
+
+}  // namespace gmkernel_detail

@@ -1,0 +1,62 @@
+/// @file
+/// Rounding the corners of a contour.
+#include <memory>
+
+#include "gmkernel/GmArc.h"
+#include "gmkernel/GmContour.h"
+#include "gmkernel/GmStretch.h"
+#include "kernel/contour/transitions/FilletCircle.h"
+
+namespace {
+
+GmCircle circleInCorner(GmCurve const& prev, GmCurve const& cur, double radius) {
+    if (!prev.IsStretch() || !cur.IsStretch())
+        return gmkernel_detail::filletCircle(prev, cur, radius);
+    // Reversed as a line: height and rounding of the corner come from the start of `prev`.
+    return GmCircle(static_cast<GmLine const&>(prev).Inverted(), static_cast<GmLine const&>(cur),
+                    radius);
+}
+
+/// The arc that rounds a corner and the points where it meets the elements.
+struct Fillet {
+    std::unique_ptr<GmArc> arc;  ///< null where no circle touches each element in exactly one point
+    GmPoint start;
+    GmPoint end;
+};
+
+Fillet filletBetween(GmCurve const& prev, GmCurve const& cur, double radius) {
+    const GmCircle circle = circleInCorner(prev, cur, radius);
+    if (!circle.CreationOK() || circle.Intersection(&prev) != 1) return {};
+    const GmPoint start = circle.GetSolution(0);
+    if (circle.Intersection(&cur) != 1) return {};
+    const GmPoint end = circle.GetSolution(0);
+    if (start == end) return {};
+    return {std::make_unique<GmArc>(circle, start, end, true), start, end};
+}
+
+/// Does the mode ask for a corner that turns in the given sense?
+bool isWanted(int nMode, bool turnsWithContour) {
+    return turnsWithContour ? nMode <= 0 : nMode >= 0;
+}
+
+}  // namespace
+
+void GmContour::RoundCorners(double dRadius, int nMode) {
+    if (ElementCount() == 0) return;
+    const eRotDir sense = Dir(GmPoint(0.0, 0.0, 0.0));
+    int corners = static_cast<int>(ElementCount()) - (m_bClosed ? 0 : 1);
+    for (int j = 1; j <= corners; ++j) {
+        GmCurve& prev = *GetElement(j - 1);
+        GmCurve& cur = *GetElement(j < ElementCount() ? j : 0);
+        Fillet fillet = filletBetween(prev, cur, dRadius);
+        if (!fillet.arc || (m_bClosed && !isWanted(nMode, fillet.arc->Dir() == sense))) continue;
+        prev.SetEP(fillet.start);
+        cur.SetSP(fillet.end);
+        std::unique_ptr<GmContElement> record(CreateContElement(fillet.arc.get(), j, j, true));
+        m_pElements->InsertAt(j, record.get());
+        static_cast<void>(record.release());
+        static_cast<void>(fillet.arc.release());
+        ++j;
+        ++corners;
+    }
+}

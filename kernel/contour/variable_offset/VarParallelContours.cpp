@@ -1,0 +1,131 @@
+/// @file
+/// Parallel contours with different distances in x and y.
+///
+/// Every element moves by a vector that the quadrant of its direction chooses. Neighbours are
+/// trimmed or bridged; where the resulting chain crosses itself, walks from crossing to crossing
+/// take it apart into loops, of which those with the sense of the source are kept.
+#include "gmkernel/GmContour.h"
+#include "kernel/contour/GmContourArray.h"
+#include "kernel/contour/variable_offset/ShiftedElements.h"
+#include "kernel/contour/walk/LoopContour.h"
+#include "kernel/contour/walk/PassageWalk.h"
+#include "kernel/curves/CurveBox.h"
+
+namespace {
+
+using namespace gmkernel_detail;
+
+constexpr int kDidNotComeBack = -2;
+
+/// Is the crossing only the joint of two curves that follow each other in the chain?
+bool isJoint(GmPoint const& p, CurveList const& curves, int i, int k, bool closed) {
+    if (k - i <= 1 && p == curves[i].EP()) return true;
+    return closed && i == 0 && k == curves.Count() - 1 && p == curves[i].SP();
+}
+
+void addPassages(Passages& passages, CurveList const& curves, int i, int k, bool closed) {
+    GmCurve const& first = curves[i];
+    GmCurve const& second = curves[k];
+    first.Intersection(&second);
+    for (GmPoint const& p : first.GetPtSol()) {
+        if (!isJoint(p, curves, i, k, closed)) passages.AddCrossing(first, i, second, k, p);
+    }
+}
+
+void addPassagesAmong(Passages& passages, CurveList const& curves, bool closed) {
+    std::vector<CurveBox> reaches;
+    for (int i = 0; i < curves.Count(); ++i)
+        reaches.push_back(reachOf(curves[i]));
+    for (int i = 0; i < curves.Count(); ++i) {
+        const CurveBox& reach = reaches[static_cast<std::size_t>(i)];
+        for (int k = i + 1; k < curves.Count(); ++k) {
+            if (!reach.overlaps(reaches[static_cast<std::size_t>(k)])) continue;
+            addPassages(passages, curves, i, k, closed);
+        }
+    }
+}
+
+/// Where the pieces of a walk along an open chain go: behind the others up to the end of the chain,
+/// then, in order, in front of them.
+class InsertPosition {
+public:
+    void AtEndOfOpenChain() { m_next = -1; }
+    bool InFront() const { return m_next >= 0; }
+    int Index() const { return m_next; }
+    void Advance() {
+        if (m_next > kNotReached) ++m_next;
+    }
+
+private:
+    static constexpr int kNotReached = -2;
+    int m_next = kNotReached;
+};
+
+Loops wholeChain(CurveList const& curves) {
+    Loops loops;
+    loops.contours.push_back(std::make_unique<GmContour>());
+    for (int i = 0; i < curves.Count(); ++i)
+        loops.contours.front()->AddElement(curves[i], false, 0);
+    return loops;
+}
+
+/// One loop, from the passage `start` on; null when it is no continuous chain or, with `cameBack`
+/// false, when the walk was given up.
+std::unique_ptr<GmContour> loopFrom(Passages& passages, int start, CurveList const& curves,
+                                    bool closed, bool& cameBack) {
+    auto loop = std::make_unique<LoopContour>();
+    InsertPosition position;
+    WalkTrack track;
+    track.curveCount = curves.Count();
+    track.curveAt = [&](int index) -> GmCurve const& { return curves[index]; };
+    track.following = [&](int index) {
+        if (index + 1 < curves.Count()) return index + 1;
+        if (!closed) position.AtEndOfOpenChain();
+        return 0;
+    };
+    track.append = [&](GmCurve& piece) {
+        if (position.InFront())
+            loop->InsertElem(position.Index(), &piece, false, 0);
+        else
+            loop->AddRealElem(&piece);
+        position.Advance();
+    };
+    cameBack = walkLoop(passages, start, track);
+    const bool continuous = !position.InFront() || loop->CheckContour();
+    return cameBack && continuous ? std::move(loop) : nullptr;
+}
+
+Loops loopsOf(CurveList const& curves, Passages& passages, bool closed) {
+    Loops loops;
+    for (int i = 0; i < passages.Count() && loops.cameBack; ++i) {
+        if (passages[i].bUsed) continue;
+        std::unique_ptr<GmContour> loop = loopFrom(passages, i, curves, closed, loops.cameBack);
+        if (loop) loops.contours.push_back(std::move(loop));
+    }
+    return loops;
+}
+
+}  // namespace
+
+int GmContour::VarParallelContours(GmVec const& v) {
+    SplitArcsQuadrant();
+    if (v.Length() < m_scdPrec) {
+        CopyContourToSubContour();
+        return m_pSubConts->GetCount();
+    }
+    CurveList curves;
+    shiftElements(*this, v, curves);
+    closeGaps(curves, m_bClosed);
+    removeCollapsed(curves);
+    Passages passages;
+    addPassagesAmong(passages, curves, m_bClosed);
+    Loops loops = passages.Count() <= 1 ? wholeChain(curves) : loopsOf(curves, passages, m_bClosed);
+
+    RemoveAllSubConts();
+    const GmPoint origin(0.0, 0.0, 0.0);
+    const eRotDir sense = Dir(origin);
+    for (std::unique_ptr<GmContour>& loop : loops.contours) {
+        if (loop->Dir(origin) == sense) m_pSubConts->Take(std::move(loop));
+    }
+    return loops.cameBack ? m_pSubConts->GetCount() : kDidNotComeBack;
+}

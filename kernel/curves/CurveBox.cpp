@@ -1,0 +1,47 @@
+#include "kernel/curves/CurveBox.h"
+
+#include "gmkernel/GmArc.h"
+#include "gmkernel/GmRect.h"
+
+namespace gmkernel_detail {
+
+namespace {
+
+/// Twice the membership tolerance of arcs, in length units.
+constexpr double kReachMargin = 0.02;
+
+/// Does the arc's membership test accept points all around the circle? Arcs whose ends are equal
+/// within the point tolerance count as full circles there, whatever their sweep.
+bool reachesAround(GmArc const& arc) {
+    const bool hasSense = arc.Dir() == GmBase::eRotCW || arc.Dir() == GmBase::eRotCCW;
+    return !hasSense || arc.SP() == arc.EP();
+}
+
+/// The point of the circle at a stored angle. Angles next to an axis are stored as the axis, so
+/// that on large circles this point differs from the end point.
+GmPoint atAngle(GmArc const& arc, double degrees) {
+    return GmPoint(arc.M() + arc.R() * GmVec(GmDir(GmAngle(degrees, false))));
+}
+
+GmRect arcReach(GmArc const& arc) {
+    GmRect box = arc.BoundingRect();
+    if (reachesAround(arc)) box = box.Or(arc.GmCircle::BoundingRect());
+    box.Include(atAngle(arc, arc.SAngDeg()));
+    box.Include(atAngle(arc, arc.EAngDeg()));
+    return box;
+}
+
+}  // namespace
+
+CurveBox boxOf(GmPoint const& p) {
+    return {p.X(), p.X(), p.Y(), p.Y()};
+}
+
+CurveBox reachOf(GmCurve const& curve) {
+    const GmRect box =
+        curve.IsArc() ? arcReach(static_cast<GmArc const&>(curve)) : curve.BoundingRect();
+    return {box.Left() - kReachMargin, box.Right() + kReachMargin, box.Bottom() - kReachMargin,
+            box.Top() + kReachMargin};
+}
+
+}  // namespace gmkernel_detail

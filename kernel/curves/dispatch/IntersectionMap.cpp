@@ -1,0 +1,128 @@
+/// @file
+/// Which kernel intersects which ordered pair of curves.
+///
+/// A kernel works on the infinite carriers and full circles; its points are kept where every
+/// bounded curve of the pair accepts them. Swapped pairs run the same function with swapped
+/// arguments, so that both give the same points in the same order.
+#include <stdexcept>
+#include <unordered_map>
+#include <vector>
+
+#include "gmkernel/GmArc.h"
+#include "gmkernel/GmBeam.h"
+#include "gmkernel/GmContour.h"
+#include "gmkernel/GmStretch.h"
+#include "kernel/curves/SupportHits.h"
+#include "kernel/curves/dispatch/PairKey.h"
+
+namespace {
+
+using namespace gmkernel_detail;
+using Points = std::vector<GmPoint>;
+using IntersectionEntry = void (*)(GmBase const&, GmBase const&, Points&);
+using IntersectionMap = std::unordered_map<int, IntersectionEntry>;
+
+// Does a point that lies on the carrier or the full circle also lie on the curve itself?
+bool holds(GmLine const&, GmPoint const&) {
+    return true;
+}
+bool holds(GmCircle const&, GmPoint const&) {
+    return true;
+}
+bool holds(GmBeam const& beam, GmPoint const& p) {
+    return beam.Element(p);
+}
+bool holds(GmStretch const& stretch, GmPoint const& p) {
+    return stretch.Element(p);
+}
+bool holds(GmArc const& arc, GmPoint const& p) {
+    return arc.Element(p);
+}
+
+template <class A, class B>
+void intersectPair(GmBase const& first, GmBase const& second, Points& result) {
+    auto const& a = static_cast<A const&>(first);
+    auto const& b = static_cast<B const&>(second);
+    for (GmPoint const& p : carrierHits(a, b)) {
+        if (holds(a, p) && holds(b, p)) result.push_back(p);
+    }
+}
+
+/// The contour collects the points in its own solution list.
+void intersectContour(GmBase const& first, GmBase const& second, Points& result) {
+    auto const& contour = static_cast<GmContour const&>(first);
+    contour.IntersectionWithCurve(static_cast<GmCurve const*>(&second));
+    if (&contour.GetPtSol() != &result) result = contour.GetPtSol();
+}
+
+template <IntersectionEntry entry>
+void swapped(GmBase const& first, GmBase const& second, Points& result) {
+    entry(second, first, result);
+}
+
+/// Enters a pair of different kinds in both orders.
+template <IntersectionEntry entry>
+void enterBoth(IntersectionMap& map, GmBase::eGmTypes a, GmBase::eGmTypes b) {
+    map.emplace(pairKey(a, b), entry);
+    map.emplace(pairKey(b, a), swapped<entry>);
+}
+
+void enterStraightPairs(IntersectionMap& map) {
+    map.emplace(pairKey(GmBase::eGmLine, GmBase::eGmLine), intersectPair<GmLine, GmLine>);
+    map.emplace(pairKey(GmBase::eGmBeam, GmBase::eGmBeam), intersectPair<GmBeam, GmBeam>);
+    map.emplace(pairKey(GmBase::eGmStretch, GmBase::eGmStretch),
+                intersectPair<GmStretch, GmStretch>);
+    enterBoth<intersectPair<GmLine, GmBeam>>(map, GmBase::eGmLine, GmBase::eGmBeam);
+    enterBoth<intersectPair<GmLine, GmStretch>>(map, GmBase::eGmLine, GmBase::eGmStretch);
+    enterBoth<intersectPair<GmBeam, GmStretch>>(map, GmBase::eGmBeam, GmBase::eGmStretch);
+}
+
+void enterMixedPairs(IntersectionMap& map) {
+    enterBoth<intersectPair<GmCircle, GmLine>>(map, GmBase::eGmCircle, GmBase::eGmLine);
+    enterBoth<intersectPair<GmCircle, GmBeam>>(map, GmBase::eGmCircle, GmBase::eGmBeam);
+    enterBoth<intersectPair<GmCircle, GmStretch>>(map, GmBase::eGmCircle, GmBase::eGmStretch);
+    enterBoth<intersectPair<GmArc, GmLine>>(map, GmBase::eGmArc, GmBase::eGmLine);
+    enterBoth<intersectPair<GmArc, GmBeam>>(map, GmBase::eGmArc, GmBase::eGmBeam);
+    enterBoth<intersectPair<GmArc, GmStretch>>(map, GmBase::eGmArc, GmBase::eGmStretch);
+}
+
+void enterRoundPairs(IntersectionMap& map) {
+    map.emplace(pairKey(GmBase::eGmCircle, GmBase::eGmCircle), intersectPair<GmCircle, GmCircle>);
+    map.emplace(pairKey(GmBase::eGmArc, GmBase::eGmArc), intersectPair<GmArc, GmArc>);
+    enterBoth<intersectPair<GmCircle, GmArc>>(map, GmBase::eGmCircle, GmBase::eGmArc);
+}
+
+void enterContourPairs(IntersectionMap& map) {
+    map.emplace(pairKey(GmBase::eGmContour, GmBase::eGmContour), intersectContour);
+    for (const GmBase::eGmTypes other : {GmBase::eGmLine, GmBase::eGmBeam, GmBase::eGmStretch,
+                                         GmBase::eGmCircle, GmBase::eGmArc}) {
+        enterBoth<intersectContour>(map, GmBase::eGmContour, other);
+    }
+}
+
+IntersectionMap buildMap() {
+    IntersectionMap map;
+    enterStraightPairs(map);
+    enterMixedPairs(map);
+    enterRoundPairs(map);
+    enterContourPairs(map);
+    return map;
+}
+
+/// Built on first use, so that calls from static initialisers elsewhere find it complete.
+IntersectionMap const& intersectionMap() {
+    static const IntersectionMap map = buildMap();
+    return map;
+}
+
+/// Fills the map when the library is loaded.
+[[maybe_unused]] const bool filledAtLoad = !intersectionMap().empty();
+
+}  // namespace
+
+void Intersection(GmBase const& a, GmBase const& b, std::vector<GmPoint>& result) {
+    result.clear();
+    const auto found = intersectionMap().find(pairKey(a.GetType(), b.GetType()));
+    if (found == intersectionMap().end()) throw std::runtime_error("Function not found");
+    found->second(a, b, result);
+}

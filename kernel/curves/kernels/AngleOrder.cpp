@@ -1,0 +1,15 @@
+#include "kernel/curves/kernels/AngleOrder.h"
+
+namespace gmkernel_detail {
+
+GmBase::eRotDir angleOrder(GmAngle const& a0, GmAngle const& a1, GmAngle const& a2) {
+    if (a0 < a1 && a1 < a2) return GmBase::eRotCCW;
+    if (a2 < a0 && (a0 < a1 || a1 < a2)) return GmBase::eRotCCW;
+    if (a2 < a1 && a1 < a0) return GmBase::eRotCW;
+    if (!(a0 < a2)) return GmBase::eRotNone;
+    if (a1 < a0) return GmBase::eRotCW;
+    if (!(a2 < a1)) return GmBase::eRotNone;
+    return GmBase::eRotCW;
+}
+
+}  // namespace gmkernel_detail

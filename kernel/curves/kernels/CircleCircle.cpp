@@ -1,0 +1,39 @@
+#include "kernel/curves/kernels/CircleCircle.h"
+
+#include <cmath>
+
+#include "gmkernel/GmBase.h"
+
+namespace gmkernel_detail {
+
+namespace {
+
+bool apartOrNested(double dist, double r0, double r1) {
+    return dist > r0 + r1 + GmBase::m_scdPrecCalc ||
+           dist < std::fabs(r0 - r1) - GmBase::m_scdPrecCalc || dist < GmBase::m_scdPrec;
+}
+
+}  // namespace
+
+Hits<2> intersectCircleCircle(GmPoint const& m0, double r0, GmPoint const& m1, double r1) {
+    Hits<2> hits;
+    const double dx = m1.X() - m0.X();
+    const double dy = m1.Y() - m0.Y();
+    const double dist = std::sqrt(dx * dx + dy * dy);
+    if (apartOrNested(dist, r0, r1)) return hits;
+
+    const double a = (r0 * r0 - r1 * r1 + dist * dist) / (2.0 * dist);
+    const double footX = m0.X() + a * dx / dist;
+    const double footY = m0.Y() + a * dy / dist;
+    const double h2 = r0 * r0 - a * a;
+    const double h = h2 >= 0.0 ? std::sqrt(h2) : 0.0;
+    if (h < GmBase::m_scdPrec) {
+        hits.add(GmPoint(footX, footY, m0.Z()));
+        return hits;
+    }
+    hits.add(GmPoint(footX + h * dy / dist, footY - h * dx / dist, m0.Z()));
+    hits.add(GmPoint(footX - h * dy / dist, footY + h * dx / dist, m0.Z()));
+    return hits;
+}
+
+}  // namespace gmkernel_detail

@@ -1,0 +1,15 @@
+#pragma once
+
+#include "gmkernel/GmDir.h"
+#include "gmkernel/GmPoint.h"
+#include "kernel/curves/kernels/Hits.h"
+
+namespace gmkernel_detail {
+
+/// The crossing of two straight carriers, each given by a point and a direction; none for parallel
+/// directions, coincident carriers included. Planar: z comes from the start of `a`, or of `b` where
+/// only `b` is parallel to the y axis.
+Hits<1> intersectLineLine(GmPoint const& spA, GmDir const& dirA, GmPoint const& spB,
+                          GmDir const& dirB);
+
+}  // namespace gmkernel_detail

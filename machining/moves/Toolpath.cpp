@@ -1,0 +1,17 @@
+#include "machining/moves/Toolpath.h"
+
+#include <cmath>
+
+namespace gmpath {
+
+double travel(const Toolpath& moves, MoveKind kind) {
+    double sum = 0.0;
+    double z = 0.0;
+    for (const Move& move : moves) {
+        if (move.kind == kind) sum += length(move.path) + std::abs(move.z - z);
+        z = move.z;
+    }
+    return sum;
+}
+
+}  // namespace gmpath

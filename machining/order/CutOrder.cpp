@@ -1,0 +1,31 @@
+#include "machining/order/CutOrder.h"
+
+#include <utility>
+
+namespace gmpath {
+
+ToolpathOrder::ToolpathOrder(std::vector<std::vector<std::size_t>> holders)
+    : m_holders(std::move(holders)),
+      m_heldUncut(m_holders.size(), 0),
+      m_finished(m_holders.size()) {
+    for (const std::vector<std::size_t>& round : m_holders) {
+        for (const std::size_t holder : round)
+            ++m_heldUncut[holder];
+    }
+}
+
+std::vector<std::size_t> ToolpathOrder::ready() const {
+    std::vector<std::size_t> found;
+    for (std::size_t i = 0; i < m_holders.size(); ++i) {
+        if (!m_finished[i] && m_heldUncut[i] == 0) found.push_back(i);
+    }
+    return found;
+}
+
+void ToolpathOrder::finish(std::size_t contour) {
+    m_finished[contour] = true;
+    for (const std::size_t holder : m_holders[contour])
+        --m_heldUncut[holder];
+}
+
+}  // namespace gmpath

@@ -1,0 +1,44 @@
+#pragma once
+
+#include <cstddef>
+#include <memory>
+#include <string>
+#include <vector>
+
+#include "gmkernel/GmContour.h"
+#include "gmkernel/GmCurve.h"
+#include "gmkernel/GmPoint.h"
+#include "region/model/Path.h"
+
+namespace gmpath {
+
+/// Elements below this length, over which the kernel joins pieces, may tear its results.
+constexpr double kShortestForKernel = 3.0 * kKernelTolerance;
+
+GmPoint kernelPoint(Vec2 p);
+Vec2 fromKernel(const GmPoint& p);
+
+/// The element as a segment or an arc of the kernel; undefined when it is too short for one.
+std::unique_ptr<GmCurve> kernelCurve(const Element& e);
+
+/// A path without the elements below a length, and the indices that the others had. A path that
+/// small altogether stays as it is.
+struct SimplifiedPath {
+    Path path;
+    std::vector<std::size_t> indices;
+};
+SimplifiedPath simplifiedForKernel(const Path& path, double shortest = kShortestForKernel);
+
+/// Fills an empty contour with a path, the indices as identifiers. False when the joints of the
+/// path are off beyond the kernel's tolerance or an element cannot be built.
+bool fillContour(GmContour& contour, const SimplifiedPath& source);
+
+/// A contour of the kernel as a path, and for each of its elements the identifier it comes with. An
+/// arc may become two elements.
+struct IdentifiedPath {
+    Path path;
+    std::vector<std::size_t> identifiers;
+};
+IdentifiedPath pathFromKernel(const GmContour& contour, const std::string& layer);
+
+}  // namespace gmpath

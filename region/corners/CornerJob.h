@@ -1,0 +1,52 @@
+#pragma once
+
+#include <cstddef>
+#include <vector>
+
+#include "region/model/Path.h"
+
+namespace gmpath {
+
+/// What a corner becomes, and what the value means.
+enum class CornerKind {
+    kRounding,         ///< a tangent arc of this radius
+    kChamferDistance,  ///< a chamfer that starts and ends at this distance from the corner
+    kChamferLength     ///< a chamfer of this length
+};
+
+/// Which corners of a closed contour are done. Of an open one all are: it has no inside.
+enum class CornerChoice {
+    kAll,
+    kConvex,  ///< those that turn with the contour
+    kConcave  ///< those that turn against it
+};
+
+struct CornerRequest {
+    CornerKind kind = CornerKind::kRounding;
+    double value = 0.0;  ///< positive, in units of the contours
+    CornerChoice choice = CornerChoice::kAll;
+    /// Joints that bend by less are no corners, in radians. Drawings are full of arcs that leave
+    /// their neighbours not quite smoothly.
+    double leastBend = 5.0 / 180.0 * kPi;
+};
+
+/// A contour with its corners done.
+struct CornerResult {
+    Path path;
+    std::size_t done = 0;
+    std::size_t notDone =
+        0;                 ///< corners that have no room for the transition; they stay as they are
+    bool accepted = true;  ///< false when the kernel refused the contour, which then stays as it is
+};
+
+/// The joints of a path that are corners to be done: the indices of the elements that end there.
+std::vector<std::size_t> cornersOf(const Path& path, const CornerRequest& request);
+
+/// Rounds or chamfers the corners of every contour, from the last corner of a contour to its first.
+/// A transition has room where it fits between its two elements and touches nothing else: neither
+/// the rest of its contour nor another contour. One result a contour. Cost: the square of the
+/// number of elements.
+std::vector<CornerResult> breakCorners(const std::vector<Path>& contours,
+                                       const CornerRequest& request);
+
+}  // namespace gmpath

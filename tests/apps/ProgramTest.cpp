@@ -1,0 +1,209 @@
+#include <gtest/gtest.h>
+#include <sys/wait.h>
+
+#include <algorithm>
+#include <cstdlib>
+#include <filesystem>
+#include <string>
+#include <utility>
+#include <vector>
+
+#include "tests/support/DrawingText.h"
+#include "tests/support/PathShapes.h"
+#include "tests/support/Scratch.h"
+
+using path_shapes::rectangle;
+
+namespace {
+
+struct Outcome {
+    int exitCode;
+    std::string out;
+    std::string err;
+};
+
+class Program : public testing::Test {
+protected:
+    Outcome run(const std::string& arguments) const {
+        const std::string command = "cd " + m_scratch.directory() + " && " + GMPATH_PROGRAM + " " +
+                                    arguments + " >out.txt 2>err.txt";
+        const int status = std::system(command.c_str());
+        Outcome outcome{WIFEXITED(status) ? WEXITSTATUS(status) : -1, m_scratch.content("out.txt"),
+                        m_scratch.content("err.txt")};
+        std::filesystem::remove(m_scratch.file("out.txt"));
+        std::filesystem::remove(m_scratch.file("err.txt"));
+        return outcome;
+    }
+
+    const Scratch m_scratch;
+};
+
+const std::string kBracket = std::string(GMPATH_TEST_DATA) + "/bracket.dxf";
+
+const std::string kDrawingInFeet =
+    "0\nSECTION\n2\nHEADER\n9\n$INSUNITS\n70\n2\n0\nENDSEC\n0\nSECTION\n2\nENTITIES\n"
+    "0\nCIRCLE\n8\n0\n10\n5\n20\n5\n40\n3\n0\nCIRCLE\n8\n0\n10\n5\n20\n5\n40\n0.5\n"
+    "0\nENDSEC\n0\nEOF\n";
+
+bool isOneLine(const std::string& text) {
+    return std::count(text.begin(), text.end(), '\n') == 1 && text.back() == '\n';
+}
+
+}  // namespace
+
+TEST_F(Program, InfoListsContoursAndWhatWasSkipped) {
+    const Outcome info = run("info " + kBracket);
+    EXPECT_EQ(info.exitCode, 0);
+    EXPECT_EQ(std::count(info.out.begin(), info.out.end(), '\n'), 1 + 4 + 2);
+    EXPECT_NE(info.out.find("skipped: 1 TEXT on layer NOTES"), std::string::npos);
+    EXPECT_NE(info.out.find("dropped: 1 duplicate\n"), std::string::npos);
+    EXPECT_NE(info.err.find("1 TEXT on layer NOTES"), std::string::npos);
+    EXPECT_EQ(run("info --strict " + kBracket).exitCode, 2);
+}
+
+TEST_F(Program, OffsetWritesEveryOutput) {
+    const Outcome offset =
+        run("offset " + kBracket + " --distance 2 --count 3 --step 2.5 -o a.svg -o a.dxf");
+    EXPECT_EQ(offset.exitCode, 0);
+    EXPECT_EQ(m_scratch.files(), 2U);
+    EXPECT_NE(m_scratch.content("a.svg").find("pass-3"), std::string::npos);
+    EXPECT_NE(offset.err.find("nothing left at distance 7"), std::string::npos);
+    const Outcome back = run("info a.dxf");
+    EXPECT_EQ(back.exitCode, 0);
+    EXPECT_NE(back.out.find("OFFSET_3"), std::string::npos);
+    EXPECT_EQ(run("offset " + kBracket + " --distance -1 --side both -o b.svg").exitCode, 0);
+}
+
+TEST_F(Program, ToolpathWritesProgramAndPicture) {
+    m_scratch.store("feet.dxf", kDrawingInFeet);
+    const Outcome cut =
+        run("toolpath feet.dxf --scale 12 --units inch --tool 14 --lead arc --spindle 8000 "
+            "-o a.NGC -o a.svg");
+    EXPECT_EQ(cut.exitCode, 0);
+    EXPECT_EQ(cut.err, "gmpath: feet.dxf: contour 2: the tool does not fit\n");
+    EXPECT_EQ(cut.out.find("2 contours, cuts 270.2 in, "), 0U) << cut.out;
+    EXPECT_NE(m_scratch.content("a.NGC").find("\nG20\n"), std::string::npos);
+    EXPECT_NE(m_scratch.content("a.NGC").find("\nM3 S8000.000\n"), std::string::npos);
+    for (const std::string part : {"source", "cut", "lead", "rapid"}) {
+        EXPECT_NE(m_scratch.content("a.svg").find("<path class=\"" + part), std::string::npos);
+    }
+}
+
+TEST_F(Program, CornersAndMeltSayWhatTheyDid) {
+    using drawing_text::drawing;
+    using drawing_text::lightPolyline;
+    m_scratch.store("a.dxf", drawing(lightPolyline(rectangle({0, 0}, {10, 10}).elements, true)));
+    m_scratch.store("b.dxf", drawing(lightPolyline(rectangle({6, 2}, {9, 30}).elements, true) +
+                                     lightPolyline(rectangle({1, 1}, {2, 2}).elements, true)));
+    const Outcome corners = run("corners b.dxf --chamfer 1.2 -o c.svg -o c.dxf");
+    EXPECT_EQ(corners.exitCode, 0);
+    EXPECT_EQ(corners.out, "2 contours, 4 corners done, 4 not done\n");
+    EXPECT_EQ(corners.err, "gmpath: b.dxf: contour 2: no room at 4 of 4 corners\n");
+    const Outcome rounded = run("info c.dxf");
+    EXPECT_EQ(std::count(rounded.out.begin(), rounded.out.end(), '\n'), 3) << "no sources beside";
+    const Outcome melt = run("melt a.dxf b.dxf -o m.svg -o m.dxf");
+    EXPECT_EQ(melt.exitCode, 0);
+    EXPECT_EQ(melt.out,
+              "A1 + B1: 2 loops (1 outline, 1 common part)\nA1 + B2: no loops, B2 lies inside\n"
+              "2 pairs, 1 melted\n");
+    EXPECT_NE(run("info m.dxf").out.find("COMMON"), std::string::npos);
+    EXPECT_NE(m_scratch.content("m.svg").find("id=\"contour-B2\""), std::string::npos);
+    // Flush along two sides: the kernel's loops leave out the outline.
+    m_scratch.store("c.dxf", drawing(lightPolyline(rectangle({5, 0}, {15, 10}).elements, true)));
+    const Outcome flush = run("melt a.dxf c.dxf -o m.svg");
+    EXPECT_EQ(flush.exitCode, 1);
+    EXPECT_EQ(flush.err, "gmpath: A1 + B1: the loops are not outline and common parts\n");
+}
+
+TEST_F(Program, FaultyOffsetsAreNamedAndDashed) {
+    // A polygon that crosses itself has no closed offset.
+    const std::vector<gmpath::Element> crossing = {
+        {{0, 0}, {}}, {{20, 12}, {}}, {{20, 0}, {}}, {{0, 10}, {}}};
+    m_scratch.store("a.dxf", drawing_text::drawing(drawing_text::lightPolyline(crossing, true)));
+    const Outcome offset = run("offset a.dxf --distance 1 --side left -o a.svg -o b.dxf");
+    EXPECT_EQ(offset.exitCode, 1);
+    EXPECT_EQ(offset.err, "gmpath: a.dxf: contour 1: the offset by 1 to the left is not closed\n");
+    EXPECT_EQ(m_scratch.files(), 3U);
+    const std::string svg = m_scratch.content("a.svg");
+    EXPECT_NE(svg.find("class=\"result pass-1 doubtful\""), std::string::npos);
+    EXPECT_NE(svg.find("dashed: faulty"), std::string::npos);
+    run("offset a.dxf --distance 0 -o a.svg");
+    EXPECT_EQ(m_scratch.content("a.svg").find("dashed: faulty"), std::string::npos);
+}
+
+TEST_F(Program, BadInputIsOneLineAndExitCodeTwo) {
+    m_scratch.store("empty.dxf", "");
+    m_scratch.store("prose.dxf", "This is no drawing.\nNot at all.\n");
+    m_scratch.store("cut.dxf", "0\nSECTION\n2\nENTITIES\n0\nLINE\n8\n0\n10\n");
+    m_scratch.store("binary.dxf", std::string("\x7F"
+                                              "ELF\0\0\1\2",
+                                              8));
+    m_scratch.store("bare.dxf", "0\nSECTION\n2\nENTITIES\n0\nENDSEC\n0\nEOF\n");
+    m_scratch.store("feet.dxf", kDrawingInFeet);
+    std::filesystem::create_directory(m_scratch.file("folder.dxf"));
+    const std::size_t before = m_scratch.files();
+    const std::vector<std::pair<std::string, std::string>> cases = {
+        {"info none.dxf", "none.dxf"},
+        {"info folder.dxf", "folder.dxf"},
+        {"info empty.dxf", "empty"},
+        {"info prose.dxf", "no DXF file"},
+        {"info cut.dxf", "truncated"},
+        {"info binary.dxf", "binary"},
+        {"info bare.dxf", "no contours"},
+        {"info " + kBracket + " --join nan", "--join"},
+        {"info " + kBracket + " --scale 0", "--scale"},
+        {"offset bare.dxf --distance 1 -o a.svg", "no contours"},
+        {"offset " + kBracket + " --distance nan -o a.svg", "--distance"},
+        {"offset " + kBracket + " --distance 1e999 -o a.svg", "--distance"},
+        {"offset " + kBracket + " --distance abc -o a.svg", "--distance"},
+        {"offset " + kBracket + " --distance 1 --count 0 -o a.svg", "--count"},
+        {"offset " + kBracket + " --distance 1 --count 9 --step inf -o a.svg", "--step"},
+        {"offset " + kBracket + " --distance 1 --side up -o a.svg", "--side"},
+        {"offset " + kBracket + " --distance 1 -o no/a.svg", "no/a.svg"},
+        {"offset " + kBracket + " --distance 1 -o folder.dxf", "folder.dxf"},
+        {"offset " + kBracket + " --distance 1 -o a.svg -o a.pdf", "a.pdf"},
+        {"offset " + kBracket + " --distance 1 --strict -o a.svg", "TEXT"},
+        {"offset " + kBracket + " -o a.svg", "--distance"},
+        {"offset " + kBracket + " --distance 1", "--output"},
+        {"toolpath " + kBracket + " -o a.ngc", "--tool"},
+        {"toolpath " + kBracket + " --tool nan -o a.ngc", "--tool"},
+        {"toolpath " + kBracket + " --tool 4 -o a.dxf", ".ngc or .svg"},
+        {"toolpath " + kBracket + " --tool 4 --stock -1 -o a.ngc", "--stock"},
+        {"toolpath " + kBracket + " --tool 4 --lead 3 -o a.ngc", "--lead"},
+        {"toolpath " + kBracket + " --tool 4 --lead spiral -o a.ngc", "--lead"},
+        {"toolpath " + kBracket + " --tool 4 --lead-angle inf -o a.ngc", "--lead-angle"},
+        {"toolpath " + kBracket + " --tool 4 --depth 20 --step-down 0.01 -o a.ngc", "--step-down"},
+        {"toolpath " + kBracket + " --tool 4 --safe-z 0 -o a.ngc", "--safe-z"},
+        {"toolpath " + kBracket + " --tool 4 --plunge 1e-9 -o a.ngc", "--plunge"},
+        {"toolpath " + kBracket + " --tool 4 --count 9 --step 9e8 -o a.ngc", "--step"},
+        {"toolpath " + kBracket + " --tool 4 --climb --conventional -o a.ngc", "excludes"},
+        {"toolpath feet.dxf --tool 4 -o a.ngc", "feet"},
+        {"", "subcommand"},
+        {"corners " + kBracket + " -o a.svg", "--radius"},
+        {"corners " + kBracket + " --radius 1 --chamfer 2 -o a.svg", "excludes"},
+        {"corners " + kBracket + " --radius 1 --bend nan -o a.svg", "--bend"},
+        {"corners " + kBracket + " --chamfer-length nan -o a.svg", "--chamfer-length"},
+        {"melt " + kBracket + " -o a.svg", "SECOND"},
+        {"melt " + kBracket + " none.dxf -o a.svg", "none.dxf"},
+        {"melt bare.dxf " + kBracket + " -o a.svg", "bare.dxf"},
+        {"melt " + kBracket + " " + kBracket + " -o a.ngc", ".svg or .dxf"},
+    };
+    for (const auto& [arguments, cause] : cases) {
+        SCOPED_TRACE(arguments);
+        const Outcome outcome = run(arguments);
+        EXPECT_EQ(outcome.exitCode, 2);
+        EXPECT_TRUE(isOneLine(outcome.err)) << outcome.err;
+        EXPECT_NE(outcome.err.find(cause), std::string::npos) << outcome.err;
+        EXPECT_EQ(outcome.out, "");
+        EXPECT_EQ(m_scratch.files(), before);
+    }
+}
+
+TEST_F(Program, HelpHasAnExamplePerSubcommand) {
+    EXPECT_NE(run("info --help").out.find("Example: gmpath info"), std::string::npos);
+    EXPECT_NE(run("offset --help").out.find("Example: gmpath offset"), std::string::npos);
+    EXPECT_NE(run("toolpath --help").out.find("Example: gmpath toolpath"), std::string::npos);
+    const Outcome version = run("--version");
+    EXPECT_EQ(version.exitCode, 0);
+    EXPECT_EQ(version.out.find("gmpath "), 0U);
+}
