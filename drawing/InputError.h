@@ -2,7 +2,7 @@
 
 #include <stdexcept>
 
-namespace gmpath {
+namespace gmdrawing {
 
 /// Input or output that cannot be used. The text is one line with the cause; who opens the file
 /// puts its name in front (`readPart`, `AtomicFile`).
@@ -11,4 +11,4 @@ public:
     using std::runtime_error::runtime_error;
 };
 
-}  // namespace gmpath
+}  // namespace gmdrawing

@@ -6,12 +6,12 @@
 
 #include "region/model/Path.h"
 
-namespace gmpath {
+namespace gmdrawing {
 
 /// A path that came of a source contour.
 struct ResultPath {
     std::size_t pass;  ///< index of the pass
-    Path path;
+    gmregion::Path path;
     bool doubtful = false;  ///< there is a fault in what it belongs to
 };
 
@@ -23,7 +23,7 @@ struct PassName {
 
 /// Source contours and what came of them, as the writers put them into a file.
 struct ResultDrawing {
-    std::vector<Path> contours;                    ///< at least one
+    std::vector<gmregion::Path> contours;          ///< at least one
     std::vector<std::vector<ResultPath>> results;  ///< one entry a contour
     std::vector<PassName> passes;
     /// One entry a contour, of letters and digits; without entries contours are numbered from 1.
@@ -33,4 +33,4 @@ struct ResultDrawing {
     bool replacesSources = false;
 };
 
-}  // namespace gmpath
+}  // namespace gmdrawing

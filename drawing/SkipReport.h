@@ -5,7 +5,7 @@
 #include <string>
 #include <tuple>
 
-namespace gmpath {
+namespace gmdrawing {
 
 /// An entity kind on a layer that cannot be used, and why.
 struct SkippedKind {
@@ -32,4 +32,4 @@ struct SkipReport {
     }
 };
 
-}  // namespace gmpath
+}  // namespace gmdrawing

@@ -1,11 +1,13 @@
 #include "drawing/Text.h"
 
+#include <utf8.h>
+
 #include <algorithm>
 #include <array>
 #include <charconv>
 #include <cmath>
 
-namespace gmpath {
+namespace gmdrawing {
 
 namespace {
 
@@ -24,28 +26,20 @@ std::string_view withoutPlus(std::string_view text) {
     return text;
 }
 
-/// Length of the printable UTF-8 character that starts the text, 0 when there is none. Leaves out
-/// control characters, overlong forms, surrogates and the two non-characters of the first plane.
-std::size_t printableLength(std::string_view text) {
-    const auto byteAt = [&](std::size_t i) -> unsigned {
-        return i < text.size() ? static_cast<unsigned char>(text[i]) : 0U;
-    };
-    const unsigned lead = byteAt(0);
-    if (lead >= 0x20 && lead < 0x7F) return 1;
-    const std::size_t size = lead >= 0xC2 && lead < 0xE0   ? 2
-                             : lead >= 0xE0 && lead < 0xF0 ? 3
-                             : lead >= 0xF0 && lead < 0xF5 ? 4
-                                                           : 0;
-    if (size == 0) return 0;
-    unsigned code = lead & (0xFFU >> (size + 1));
-    for (std::size_t i = 1; i < size; ++i) {
-        if ((byteAt(i) & 0xC0U) != 0x80U) return 0;
-        code = (code << 6U) | (byteAt(i) & 0x3FU);
+/// No control character, and none of the two non-characters of the first plane.
+bool isPrintable(char32_t code) {
+    const bool control = code < 0x20 || (code >= 0x7F && code < 0xA0);
+    return !control && code != 0xFFFE && code != 0xFFFF;
+}
+
+/// Appends valid UTF-8, with a '?' for every byte of what is not printable.
+void appendPrintable(std::string& result, std::string_view valid) {
+    for (auto it = valid.begin(); it != valid.end();) {
+        const auto start = it;
+        const bool shown = isPrintable(utf8::unchecked::next(it));
+        const auto size = static_cast<std::size_t>(it - start);
+        result += shown ? std::string(start, it) : std::string(size, '?');
     }
-    constexpr std::array<unsigned, 5> kSmallestOfSize = {0, 0, 0xA0, 0x800, 0x10000};
-    const bool surrogate = code >= 0xD800 && code < 0xE000;
-    const bool nonCharacter = code == 0xFFFE || code == 0xFFFF || code > 0x10FFFF;
-    return code < kSmallestOfSize[size] || surrogate || nonCharacter ? 0 : size;
 }
 
 }  // namespace
@@ -90,9 +84,11 @@ std::string formatFixed(double value, int decimals) {
 std::string printable(std::string_view text) {
     std::string result;
     while (!text.empty()) {
-        const std::size_t size = printableLength(text);
-        result += size == 0 ? "?" : text.substr(0, size);
-        text.remove_prefix(std::max<std::size_t>(size, 1));
+        const auto valid =
+            static_cast<std::size_t>(utf8::find_invalid(text.begin(), text.end()) - text.begin());
+        appendPrintable(result, text.substr(0, valid));
+        if (valid < text.size()) result += '?';
+        text.remove_prefix(std::min(valid + 1, text.size()));
     }
     return result;
 }
@@ -121,14 +117,12 @@ std::string xmlEscaped(std::string_view text) {
 }
 
 std::size_t characterCount(std::string_view text) {
-    const auto startsCharacter = [](char c) {
-        return (static_cast<unsigned char>(c) & 0xC0U) != 0x80U;
-    };
-    return static_cast<std::size_t>(std::count_if(text.begin(), text.end(), startsCharacter));
+    const std::string shown = printable(text);
+    return static_cast<std::size_t>(utf8::distance(shown.begin(), shown.end()));
 }
 
 std::string counted(std::size_t count, std::string_view noun) {
     return std::to_string(count) + " " + std::string(noun) + (count == 1 ? "" : "s");
 }
 
-}  // namespace gmpath
+}  // namespace gmdrawing

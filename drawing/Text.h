@@ -4,7 +4,7 @@
 #include <string>
 #include <string_view>
 
-namespace gmpath {
+namespace gmdrawing {
 
 /// The text without leading and trailing blanks, tabs and carriage returns.
 std::string_view trimmed(std::string_view text);
@@ -23,17 +23,17 @@ std::string formatReal(double value, int digits = 12);
 /// The number with a decimal point and exactly `decimals` digits behind it.
 std::string formatFixed(double value, int decimals);
 
-/// The text with everything replaced by '?' that is no printable UTF-8, so that names from a
-/// drawing can go to a terminal or into XML.
+/// The text with every byte replaced by '?' that belongs to no printable character of UTF-8, so
+/// that names from a drawing can go to a terminal or into XML.
 std::string printable(std::string_view text);
 
 /// The text with the characters escaped that mean something in XML. Expects printable text.
 std::string xmlEscaped(std::string_view text);
 
-/// Number of characters of UTF-8 text.
+/// Number of characters of UTF-8 text as `printable` shows it.
 std::size_t characterCount(std::string_view text);
 
 /// "1 arc", "2 arcs".
 std::string counted(std::size_t count, std::string_view noun);
 
-}  // namespace gmpath
+}  // namespace gmdrawing

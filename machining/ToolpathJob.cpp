@@ -7,7 +7,15 @@
 #include "machining/order/CutOrder.h"
 #include "region/model/PathStart.h"
 
-namespace gmpath {
+namespace gmmachining {
+
+using gmdrawing::enclosingPaths;
+using gmregion::FaultyOffset;
+using gmregion::OffsetFault;
+using gmregion::Path;
+using gmregion::Refusal;
+using gmregion::Side;
+using gmregion::Vec2;
 
 namespace {
 
@@ -16,7 +24,7 @@ using Pass = std::vector<ToolRun>;
 /// A contour's runs, pass by pass.
 struct ContourRuns {
     std::vector<Pass> passes;  ///< none of them empty
-    bool accepted = true;
+    Refusal refusal = Refusal::kNone;
     bool fits = true;
     bool bothSides = false;
     std::vector<FaultyOffset> faults;
@@ -37,7 +45,7 @@ ContourRuns runsOf(const Path& contour, int depth, const ToolpathRequest& reques
         Pass pass;
         for (const double d : sides) {
             ToolRuns found = toolRuns(contour, d, request.part);
-            result.accepted = result.accepted && found.accepted;
+            if (result.refusal == Refusal::kNone) result.refusal = found.refusal;
             if (found.fault != OffsetFault::kNone) {
                 result.setAside(d, std::move(found));
             } else {
@@ -78,7 +86,7 @@ public:
     ContourCut cutContour(std::size_t index, const ContourRuns& runs) {
         m_recorder.serve(index);
         m_cut = {};
-        m_cut.accepted = runs.accepted;
+        m_cut.refusal = runs.refusal;
         m_cut.fits = runs.fits;
         m_cut.bothSides = runs.bothSides;
         m_cut.faults = runs.faults;
@@ -177,4 +185,4 @@ ToolpathResult makeToolpath(
     return result;
 }
 
-}  // namespace gmpath
+}  // namespace gmmachining

@@ -6,7 +6,7 @@
 #include "machining/moves/Toolpath.h"
 #include "region/offset/OffsetJob.h"
 
-namespace gmpath {
+namespace gmmachining {
 
 /// How the contours of a drawing are cut out.
 struct ToolpathRequest {
@@ -29,12 +29,13 @@ struct LeadTally {
 
 /// What became of a contour.
 struct ContourCut {
-    bool accepted = true;              ///< false when the kernel refused the contour
-    bool fits = true;                  ///< false when nothing is left for the last pass
-    bool bothSides = false;            ///< the contour has no waste side and is cut on both
-    bool keepsOthers = true;           ///< false when its cuts come too near to another contour
-    std::vector<FaultyOffset> faults;  ///< offsets that do not stand the check; they are not cut
-    std::vector<Path> doubtful;        ///< the results of those offsets
+    gmregion::Refusal refusal = gmregion::Refusal::kNone;  ///< why the contour has no offsets
+    bool fits = true;         ///< false when nothing is left for the last pass
+    bool bothSides = false;   ///< the contour has no waste side and is cut on both
+    bool keepsOthers = true;  ///< false when its cuts come too near to another contour
+    std::vector<gmregion::FaultyOffset>
+        faults;  ///< offsets that do not stand the check; they are not cut
+    std::vector<gmregion::Path> doubtful;  ///< the results of those offsets
     LeadTally leads;
 };
 
@@ -47,7 +48,7 @@ struct ToolpathResult {
 /// next (`ToolpathOrder`) the one whose start is nearest is cut, in all its passes; a pass is cut
 /// run by run, the nearest first, and a run through all levels at once.
 ToolpathResult makeToolpath(
-    const std::vector<Path>& contours, const ToolpathRequest& request,
+    const std::vector<gmregion::Path>& contours, const ToolpathRequest& request,
     const std::function<void(std::size_t done, std::size_t total)>& progress);
 
-}  // namespace gmpath
+}  // namespace gmmachining

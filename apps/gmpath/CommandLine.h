@@ -1,6 +1,6 @@
 #pragma once
 
-#include "apps/gmpath/Commands.h"
+#include "apps/gmpath/Console.h"
 
 namespace gmpath {
 

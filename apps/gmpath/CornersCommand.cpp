@@ -1,30 +1,86 @@
 #include "apps/gmpath/CornersCommand.h"
 
-#include "drawing/InputError.h"
+#include <algorithm>
+#include <memory>
+#include <optional>
+
+#include "apps/gmpath/InputOptions.h"
+#include "apps/gmpath/OptionKinds.h"
+#include "apps/gmpath/Phrases.h"
+#include "apps/gmpath/Report.h"
 #include "drawing/Text.h"
 #include "drawing/files/OutputFiles.h"
+#include "region/corners/CornerJob.h"
 
 namespace gmpath {
+
+using gmdrawing::checkOutputs;
+using gmdrawing::counted;
+using gmdrawing::formatReal;
+using gmdrawing::Part;
+using gmdrawing::PassName;
+using gmdrawing::ResultDrawing;
+using gmdrawing::writeOutputs;
+using gmregion::CornerChoice;
+using gmregion::CornerKind;
+using gmregion::CornerRequest;
+using gmregion::CornerResult;
+using gmregion::kPi;
+using gmregion::Refusal;
 
 namespace {
 
 constexpr int kLegendDigits = 6;
 constexpr double kHalfTurn = 180.0;
 
+/// Exactly one of the three sizes is given.
+struct CornersOptions {
+    InputOptions input;
+    std::optional<double> radius;
+    std::optional<double> chamfer;
+    std::optional<double> chamferLength;
+    CornerChoice choice = CornerChoice::kAll;
+    double bend = 5.0;  ///< degrees; joints that bend by less are no corners
+    std::vector<std::string> outputs;
+};
+
+void addSizes(CLI::App& corners, CornersOptions& options) {
+    CLI::App* sizes = corners.add_option_group("size", "What the corners become");
+    sizes->add_option("--radius", options.radius, "round them with this radius")
+        ->check(positiveNumber());
+    sizes->add_option("--chamfer", options.chamfer, "chamfer them, this far from the corner")
+        ->check(positiveNumber());
+    sizes
+        ->add_option("--chamfer-length", options.chamferLength,
+                     "chamfer them, with a chamfer of this length")
+        ->check(positiveNumber());
+    sizes->require_option(1);
+}
+
+void addOptions(CLI::App& corners, CornersOptions& options) {
+    addSizes(corners, options);
+    CLI::Option* convex = corners.add_flag_callback(
+        "--convex", [&options] { options.choice = CornerChoice::kConvex; },
+        "only corners that turn with their closed contour");
+    corners
+        .add_flag_callback(
+            "--concave", [&options] { options.choice = CornerChoice::kConcave; },
+            "only corners that turn against it")
+        ->excludes(convex);
+    corners.add_option("--bend", options.bend, "joints that bend by fewer degrees are no corners")
+        ->check(angleUpTo(kHalfTurn))
+        ->capture_default_str();
+    addOutputs(corners, options.outputs);
+    addInputOptions(corners, options.input);
+}
+
 CornerRequest requestOf(const CornersOptions& options) {
-    if (!(options.bend > 0.0 && options.bend < kHalfTurn)) {
-        throw InputError("--bend: not a number above 0 and below 180");
+    const double bend = options.bend / kHalfTurn * kPi;
+    if (options.radius) return {CornerKind::kRounding, *options.radius, options.choice, bend};
+    if (options.chamfer) {
+        return {CornerKind::kChamferDistance, *options.chamfer, options.choice, bend};
     }
-    const auto of = [&](CornerKind kind, double value, const std::string& option) {
-        checkPositive(value, option);
-        return CornerRequest{kind, value, options.choice, options.bend / kHalfTurn * kPi};
-    };
-    if (options.radius) return of(CornerKind::kRounding, *options.radius, "--radius");
-    if (options.chamfer) return of(CornerKind::kChamferDistance, *options.chamfer, "--chamfer");
-    if (!options.chamferLength) {
-        throw InputError("give one of --radius, --chamfer, --chamfer-length");
-    }
-    return of(CornerKind::kChamferLength, *options.chamferLength, "--chamfer-length");
+    return {CornerKind::kChamferLength, options.chamferLength.value_or(0.0), options.choice, bend};
 }
 
 PassName nameOf(const CornerRequest& request) {
@@ -35,13 +91,11 @@ PassName nameOf(const CornerRequest& request) {
 
 /// What is to be told about a contour, empty when all went well.
 std::string remark(const CornerResult& result) {
-    if (!result.accepted) return "the kernel cannot take it over";
+    if (result.refusal != Refusal::kNone) return "left as it is, " + refusalText(result.refusal);
     if (result.notDone == 0) return {};
     return "no room at " + std::to_string(result.notDone) + " of " +
            counted(result.done + result.notDone, "corner");
 }
-
-}  // namespace
 
 bool runCorners(const CornersOptions& options, const Console& console) {
     const CornerRequest request = requestOf(options);
@@ -50,24 +104,32 @@ bool runCorners(const CornersOptions& options, const Console& console) {
     ResultDrawing drawing{part.contours, {}, {nameOf(request)}, {}, true};
     const std::vector<CornerResult> results = breakCorners(part.contours, request);
     for (const CornerResult& result : results)
-        drawing.results.push_back({{0, result.path, !result.accepted}});
+        drawing.results.push_back({{0, result.path, result.refusal != Refusal::kNone}});
     writeOutputs(drawing, options.outputs);
 
+    const Report report(console.err, options.input.drawing);
     std::size_t done = 0;
     std::size_t notDone = 0;
-    bool accepted = true;
     for (std::size_t i = 0; i < results.size(); ++i) {
         done += results[i].done;
         notDone += results[i].notDone;
-        accepted = accepted && results[i].accepted;
-        const std::string text = remark(results[i]);
-        if (text.empty()) continue;
-        console.err << "gmpath: " << printable(options.input.drawing) << ": contour " << i + 1
-                    << ": " << text << "\n";
+        report.tell(i, remark(results[i]));
     }
     console.out << counted(results.size(), "contour") << ", " << counted(done, "corner")
                 << " done, " << notDone << " not done\n";
-    return accepted;
+    return std::all_of(results.begin(), results.end(),
+                       [](const CornerResult& result) { return result.refusal == Refusal::kNone; });
+}
+
+}  // namespace
+
+Command addCorners(CLI::App& program) {
+    CLI::App* corners =
+        program.add_subcommand("corners", "Round or chamfer the corners of a part drawing");
+    const auto options = std::make_shared<CornersOptions>();
+    addOptions(*corners, *options);
+    corners->footer("Example: gmpath corners bracket.dxf --radius 2 --convex -o rounded.dxf");
+    return {corners, [=](const Console& console) { return runCorners(*options, console); }};
 }
 
 }  // namespace gmpath

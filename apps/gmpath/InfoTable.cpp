@@ -4,9 +4,25 @@
 
 #include "drawing/Text.h"
 #include "drawing/contours/Nesting.h"
-#include "region/model/Measure.h"
+#include "region/model/Area.h"
+#include "region/model/Box.h"
 
 namespace gmpath {
+
+using gmdrawing::characterCount;
+using gmdrawing::counted;
+using gmdrawing::formatFixed;
+using gmdrawing::formatReal;
+using gmdrawing::nestingDepths;
+using gmdrawing::Part;
+using gmdrawing::printable;
+using gmdrawing::SkippedKind;
+using gmdrawing::SkipReport;
+using gmregion::Box;
+using gmregion::kKernelTolerance;
+using gmregion::Path;
+using gmregion::Sense;
+using gmregion::Vec2;
 
 namespace {
 

@@ -1,15 +1,36 @@
 #include "apps/gmpath/MeltCommand.h"
 
 #include <algorithm>
+#include <memory>
 #include <sstream>
 
+#include "apps/gmpath/InputOptions.h"
+#include "apps/gmpath/OptionKinds.h"
+#include "apps/gmpath/Phrases.h"
+#include "apps/gmpath/Report.h"
 #include "drawing/Text.h"
 #include "drawing/files/OutputFiles.h"
 #include "region/boolean/MeltJob.h"
 
 namespace gmpath {
 
+using gmdrawing::checkOutputs;
+using gmdrawing::counted;
+using gmdrawing::Part;
+using gmdrawing::ResultDrawing;
+using gmdrawing::writeOutputs;
+using gmregion::LoopKind;
+using gmregion::MeltedPair;
+using gmregion::MeltLoop;
+using gmregion::MeltOutcome;
+
 namespace {
+
+struct MeltOptions {
+    InputOptions first;  ///< its reading options hold for both drawings
+    std::string second;
+    std::vector<std::string> outputs;
+};
 
 std::string labelOf(const std::string& drawing, std::size_t index) {
     return drawing + std::to_string(index + 1);
@@ -38,7 +59,7 @@ std::string outcomeText(const MeltedPair& pair) {
         case MeltOutcome::kSame:
             return "no loops, they are the same";
         case MeltOutcome::kRefused:
-            return "the kernel cannot take one of them over";
+            return "not melted, of one of them " + refusalText(pair.refusal);
         case MeltOutcome::kFailed:
             return "the loops are not outline and common parts";
         case MeltOutcome::kApart:
@@ -70,8 +91,6 @@ ResultDrawing drawingOf(const Part& first, const Part& second,
     return drawing;
 }
 
-}  // namespace
-
 bool runMelt(const MeltOptions& options, const Console& console) {
     checkOutputs(options.outputs, options.first.drawing);
     checkOutputs(options.outputs, options.second);
@@ -92,12 +111,27 @@ bool runMelt(const MeltOptions& options, const Console& console) {
             pair.outcome == MeltOutcome::kFailed || pair.outcome == MeltOutcome::kRefused;
         melted += pair.outcome == MeltOutcome::kLoops ? 1 : 0;
         sound = sound && !failed;
-        if (failed)
-            console.err << "gmpath: " << pairName(pair) << ": " << outcomeText(pair) << "\n";
-        if (!failed) console.out << pairName(pair) << ": " << outcomeText(pair) << "\n";
+        if (failed) {
+            Report(console.err, pairName(pair)).tell(outcomeText(pair));
+        } else {
+            console.out << pairName(pair) << ": " << outcomeText(pair) << "\n";
+        }
     }
     console.out << counted(pairs.size(), "pair") << ", " << melted << " melted\n";
     return sound;
+}
+
+}  // namespace
+
+Command addMelt(CLI::App& program) {
+    CLI::App* melt =
+        program.add_subcommand("melt", "Melt the overlapping contours of two part drawings");
+    const auto options = std::make_shared<MeltOptions>();
+    addOutputs(*melt, options->outputs);
+    addInputOptions(*melt, options->first);
+    melt->add_option("SECOND", options->second, "the other drawing")->required();
+    melt->footer("Example: gmpath melt plate.dxf boss.dxf -o outline.dxf -o outline.svg");
+    return {melt, [=](const Console& console) { return runMelt(*options, console); }};
 }
 
 }  // namespace gmpath

@@ -1,23 +1,12 @@
 #pragma once
 
-#include <string>
-#include <vector>
-
-#include "apps/gmpath/Commands.h"
+#include "apps/gmpath/Command.h"
 
 namespace gmpath {
 
-/// Options of `melt`.
-struct MeltOptions {
-    InputOptions first;  ///< its reading options hold for both drawings
-    std::string second;
-    std::vector<std::string> outputs;
-};
-
-/// Melts the closed contours of two drawings, pair by pair, writes the loops and says what came of
-/// every pair. Throws InputError for input and outputs that cannot be used; then no output is
-/// written. False when the loops of a pair do not have the areas that they must have; they are
-/// written all the same, dashed in pictures.
-bool runMelt(const MeltOptions& options, const Console& console);
+/// Adds the subcommand `melt`, which melts the closed contours of two drawings, pair by pair,
+/// writes the loops and says what came of every pair. Loops that do not have the areas that they
+/// must have are faults, dashed in pictures.
+Command addMelt(CLI::App& program);
 
 }  // namespace gmpath

@@ -1,9 +1,12 @@
 #include "apps/gmpath/ToolpathCommand.h"
 
 #include <algorithm>
+#include <memory>
 #include <sstream>
 
+#include "apps/gmpath/Phrases.h"
 #include "apps/gmpath/Progress.h"
+#include "apps/gmpath/Report.h"
 #include "apps/gmpath/ToolpathSettings.h"
 #include "drawing/InputError.h"
 #include "drawing/Text.h"
@@ -11,6 +14,25 @@
 #include "machining/picture/ToolpathPicture.h"
 
 namespace gmpath {
+
+using gmdrawing::AtomicFile;
+using gmdrawing::checkOutputs;
+using gmdrawing::counted;
+using gmdrawing::formatFixed;
+using gmdrawing::formatReal;
+using gmdrawing::InputError;
+using gmdrawing::Part;
+using gmdrawing::writeOutputs;
+using gmmachining::ContourCut;
+using gmmachining::LeadTally;
+using gmmachining::MachineSettings;
+using gmmachining::machineUnits;
+using gmmachining::MoveKind;
+using gmmachining::ToolpathRequest;
+using gmmachining::ToolpathResult;
+using gmmachining::Units;
+using gmregion::FaultyOffset;
+using gmregion::Refusal;
 
 namespace {
 
@@ -39,7 +61,7 @@ std::string droppedText(const LeadTally& leads) {
 
 /// What is to be told about a contour, empty when all went well.
 std::string remark(const ContourCut& cut) {
-    if (!cut.accepted) return "the kernel cannot take it over";
+    if (cut.refusal != Refusal::kNone) return "not cut, " + refusalText(cut.refusal);
     if (!cut.fits) return "the tool does not fit";
     std::string text;
     const auto add = [&](bool applies, const std::string& what) {
@@ -53,21 +75,15 @@ std::string remark(const ContourCut& cut) {
     return text;
 }
 
-void reportContours(const std::string& drawing, const std::vector<ContourCut>& cuts,
-                    const Console& console) {
+void reportContours(const Report& report, const std::vector<ContourCut>& cuts) {
     const auto twoSided = std::count_if(cuts.begin(), cuts.end(),
                                         [](const ContourCut& cut) { return cut.bothSides; });
     if (twoSided > 0) {
-        console.err << "gmpath: " << printable(drawing) << ": "
-                    << counted(static_cast<std::size_t>(twoSided), "open contour")
-                    << " cut on both sides\n";
+        report.tell(counted(static_cast<std::size_t>(twoSided), "open contour") +
+                    " cut on both sides");
     }
-    for (std::size_t i = 0; i < cuts.size(); ++i) {
-        const std::string text = remark(cuts[i]);
-        if (text.empty()) continue;
-        console.err << "gmpath: " << printable(drawing) << ": contour " << i + 1 << ": " << text
-                    << "\n";
-    }
+    for (std::size_t i = 0; i < cuts.size(); ++i)
+        report.tell(i, remark(cuts[i]));
 }
 
 std::string summary(const ToolpathResult& result, Units units) {
@@ -87,8 +103,6 @@ std::string summary(const ToolpathResult& result, Units units) {
            std::to_string(leads.dropped) + " dropped\n";
 }
 
-}  // namespace
-
 bool runToolpath(const ToolpathOptions& options, const Console& console) {
     checkOptions(options);
     checkOutputs(options.outputs, options.input.drawing, {".ngc", ".svg"});
@@ -107,11 +121,24 @@ bool runToolpath(const ToolpathOptions& options, const Console& console) {
                   {".svg", [&](AtomicFile& file) { file.write(svgOf(part.contours, result)); }}},
                  options.outputs);
     progress.clear();
-    reportContours(options.input.drawing, result.contours, console);
+    reportContours(Report(console.err, options.input.drawing), result.contours);
     console.out << summary(result, units);
     return std::all_of(result.contours.begin(), result.contours.end(), [](const ContourCut& cut) {
-        return cut.accepted && cut.faults.empty() && cut.keepsOthers;
+        return cut.refusal == Refusal::kNone && cut.faults.empty() && cut.keepsOthers;
     });
+}
+
+}  // namespace
+
+Command addToolpath(CLI::App& program) {
+    CLI::App* toolpath =
+        program.add_subcommand("toolpath", "Cut out the contours of a part drawing with a tool");
+    const auto options = std::make_shared<ToolpathOptions>();
+    addToolpathOptions(*toolpath, *options);
+    toolpath->footer(
+        "Example: gmpath toolpath bracket.dxf --tool 6 --lead arc --depth 8 --step-down 2 "
+        "-o bracket.ngc -o bracket.svg");
+    return {toolpath, [=](const Console& console) { return runToolpath(*options, console); }};
 }
 
 }  // namespace gmpath

@@ -4,21 +4,20 @@
 #include <cmath>
 #include <filesystem>
 
+#include "apps/gmpath/OptionKinds.h"
 #include "drawing/InputError.h"
 
 namespace gmpath {
 
+using gmdrawing::InputError;
+using gmmachining::MachineSettings;
+using gmmachining::PartSide;
+using gmmachining::ToolpathRequest;
+using gmmachining::Units;
+
 namespace {
 
-constexpr int kMaxPasses = 1000;
 constexpr int kMaxLevels = 1000;
-
-/// Tools thinner than this come near to what the kernel takes for the same point.
-constexpr double kThinnestTool = 20.0 * kKernelTolerance;
-
-constexpr double kSmallestProgramValue = 1e-3;
-
-constexpr double kLargestLeadAngle = 270.0;
 
 /// Defaults that depend on the units.
 struct UnitDefaults {
@@ -31,17 +30,6 @@ UnitDefaults defaultsOf(Units units) {
     constexpr UnitDefaults kMetric{1.0, 5.0, 1000.0};
     constexpr UnitDefaults kInch{0.04, 0.2, 40.0};
     return units == Units::kInches ? kInch : kMetric;
-}
-
-/// What goes into a program with few decimals must not vanish there.
-void checkProgramValue(const std::optional<double>& value, const std::string& option) {
-    if (!value) return;
-    checkPositive(*value, option);
-    if (*value < kSmallestProgramValue) throw InputError(option + ": below 0.001");
-}
-
-void checkGiven(const std::optional<double>& value, const std::string& option) {
-    if (value) checkPositive(*value, option);
 }
 
 std::vector<double> distancesOf(const ToolpathOptions& options) {
@@ -72,25 +60,9 @@ std::vector<double> levelsOf(const ToolpathOptions& options, Units units) {
 }  // namespace
 
 void checkOptions(const ToolpathOptions& options) {
-    checkPositive(options.tool, "--tool");
-    if (options.tool < kThinnestTool) throw InputError("--tool: thinner than 0.002");
-    if (options.stock != 0.0) checkPositive(options.stock, "--stock");
-    if (options.count < 1 || options.count > kMaxPasses) {
-        throw InputError("--count: not a number from 1 to " + std::to_string(kMaxPasses));
+    if (distancesOf(options).front() > kLargestNumber) {
+        throw InputError("--tool, --stock, --step: the first pass lies beyond 1e9");
     }
-    checkGiven(options.step, "--step");
-    checkPositive(distancesOf(options).front(), "--tool, --stock, --step");
-    checkGiven(options.leadLength, "--lead-length");
-    checkGiven(options.leadRadius, "--lead-radius");
-    if (!(options.leadAngle > 0.0 && options.leadAngle <= kLargestLeadAngle)) {
-        throw InputError("--lead-angle: not a number above 0 and up to 270");
-    }
-    checkProgramValue(options.depth, "--depth");
-    checkProgramValue(options.stepDown, "--step-down");
-    checkProgramValue(options.safeZ, "--safe-z");
-    checkProgramValue(options.feed, "--feed");
-    checkProgramValue(options.plunge, "--plunge");
-    checkProgramValue(options.spindle, "--spindle");
 }
 
 ToolpathRequest toolpathRequest(const ToolpathOptions& options, Units units) {

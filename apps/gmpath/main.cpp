@@ -1,10 +1,12 @@
 #include <unistd.h>
 
 #include <iostream>
+#include <locale>
 
 #include "apps/gmpath/CommandLine.h"
 
 int main(int argc, char** argv) {
+    std::locale::global(std::locale::classic());  // numbers as drawings and machines have them
     const gmpath::Console console{std::cout, std::cerr, isatty(STDERR_FILENO) != 0};
     const int exitCode = gmpath::runCommandLine(argc, argv, console);
     if (std::cout.flush()) return exitCode;

@@ -4,10 +4,14 @@
 
 #include "drawing/contours/Duplicates.h"
 #include "drawing/contours/Junctions.h"
-#include "region/model/Measure.h"
+#include "region/model/Area.h"
 #include "region/model/ShortElements.h"
 
-namespace gmpath {
+namespace gmdrawing {
+
+using gmregion::Element;
+using gmregion::kKernelTolerance;
+using gmregion::Path;
 
 namespace {
 
@@ -126,4 +130,4 @@ ChainResult buildChains(std::vector<Path> paths, double tolerance) {
     return result;
 }
 
-}  // namespace gmpath
+}  // namespace gmdrawing

@@ -5,11 +5,11 @@
 #include "drawing/SkipReport.h"
 #include "region/model/Path.h"
 
-namespace gmpath {
+namespace gmdrawing {
 
 /// Contours made from the paths of a drawing, and what was dropped on the way.
 struct ChainResult {
-    std::vector<Path> contours;
+    std::vector<gmregion::Path> contours;
     SkipReport skipped;
 };
 
@@ -21,6 +21,6 @@ struct ChainResult {
 /// neither the order nor the sense of its pieces: when closed it runs counter-clockwise from its
 /// leftmost joint (the lowest of these), when open from the end that lies further left (lower).
 /// Contours come in the order of their earliest piece. Throws InputError as `joinEnds` does.
-ChainResult buildChains(std::vector<Path> paths, double tolerance);
+ChainResult buildChains(std::vector<gmregion::Path> paths, double tolerance);
 
-}  // namespace gmpath
+}  // namespace gmdrawing

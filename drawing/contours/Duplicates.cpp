@@ -2,10 +2,18 @@
 
 #include <algorithm>
 
-#include "region/model/Measure.h"
+#include "region/model/Box.h"
 #include "region/search/PointGrid.h"
 
-namespace gmpath {
+namespace gmdrawing {
+
+using gmregion::Box;
+using gmregion::Element;
+using gmregion::isArc;
+using gmregion::kKernelTolerance;
+using gmregion::Path;
+using gmregion::PointGrid;
+using gmregion::Vec2;
 
 namespace {
 
@@ -78,4 +86,4 @@ std::size_t dropDuplicates(std::vector<Path>& paths) {
     return dropped;
 }
 
-}  // namespace gmpath
+}  // namespace gmdrawing

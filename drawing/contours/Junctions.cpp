@@ -9,7 +9,12 @@
 #include "drawing/Text.h"
 #include "region/search/PointGrid.h"
 
-namespace gmpath {
+namespace gmdrawing {
+
+using gmregion::Element;
+using gmregion::Path;
+using gmregion::PointGrid;
+using gmregion::Vec2;
 
 namespace {
 
@@ -134,4 +139,4 @@ std::vector<std::optional<PathEnd>> joinEnds(const std::vector<Path>& paths, dou
     return joined;
 }
 
-}  // namespace gmpath
+}  // namespace gmdrawing

@@ -6,7 +6,7 @@
 
 #include "region/model/Path.h"
 
-namespace gmpath {
+namespace gmdrawing {
 
 /// An end of an open path: twice the path's index, plus 1 for its end point.
 using PathEnd = std::size_t;
@@ -35,6 +35,7 @@ inline bool isStart(PathEnd end) {
 ///
 /// Throws InputError when more than 200 ends meet at one place: then the tolerance is too wide for
 /// the drawing.
-std::vector<std::optional<PathEnd>> joinEnds(const std::vector<Path>& paths, double tolerance);
+std::vector<std::optional<PathEnd>> joinEnds(const std::vector<gmregion::Path>& paths,
+                                             double tolerance);
 
-}  // namespace gmpath
+}  // namespace gmdrawing

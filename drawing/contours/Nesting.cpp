@@ -2,9 +2,16 @@
 
 #include <algorithm>
 
-#include "region/model/Measure.h"
+#include "region/model/Area.h"
+#include "region/model/Box.h"
+#include "region/model/Winding.h"
 
-namespace gmpath {
+namespace gmdrawing {
+
+using gmregion::Box;
+using gmregion::kKernelTolerance;
+using gmregion::Path;
+using gmregion::Vec2;
 
 namespace {
 
@@ -79,4 +86,4 @@ std::vector<std::vector<std::size_t>> enclosingPaths(const std::vector<Path>& pa
     return found;
 }
 
-}  // namespace gmpath
+}  // namespace gmdrawing

@@ -4,8 +4,14 @@
 #include <cmath>
 
 #include "drawing/InputError.h"
+#include "drawing/dxf/BlockPlacement.h"
 
-namespace gmpath {
+namespace gmdrawing {
+
+using gmregion::Element;
+using gmregion::Path;
+using gmregion::Placement;
+using gmregion::Vec2;
 
 namespace {
 
@@ -70,7 +76,7 @@ private:
             std::find(m_open.begin(), m_open.end(), &found->second) != m_open.end();
         if (recursive) return skip({"INSERT", layer, "block places itself"}, 1);
         if (m_open.size() >= kMaxDepth) return skip({"INSERT", layer, "nested too deeply"}, 1);
-        if (!Placement::ofReference(reference, {}, 0, 0)) {
+        if (!blockPlacement(reference, {}, 0, 0)) {
             return skip({"INSERT", layer, "scale is not uniform"}, 1);
         }
         m_open.push_back(&found->second);
@@ -83,7 +89,7 @@ private:
         for (int row = 0; row < reference.rows; ++row) {
             for (int column = 0; column < reference.columns; ++column) {
                 countPlaced();
-                const auto cell = Placement::ofReference(reference, block.base, column, row);
+                const auto cell = blockPlacement(reference, block.base, column, row);
                 expand(block, placement.after(*cell), layer);
             }
         }
@@ -114,4 +120,4 @@ ExpandedDrawing expandBlocks(const Drawing& drawing, const Placement& placement)
     return Expansion(drawing).run(placement);
 }
 
-}  // namespace gmpath
+}  // namespace gmdrawing

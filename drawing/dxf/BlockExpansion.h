@@ -7,11 +7,11 @@
 #include "drawing/dxf/Drawing.h"
 #include "region/model/Placement.h"
 
-namespace gmpath {
+namespace gmdrawing {
 
 /// The paths of a drawing with all blocks placed.
 struct ExpandedDrawing {
-    std::vector<Path> paths;
+    std::vector<gmregion::Path> paths;
     SkipReport skipped;
 };
 
@@ -21,6 +21,6 @@ struct ExpandedDrawing {
 /// References to unknown blocks, to a block from within itself, and with a scale that is not
 /// uniform are counted as unusable; so are paths that come to lie beyond 1e9 units. Throws
 /// InputError when the blocks multiply beyond two million paths.
-ExpandedDrawing expandBlocks(const Drawing& drawing, const Placement& placement);
+ExpandedDrawing expandBlocks(const Drawing& drawing, const gmregion::Placement& placement);
 
-}  // namespace gmpath
+}  // namespace gmdrawing

@@ -7,26 +7,26 @@
 #include "drawing/SkipReport.h"
 #include "region/model/Path.h"
 
-namespace gmpath {
+namespace gmdrawing {
 
 /// A block placed in the drawing or in another block: scaled, turned by `angle`, then moved to
 /// `at`, `columns` times `rows` over. Spacing is measured along the turned axes.
 struct BlockReference {
     std::string block;
     std::string layer;
-    Vec2 at;
-    Vec2 scale{1.0, 1.0};
+    gmregion::Vec2 at;
+    gmregion::Vec2 scale{1.0, 1.0};
     double angle = 0.0;  ///< radians
     int columns = 1;
     int rows = 1;
-    Vec2 spacing;
+    gmregion::Vec2 spacing;
     bool mirrored = false;  ///< drawn on the back of the plane: x runs the other way
 };
 
 /// What a block, or the drawing itself, holds, in drawing order.
 struct Block {
-    Vec2 base;                               ///< the point that comes to lie where it is placed
-    std::vector<Path> paths;                 ///< lines, arcs, circles, polylines as drawn
+    gmregion::Vec2 base;                     ///< the point that comes to lie where it is placed
+    std::vector<gmregion::Path> paths;       ///< lines, arcs, circles, polylines as drawn
     std::vector<BlockReference> references;  ///< blocks placed inside
     SkipReport skipped;                      ///< entities that cannot be used
 };
@@ -37,4 +37,4 @@ struct Drawing {
     std::map<std::string, Block> blocks;  ///< definitions by name
 };
 
-}  // namespace gmpath
+}  // namespace gmdrawing

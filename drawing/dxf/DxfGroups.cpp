@@ -9,7 +9,7 @@
 #include "drawing/InputError.h"
 #include "drawing/Text.h"
 
-namespace gmpath {
+namespace gmdrawing {
 
 namespace {
 
@@ -105,4 +105,4 @@ std::vector<DxfGroup> dxfGroups(std::string_view text) {
     return groups;
 }
 
-}  // namespace gmpath
+}  // namespace gmdrawing

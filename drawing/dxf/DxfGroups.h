@@ -5,7 +5,7 @@
 #include <string_view>
 #include <vector>
 
-namespace gmpath {
+namespace gmdrawing {
 
 /// One group of a DXF text: a code and its value. The value points into the text.
 struct DxfGroup {
@@ -22,4 +22,4 @@ std::string readFile(const std::string& fileName);
 /// entities, or stops before its end mark (a truncated file).
 std::vector<DxfGroup> dxfGroups(std::string_view text);
 
-}  // namespace gmpath
+}  // namespace gmdrawing

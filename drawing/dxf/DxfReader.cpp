@@ -2,7 +2,11 @@
 
 #include <cmath>
 
-namespace gmpath {
+namespace gmdrawing {
+
+using gmregion::Element;
+using gmregion::kPi;
+using gmregion::Path;
 
 namespace {
 
@@ -30,29 +34,29 @@ int atLeastOne(int count) {
 
 }  // namespace
 
-Drawing DrawingAdapter::takeDrawing() {
+Drawing DxfReader::takeDrawing() {
     finishPolyline();
     return std::move(m_drawing);
 }
 
-void DrawingAdapter::addBlock(const DL_BlockData& data) {
+void DxfReader::addBlock(const DL_BlockData& data) {
     finishPolyline();
     m_block = &m_drawing.blocks[data.name];
     m_block->base = {data.bpx, data.bpy};
 }
 
-void DrawingAdapter::endBlock() {
+void DxfReader::endBlock() {
     finishPolyline();
     m_block = nullptr;
 }
 
-void DrawingAdapter::addLine(const DL_LineData& data) {
+void DxfReader::addLine(const DL_LineData& data) {
     Path path = emptyPath();
     path.elements.push_back({{data.x1, data.y1}, {data.x2, data.y2}});
     addPath(std::move(path), false);
 }
 
-void DrawingAdapter::addArc(const DL_ArcData& data) {
+void DxfReader::addArc(const DL_ArcData& data) {
     if (isTilted("ARC")) return;
     Path path = emptyPath();
     const double sweep = sweepBetween(data.angle1, data.angle2);
@@ -62,7 +66,7 @@ void DrawingAdapter::addArc(const DL_ArcData& data) {
     addPath(std::move(path), isMirrored());
 }
 
-void DrawingAdapter::addCircle(const DL_CircleData& data) {
+void DxfReader::addCircle(const DL_CircleData& data) {
     if (isTilted("CIRCLE")) return;
     Path path = emptyPath();
     appendArc(path.elements, {data.cx, data.cy}, data.radius, 0.0, 2.0 * kPi);
@@ -70,7 +74,7 @@ void DrawingAdapter::addCircle(const DL_CircleData& data) {
     addPath(std::move(path), isMirrored());
 }
 
-void DrawingAdapter::addPolyline(const DL_PolylineData& data) {
+void DxfReader::addPolyline(const DL_PolylineData& data) {
     finishPolyline();
     if (isTilted("polyline")) return;
     constexpr unsigned kClosedFlag = 1;
@@ -78,15 +82,15 @@ void DrawingAdapter::addPolyline(const DL_PolylineData& data) {
     m_polyline->path.closed = (data.flags & kClosedFlag) != 0;
 }
 
-void DrawingAdapter::addVertex(const DL_VertexData& data) {
+void DxfReader::addVertex(const DL_VertexData& data) {
     if (m_polyline) m_polyline->corners.push_back({{data.x, data.y}, {}, data.bulge});
 }
 
-void DrawingAdapter::endEntity() {
+void DxfReader::endEntity() {
     finishPolyline();
 }
 
-void DrawingAdapter::addInsert(const DL_InsertData& data) {
+void DxfReader::addInsert(const DL_InsertData& data) {
     if (isTilted("INSERT")) return;
     BlockReference reference;
     reference.block = data.name;
@@ -101,7 +105,7 @@ void DrawingAdapter::addInsert(const DL_InsertData& data) {
     block().references.push_back(std::move(reference));
 }
 
-bool DrawingAdapter::isTilted(const std::string& kind) {
+bool DxfReader::isTilted(const std::string& kind) {
     const double* normal = extrusion->getDirection();
     const double sideways = std::hypot(normal[0], normal[1]);
     if (sideways <= kUprightTolerance * std::abs(normal[2])) return false;
@@ -109,20 +113,20 @@ bool DrawingAdapter::isTilted(const std::string& kind) {
     return true;
 }
 
-bool DrawingAdapter::isMirrored() {
+bool DxfReader::isMirrored() {
     return extrusion->getDirection()[2] < 0.0;
 }
 
-Path DrawingAdapter::emptyPath() {
+Path DxfReader::emptyPath() {
     return {{}, false, attributes.getLayer()};
 }
 
-void DrawingAdapter::addPath(Path path, bool mirrored) {
+void DxfReader::addPath(Path path, bool mirrored) {
     if (mirrored) mirrorInX(path);
     if (!path.elements.empty()) block().paths.push_back(std::move(path));
 }
 
-void DrawingAdapter::finishPolyline() {
+void DxfReader::finishPolyline() {
     if (!m_polyline) return;
     OpenPolyline polyline = std::move(*m_polyline);
     m_polyline.reset();
@@ -139,4 +143,4 @@ void DrawingAdapter::finishPolyline() {
     addPath(std::move(polyline.path), polyline.mirrored);
 }
 
-}  // namespace gmpath
+}  // namespace gmdrawing

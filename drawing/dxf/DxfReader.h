@@ -6,15 +6,15 @@
 
 #include "drawing/dxf/Drawing.h"
 
-namespace gmpath {
+namespace gmdrawing {
 
-/// Collects what the DXF library reads into a Drawing. Expects filtered input: known kinds with
+/// Collects what the DXF library reads into a Drawing. Expects sanitized input: known kinds with
 /// finite numbers.
 ///
 /// Circles and polylines come as closed or open paths of their own, a line or an arc as a path of
 /// one element (two when the arc nearly closes). Entities drawn on the back of the plane are
 /// mirrored; entities in a tilted plane are counted as unusable.
-class DrawingAdapter : public DL_CreationAdapter {
+class DxfReader : public DL_CreationAdapter {
 public:
     /// The drawing read so far; call it after the last entity.
     Drawing takeDrawing();
@@ -31,16 +31,17 @@ public:
 
 private:
     struct OpenPolyline {
-        Path path;
+        gmregion::Path path;
         bool mirrored;
-        std::vector<Element> corners;  ///< start and bulge of the element behind each vertex
+        std::vector<gmregion::Element>
+            corners;  ///< start and bulge of the element behind each vertex
     };
 
     Block& block() { return m_block != nullptr ? *m_block : m_drawing.model; }
     bool isTilted(const std::string& kind);
     bool isMirrored();
-    Path emptyPath();
-    void addPath(Path path, bool mirrored);
+    gmregion::Path emptyPath();
+    void addPath(gmregion::Path path, bool mirrored);
     void finishPolyline();
 
     Drawing m_drawing;
@@ -48,4 +49,4 @@ private:
     std::optional<OpenPolyline> m_polyline;
 };
 
-}  // namespace gmpath
+}  // namespace gmdrawing

@@ -8,7 +8,7 @@
 
 #include "drawing/Text.h"
 
-namespace gmpath {
+namespace gmdrawing {
 
 namespace {
 
@@ -109,17 +109,17 @@ std::string fault(const EntityKind& kind, const Record& record) {
     return mesh ? "a mesh" : "";
 }
 
-class Filter {
+class Sanitizer {
 public:
-    explicit Filter(std::vector<Record> records) : m_records(std::move(records)) {}
+    explicit Sanitizer(std::vector<Record> records) : m_records(std::move(records)) {}
 
-    FilteredDrawing run() {
+    SanitizedDrawing run() {
         while (m_next < m_records.size()) {
             const Record& record = m_records[m_next++];
             if (record.kind == "SECTION") {
                 enterSection(record);
             } else if (m_inside) {
-                filter(record);
+                take(record);
             }
         }
         write("0", "EOF");
@@ -133,20 +133,20 @@ private:
         m_block.clear();
     }
 
-    void filter(const Record& record) {
+    void take(const Record& record) {
         if (record.kind == "ENDSEC" || record.kind == "EOF") {
             m_inside = false;
         } else if (record.kind == "ENDBLK") {
             write("0", "ENDBLK");
             m_block.clear();
         } else if (record.kind == "POLYLINE") {
-            filterPolyline(record);
+            takePolyline(record);
         } else if (!isNoEntityOfItsOwn(record.kind)) {
-            filterEntity(record);
+            takeEntity(record);
         }
     }
 
-    void filterEntity(const Record& record) {
+    void takeEntity(const Record& record) {
         const EntityKind* kind = usableKind(record.kind);
         if (kind == nullptr) return skip(record, "kind cannot be used");
         if (record.kind == "BLOCK") m_block = std::string(record.value(2));
@@ -159,7 +159,7 @@ private:
     }
 
     /// A polyline stands and falls with its vertices, which follow as records of their own.
-    void filterPolyline(const Record& polyline) {
+    void takePolyline(const Record& polyline) {
         std::vector<const Record*> vertices;
         while (m_next < m_records.size() && m_records[m_next].kind == "VERTEX") {
             vertices.push_back(&m_records[m_next++]);
@@ -220,13 +220,13 @@ private:
     std::size_t m_next = 0;
     bool m_inside = false;  ///< inside a section that holds entities
     std::string m_block;    ///< block being defined, empty in the drawing itself
-    FilteredDrawing m_result;
+    SanitizedDrawing m_result;
 };
 
 }  // namespace
 
-FilteredDrawing filterDrawing(const std::vector<DxfGroup>& groups) {
-    return Filter(recordsOf(groups)).run();
+SanitizedDrawing sanitizedDrawing(const std::vector<DxfGroup>& groups) {
+    return Sanitizer(recordsOf(groups)).run();
 }
 
-}  // namespace gmpath
+}  // namespace gmdrawing

@@ -7,10 +7,10 @@
 #include "drawing/SkipReport.h"
 #include "drawing/dxf/DxfGroups.h"
 
-namespace gmpath {
+namespace gmdrawing {
 
 /// A drawing cut down to what contours are made of.
-struct FilteredDrawing {
+struct SanitizedDrawing {
     /// DXF text with the usable entities and blocks only: known kinds, sound numbers, right counts.
     std::string text;
     /// Entities left out, by the block that holds them; the drawing itself goes by the empty name.
@@ -22,6 +22,6 @@ struct FilteredDrawing {
 /// Unusable are entities of other kinds, entities whose numbers are missing, no numbers, not finite
 /// or beyond 1e9, entities of the paper space, hidden ones, and meshes. What is left cannot upset
 /// the DXF library, which trusts the counts and numbers in its input.
-FilteredDrawing filterDrawing(const std::vector<DxfGroup>& groups);
+SanitizedDrawing sanitizedDrawing(const std::vector<DxfGroup>& groups);
 
-}  // namespace gmpath
+}  // namespace gmdrawing

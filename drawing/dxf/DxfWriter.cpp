@@ -9,9 +9,13 @@
 #include <memory>
 
 #include "drawing/Text.h"
-#include "drawing/dxf/ClassicLocale.h"
+#include "drawing/dxf/NumberLocale.h"
 
-namespace gmpath {
+namespace gmdrawing {
+
+using gmregion::Element;
+using gmregion::Path;
+using gmregion::Vec2;
 
 namespace {
 
@@ -134,8 +138,8 @@ bool endsWithEndMark(const std::string& fileName) {
 }  // namespace
 
 bool writeDxf(const ResultDrawing& drawing, const std::string& fileName) {
-    const ClassicLocale locale;
+    requirePlainNumbers();
     return DxfWriter(drawing, fileName).run() && endsWithEndMark(fileName);
 }
 
-}  // namespace gmpath
+}  // namespace gmdrawing

@@ -1,11 +1,11 @@
 #include "drawing/files/AtomicFile.h"
 
-#include <sys/stat.h>
+#include <fcntl.h>
 #include <unistd.h>
 
+#include <atomic>
 #include <cerrno>
 #include <cstdio>
-#include <cstdlib>
 #include <cstring>
 #include <filesystem>
 #include <fstream>
@@ -13,16 +13,31 @@
 
 #include "drawing/InputError.h"
 
-namespace gmpath {
+namespace gmdrawing {
 
 namespace {
 
-/// Permissions of a file that a program creates in the ordinary way.
-mode_t ordinaryMode() {
-    const mode_t mask = umask(0);
-    umask(mask);
+/// Another number at every call, in every process that runs.
+std::string uniqueSuffix() {
+    static std::atomic<unsigned> calls{0};
+    return std::to_string(getpid()) + "-" + std::to_string(calls++);
+}
+
+/// Creates an empty file with the ordinary permissions; -1, with the cause in errno, when there is
+/// one already or it cannot be created.
+int createNew(const std::string& name) {
     constexpr mode_t kReadWriteForAll = 0666;
-    return kReadWriteForAll & ~mask;
+    return open(name.c_str(), O_CREAT | O_EXCL | O_WRONLY | O_CLOEXEC, kReadWriteForAll);
+}
+
+/// Waits until what was written to a file or directory is on the disk. False, with the cause in
+/// errno, when it cannot be brought there.
+bool bringToDisk(const std::string& name) {
+    const int descriptor = open(name.c_str(), O_RDONLY | O_CLOEXEC);
+    if (descriptor < 0) return false;
+    const bool done = fsync(descriptor) == 0;
+    close(descriptor);
+    return done;
 }
 
 }  // namespace
@@ -31,14 +46,18 @@ AtomicFile::AtomicFile(std::string name) : m_name(std::move(name)) {
     const std::filesystem::path path(m_name);
     std::error_code error;
     if (std::filesystem::is_directory(path, error)) fail("is a directory");
-    const std::string pattern = "." + path.filename().string() + ".XXXXXX";
-    m_besideName = (path.parent_path() / pattern).string();
-    const int descriptor = mkstemp(m_besideName.data());
+    constexpr int kAttempts = 100;
+    int descriptor = -1;
+    for (int attempt = 0; attempt < kAttempts && descriptor < 0; ++attempt) {
+        const std::string beside = "." + path.filename().string() + "." + uniqueSuffix();
+        m_besideName = (path.parent_path() / beside).string();
+        descriptor = createNew(m_besideName);
+        if (descriptor < 0 && errno != EEXIST) break;
+    }
     if (descriptor < 0) {
         m_besideName.clear();
         fail(std::strerror(errno));
     }
-    fchmod(descriptor, ordinaryMode());
     close(descriptor);
 }
 
@@ -57,13 +76,20 @@ void AtomicFile::write(const std::string& text) {
     if (!stream) fail(std::strerror(errno));
 }
 
+void AtomicFile::synchronise() const {
+    if (!bringToDisk(m_besideName)) fail(std::strerror(errno));
+}
+
 void AtomicFile::commit() {
     if (std::rename(m_besideName.c_str(), m_name.c_str()) != 0) fail(std::strerror(errno));
     m_besideName.clear();
+    // The name itself: not every file system can, and the content is safe either way.
+    const std::string directory = std::filesystem::path(m_name).parent_path().string();
+    bringToDisk(directory.empty() ? "." : directory);
 }
 
 void AtomicFile::fail(const std::string& cause) const {
     throw InputError(m_name + ": cannot be written: " + cause);
 }
 
-}  // namespace gmpath
+}  // namespace gmdrawing

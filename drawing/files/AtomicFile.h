@@ -2,7 +2,7 @@
 
 #include <string>
 
-namespace gmpath {
+namespace gmdrawing {
 
 /// A file that comes into being as a whole: written under another name beside its place, then
 /// renamed. Until `commit` the name holds what it held before; what is not committed is removed.
@@ -26,7 +26,11 @@ public:
     /// Writes the text as the whole content. Throws InputError when it cannot be written.
     void write(const std::string& text);
 
-    /// Gives the file its name. Throws InputError when that fails; the file is removed then.
+    /// Waits until the content is on the disk. Throws InputError when it cannot be brought there.
+    void synchronise() const;
+
+    /// Gives the file its name. Throws InputError when that fails; the file is removed then. Only
+    /// what was synchronised before is sure to be whole after a loss of power.
     void commit();
 
 private:
@@ -36,4 +40,4 @@ private:
     std::string m_besideName;  ///< empty once committed or moved from
 };
 
-}  // namespace gmpath
+}  // namespace gmdrawing

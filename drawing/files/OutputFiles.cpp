@@ -8,7 +8,7 @@
 #include "drawing/dxf/DxfWriter.h"
 #include "drawing/svg/ResultPicture.h"
 
-namespace gmpath {
+namespace gmdrawing {
 
 namespace {
 
@@ -38,6 +38,7 @@ AtomicFile written(const std::vector<OutputFormat>& formats, const std::string& 
     for (const OutputFormat& format : formats) {
         if (format.ending == ending) format.write(file);
     }
+    file.synchronise();
     return file;
 }
 
@@ -78,4 +79,4 @@ void writeOutputs(const ResultDrawing& drawing, const std::vector<std::string>& 
                  names);
 }
 
-}  // namespace gmpath
+}  // namespace gmdrawing

@@ -7,7 +7,7 @@
 #include "drawing/ResultDrawing.h"
 #include "drawing/files/AtomicFile.h"
 
-namespace gmpath {
+namespace gmdrawing {
 
 /// How a file with a certain ending, in small letters, is written.
 struct OutputFormat {
@@ -29,4 +29,4 @@ void writeOutputs(const std::vector<OutputFormat>& formats, const std::vector<st
 /// The same for a part and its offsets, as .svg or .dxf.
 void writeOutputs(const ResultDrawing& drawing, const std::vector<std::string>& names);
 
-}  // namespace gmpath
+}  // namespace gmdrawing

@@ -8,12 +8,15 @@
 #include "drawing/Text.h"
 #include "drawing/contours/ChainBuilder.h"
 #include "drawing/dxf/BlockExpansion.h"
-#include "drawing/dxf/ClassicLocale.h"
 #include "drawing/dxf/DxfGroups.h"
 #include "drawing/dxf/DxfReader.h"
 #include "drawing/dxf/DxfSanitizer.h"
+#include "drawing/dxf/DxfUnits.h"
+#include "drawing/dxf/NumberLocale.h"
 
-namespace gmpath {
+namespace gmdrawing {
+
+using gmregion::Placement;
 
 namespace {
 
@@ -24,14 +27,14 @@ void add(SkipReport& report, const SkipReport& other) {
     report.duplicates += other.duplicates;
 }
 
-Drawing readFiltered(const FilteredDrawing& filtered) {
-    const ClassicLocale locale;
-    std::istringstream stream(filtered.text);
-    DrawingAdapter adapter;
+Drawing readSanitized(const SanitizedDrawing& sanitized) {
+    requirePlainNumbers();
+    std::istringstream stream(sanitized.text);
+    DxfReader adapter;
     DL_Dxf reader;
     reader.in(stream, &adapter);
     Drawing drawing = adapter.takeDrawing();
-    for (const auto& [block, report] : filtered.skipped) {
+    for (const auto& [block, report] : sanitized.skipped) {
         add(block.empty() ? drawing.model.skipped : drawing.blocks[block].skipped, report);
     }
     return drawing;
@@ -49,7 +52,7 @@ Drawing readFiltered(const FilteredDrawing& filtered) {
 
 Part partFromText(const std::string& text, const ReadOptions& options) {
     const std::vector<DxfGroup> groups = dxfGroups(text);
-    const Drawing drawing = readFiltered(filterDrawing(groups));
+    const Drawing drawing = readSanitized(sanitizedDrawing(groups));
     ExpandedDrawing expanded = expandBlocks(drawing, Placement::scaling(options.scale));
     ChainResult chains =
         buildChains(std::move(expanded.paths), options.joinTolerance * options.scale);
@@ -67,4 +70,4 @@ Part readPart(const std::string& fileName, const ReadOptions& options) {
     }
 }
 
-}  // namespace gmpath
+}  // namespace gmdrawing

@@ -3,11 +3,11 @@
 #include <string>
 #include <vector>
 
+#include "drawing/DrawingUnits.h"
 #include "drawing/SkipReport.h"
-#include "drawing/dxf/DrawingUnits.h"
 #include "region/model/Path.h"
 
-namespace gmpath {
+namespace gmdrawing {
 
 struct ReadOptions {
     /// Ends that lie at most this far apart are joined, in units of the drawing; positive.
@@ -18,17 +18,18 @@ struct ReadOptions {
 
 /// What a part drawing holds.
 struct Part {
-    std::vector<Path> contours;  ///< at least one, each with at least one element
+    std::vector<gmregion::Path> contours;  ///< at least one, each with at least one element
     SkipReport skipped;
     DrawingUnits units;
 };
 
 /// Reads a part drawing (DXF in text form) and builds its contours.
 /// Throws InputError, with the file's name and the cause, for a file that is missing, unreadable,
-/// empty, truncated or no DXF file, and for a drawing without contours.
+/// empty, truncated or no DXF file, for a drawing without contours, and when the locale of the
+/// process does not read numbers as drawings have them.
 Part readPart(const std::string& fileName, const ReadOptions& options);
 
 /// The same for the text of a drawing. The causes come without a file name.
 Part partFromText(const std::string& text, const ReadOptions& options);
 
-}  // namespace gmpath
+}  // namespace gmdrawing

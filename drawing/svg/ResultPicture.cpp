@@ -7,9 +7,14 @@
 #include "drawing/contours/Nesting.h"
 #include "drawing/svg/SvgPage.h"
 #include "drawing/svg/SvgSymbols.h"
-#include "region/model/Measure.h"
+#include "region/model/Area.h"
+#include "region/model/Box.h"
 
-namespace gmpath {
+namespace gmdrawing {
+
+using gmregion::Box;
+using gmregion::Path;
+using gmregion::Sense;
 
 namespace {
 
@@ -156,4 +161,4 @@ std::string svgOf(const ResultDrawing& drawing) {
     return SvgWriter(drawing).run();
 }
 
-}  // namespace gmpath
+}  // namespace gmdrawing

@@ -4,7 +4,7 @@
 
 #include "drawing/ResultDrawing.h"
 
-namespace gmpath {
+namespace gmdrawing {
 
 /// The drawing as an SVG picture with y upwards: a group for every source contour with its number,
 /// the source dark, every pass in a colour of its own. Arcs are true arcs. Doubtful
@@ -12,4 +12,4 @@ namespace gmpath {
 /// marks the start of every contour, an arrow its direction.
 std::string svgOf(const ResultDrawing& drawing);
 
-}  // namespace gmpath
+}  // namespace gmdrawing

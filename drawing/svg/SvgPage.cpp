@@ -5,7 +5,13 @@
 #include "drawing/Text.h"
 #include "drawing/svg/SvgSymbols.h"
 
-namespace gmpath {
+namespace gmdrawing {
+
+using gmregion::Box;
+using gmregion::Element;
+using gmregion::kPi;
+using gmregion::Path;
+using gmregion::Vec2;
 
 namespace {
 
@@ -101,4 +107,4 @@ std::string svgPathTag(const Path& path, const std::string& styleClass) {
     return "<path class=\"" + styleClass + "\" d=\"" + svgPathData(path) + "\"/>\n";
 }
 
-}  // namespace gmpath
+}  // namespace gmdrawing

@@ -4,9 +4,9 @@
 #include <string>
 #include <vector>
 
-#include "region/model/Measure.h"
+#include "region/model/Box.h"
 
-namespace gmpath {
+namespace gmdrawing {
 
 /// An entry of a picture's legend.
 struct SvgLegendEntry {
@@ -18,7 +18,7 @@ struct SvgLegendEntry {
 /// diagonal of what is drawn.
 class SvgPage {
 public:
-    explicit SvgPage(const Box& drawn);
+    explicit SvgPage(const gmregion::Box& drawn);
 
     double diagonal() const { return m_diagonal; }
 
@@ -34,13 +34,13 @@ private:
     std::string head(const std::string& rules, std::size_t legendLines) const;
     std::string legendText(const std::vector<SvgLegendEntry>& entries) const;
 
-    Box m_drawn;
+    gmregion::Box m_drawn;
     double m_diagonal;
 };
 
 /// The course of a path as SVG path data, with y turned downwards as the picture needs it.
-std::string svgPathData(const Path& path);
+std::string svgPathData(const gmregion::Path& path);
 
-std::string svgPathTag(const Path& path, const std::string& styleClass);
+std::string svgPathTag(const gmregion::Path& path, const std::string& styleClass);
 
-}  // namespace gmpath
+}  // namespace gmdrawing

@@ -3,9 +3,15 @@
 #include <algorithm>
 
 #include "drawing/Text.h"
-#include "region/model/Measure.h"
+#include "region/model/Area.h"
+#include "region/model/Box.h"
 
-namespace gmpath {
+namespace gmdrawing {
+
+using gmregion::Element;
+using gmregion::Path;
+using gmregion::Sense;
+using gmregion::Vec2;
 
 namespace {
 
@@ -79,4 +85,4 @@ std::string numberLabel(const Path& path, const std::string& number, bool inside
                    "class=\"source-mark\" text-anchor=\"middle\"", number);
 }
 
-}  // namespace gmpath
+}  // namespace gmdrawing

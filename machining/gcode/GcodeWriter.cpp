@@ -5,7 +5,12 @@
 
 #include "drawing/Text.h"
 
-namespace gmpath {
+namespace gmmachining {
+
+using gmdrawing::formatFixed;
+using gmdrawing::formatReal;
+using gmregion::Element;
+using gmregion::Vec2;
 
 namespace {
 
@@ -138,4 +143,4 @@ std::string gcodeOf(const Toolpath& moves, const MachineSettings& settings) {
     return GcodeWriter(settings).run(moves);
 }
 
-}  // namespace gmpath
+}  // namespace gmmachining

@@ -3,10 +3,10 @@
 #include <optional>
 #include <string>
 
-#include "drawing/dxf/DrawingUnits.h"
+#include "machining/gcode/MachineUnits.h"
 #include "machining/moves/Toolpath.h"
 
-namespace gmpath {
+namespace gmmachining {
 
 /// What a program for a milling machine says besides the moves.
 struct MachineSettings {
@@ -26,4 +26,4 @@ struct MachineSettings {
 /// chord by less than 1e-4 as straight moves.
 std::string gcodeOf(const Toolpath& moves, const MachineSettings& settings);
 
-}  // namespace gmpath
+}  // namespace gmmachining

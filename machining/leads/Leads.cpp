@@ -6,7 +6,13 @@
 #include "gmkernel/GmStretch.h"
 #include "region/bridge/PathConversion.h"
 
-namespace gmpath {
+namespace gmmachining {
+
+using gmregion::Element;
+using gmregion::fromKernel;
+using gmregion::kernelPoint;
+using gmregion::Path;
+using gmregion::Vec2;
 
 namespace {
 
@@ -107,4 +113,4 @@ Lead clearLead(const Path& cut, LeadEnd end, const LeadShape& shape, PartSide pa
     return {};
 }
 
-}  // namespace gmpath
+}  // namespace gmmachining

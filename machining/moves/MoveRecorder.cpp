@@ -1,6 +1,10 @@
 #include "machining/moves/MoveRecorder.h"
 
-namespace gmpath {
+namespace gmmachining {
+
+using gmregion::kKernelTolerance;
+using gmregion::Path;
+using gmregion::Vec2;
 
 MoveRecorder::MoveRecorder(double safeZ) : m_safeZ(safeZ) {
     lift();
@@ -32,4 +36,4 @@ void MoveRecorder::moveTo(MoveKind kind, double z) {
     m_z = z;
 }
 
-}  // namespace gmpath
+}  // namespace gmmachining

@@ -2,7 +2,7 @@
 
 #include "machining/moves/Toolpath.h"
 
-namespace gmpath {
+namespace gmmachining {
 
 /// Writes down the moves of a tool and knows where it is.
 class MoveRecorder {
@@ -11,19 +11,19 @@ public:
     /// point; up to then it counts as standing above the origin.
     explicit MoveRecorder(double safeZ);
 
-    Vec2 place() const { return m_place; }
+    gmregion::Vec2 place() const { return m_place; }
 
     /// The moves that follow serve this contour.
     void serve(std::size_t contour) { m_contour = contour; }
 
     /// Goes to a point at the safe height, unless the tool stands there already at any height.
-    void rapidTo(Vec2 p);
+    void rapidTo(gmregion::Vec2 p);
 
     /// Goes straight down to z.
     void plungeTo(double z);
 
     /// Follows a path from where the tool is, at its height. Nothing for a path without elements.
-    void follow(MoveKind kind, const Path& path);
+    void follow(MoveKind kind, const gmregion::Path& path);
 
     /// Rises to the safe height, unless the tool is there.
     void lift();
@@ -34,11 +34,11 @@ private:
     void moveTo(MoveKind kind, double z);
 
     double m_safeZ;
-    Vec2 m_place;
+    gmregion::Vec2 m_place;
     bool m_placed = false;  ///< the tool has gone to a point
     double m_z = 0.0;
     std::size_t m_contour = 0;
     Toolpath m_moves;
 };
 
-}  // namespace gmpath
+}  // namespace gmmachining

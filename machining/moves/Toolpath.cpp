@@ -2,7 +2,7 @@
 
 #include <cmath>
 
-namespace gmpath {
+namespace gmmachining {
 
 double travel(const Toolpath& moves, MoveKind kind) {
     double sum = 0.0;
@@ -14,4 +14,4 @@ double travel(const Toolpath& moves, MoveKind kind) {
     return sum;
 }
 
-}  // namespace gmpath
+}  // namespace gmmachining

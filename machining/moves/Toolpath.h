@@ -5,7 +5,7 @@
 
 #include "region/model/Path.h"
 
-namespace gmpath {
+namespace gmmachining {
 
 enum class MoveKind {
     kRapid,   ///< at full speed, up or at the safe height
@@ -18,7 +18,7 @@ enum class MoveKind {
 /// the path has no elements.
 struct Move {
     MoveKind kind;
-    Path path;
+    gmregion::Path path;
     double z;
     std::size_t contour;  ///< index of the contour that it serves
 };
@@ -31,4 +31,4 @@ using Toolpath = std::vector<Move>;
 /// Length of all moves of a kind, up and down included.
 double travel(const Toolpath& moves, MoveKind kind);
 
-}  // namespace gmpath
+}  // namespace gmmachining

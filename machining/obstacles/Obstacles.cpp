@@ -9,7 +9,14 @@
 
 #include <algorithm>
 
-namespace gmpath {
+namespace gmmachining {
+
+using gmregion::boundingBox;
+using gmregion::Box;
+using gmregion::Element;
+using gmregion::ElementTree;
+using gmregion::Path;
+using gmregion::Vec2;
 
 namespace {
 
@@ -78,4 +85,4 @@ bool Obstacles::keepClear(const Path& path, double clearance,
     return std::all_of(path.elements.begin(), path.elements.end(), keepsClear);
 }
 
-}  // namespace gmpath
+}  // namespace gmmachining

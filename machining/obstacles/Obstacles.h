@@ -5,26 +5,26 @@
 
 #include "region/search/ElementTree.h"
 
-namespace gmpath {
+namespace gmmachining {
 
 /// The contours of a drawing as what the tool must keep away from.
 class Obstacles {
 public:
-    explicit Obstacles(const std::vector<Path>& contours);
+    explicit Obstacles(const std::vector<gmregion::Path>& contours);
 
     /// True when every point of the path keeps `clearance`, positive, from all contours. What is
     /// lacking within the accuracy of offsets, 1e-3 or 1e-6 of the size of the drawing, does not
     /// count. `except` is the index of a contour that does not count either.
-    bool keepClear(const Path& path, double clearance,
+    bool keepClear(const gmregion::Path& path, double clearance,
                    std::optional<std::size_t> except = std::nullopt) const;
 
 private:
     /// The obstacles that come within `reach` of the element's box.
-    std::vector<const ElementTree*> nearby(const Element& e, double reach,
-                                           std::optional<std::size_t> except) const;
+    std::vector<const gmregion::ElementTree*> nearby(const gmregion::Element& e, double reach,
+                                                     std::optional<std::size_t> except) const;
 
-    std::vector<ElementTree> m_obstacles;
+    std::vector<gmregion::ElementTree> m_obstacles;
     double m_slack;
 };
 
-}  // namespace gmpath
+}  // namespace gmmachining

@@ -2,7 +2,7 @@
 
 #include <utility>
 
-namespace gmpath {
+namespace gmmachining {
 
 ToolpathOrder::ToolpathOrder(std::vector<std::vector<std::size_t>> holders)
     : m_holders(std::move(holders)),
@@ -28,4 +28,4 @@ void ToolpathOrder::finish(std::size_t contour) {
         --m_heldUncut[holder];
 }
 
-}  // namespace gmpath
+}  // namespace gmmachining

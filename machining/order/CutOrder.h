@@ -4,7 +4,7 @@
 
 #include "region/model/Path.h"
 
-namespace gmpath {
+namespace gmmachining {
 
 /// Which contours may be cut next: those that hold no other one, closed or open, that is still to
 /// be cut. So holes come before the outline that holds them, as long as the part is held fast.
@@ -25,4 +25,4 @@ private:
     std::vector<bool> m_finished;
 };
 
-}  // namespace gmpath
+}  // namespace gmmachining

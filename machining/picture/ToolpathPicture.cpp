@@ -6,7 +6,16 @@
 #include "drawing/svg/SvgPage.h"
 #include "drawing/svg/SvgSymbols.h"
 
-namespace gmpath {
+namespace gmmachining {
+
+using gmdrawing::formatReal;
+using gmdrawing::startMark;
+using gmdrawing::SvgLegendEntry;
+using gmdrawing::SvgPage;
+using gmdrawing::svgPathTag;
+using gmregion::Box;
+using gmregion::Path;
+using gmregion::Vec2;
 
 namespace {
 
@@ -145,4 +154,4 @@ std::string svgOf(const std::vector<Path>& contours, const ToolpathResult& resul
     return ToolpathSvg(contours, result).run();
 }
 
-}  // namespace gmpath
+}  // namespace gmmachining

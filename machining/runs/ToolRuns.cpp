@@ -1,9 +1,17 @@
 #include "machining/runs/ToolRuns.h"
 
+#include "machining/runs/RunStart.h"
 #include "region/model/PathStart.h"
 #include "region/offset/CheckedOffset.h"
 
-namespace gmpath {
+namespace gmmachining {
+
+using gmregion::CheckedOffset;
+using gmregion::Element;
+using gmregion::KernelOffset;
+using gmregion::Path;
+using gmregion::PathPlace;
+using gmregion::Vec2;
 
 namespace {
 
@@ -43,14 +51,14 @@ void fixStart(std::vector<ToolRun>& runs, Vec2 start) {
 ToolRuns toolRuns(const Path& contour, double d, PartSide side) {
     CheckedOffset checked = offsetChecked(contour, d);
     KernelOffset& offset = checked.offset;
-    ToolRuns result{{}, offset.accepted, checked.fault};
+    ToolRuns result{{}, offset.refusal, checked.fault};
+    const std::optional<Vec2> start = runStart(contour, d, offset);
     for (Path& path : offset.results)
         result.runs.push_back(runAlong(contour, std::move(path), d, side));
-    if (result.runs.empty()) return result;
-    if (offset.start) fixStart(result.runs, *offset.start);
+    if (start) fixStart(result.runs, *start);
     for (ToolRun& run : result.runs)
         run.startFixed = run.startFixed || !run.path.closed;
     return result;
 }
 
-}  // namespace gmpath
+}  // namespace gmmachining

@@ -2,11 +2,12 @@
 
 #include <cmath>
 
-#include "gmkernel/GmContour.h"
-#include "region/bridge/PathConversion.h"
-#include "region/model/Measure.h"
+#include "region/bridge/MeltByKernel.h"
+#include "region/model/Area.h"
+#include "region/model/Box.h"
+#include "region/model/Winding.h"
 
-namespace gmpath {
+namespace gmregion {
 
 namespace {
 
@@ -99,21 +100,22 @@ MeltOutcome outcomeWithoutLoops(const Path& a, const Path& b) {
 
 MeltedPair melt(const Path& a, const Path& b) {
     MeltedPair pair{};
-    GmContour kernelA;
-    GmContour kernelB;
-    pair.outcome = MeltOutcome::kRefused;
-    if (!fillContour(kernelA, simplifiedForKernel(a))) return pair;
-    if (!fillContour(kernelB, simplifiedForKernel(b))) return pair;
-    pair.outcome = MeltOutcome::kFailed;
-    const int count = kernelA.SplitContours(&kernelB);
-    for (int i = 0; const GmContour* loop = kernelA.GetSubContour(i); ++i) {
-        Path path = pathFromKernel(*loop, a.layer).path;
-        const LoopKind kind = kindOf(path, a, b);
-        pair.loops.push_back({kind, std::move(path)});
+    KernelLoops melted = meltByKernel(a, b);
+    pair.refusal = melted.refusal;
+    if (pair.refusal != Refusal::kNone) {
+        pair.outcome = MeltOutcome::kRefused;
+        return pair;
     }
-    if (count == 0) pair.outcome = outcomeWithoutLoops(a, b);
-    const bool sound = areSound(pair.loops, a, b) && areasAddUp(pair.loops, a, b);
-    if (count > 0 && sound) pair.outcome = MeltOutcome::kLoops;
+    for (Path& loop : melted.loops) {
+        const LoopKind kind = kindOf(loop, a, b);
+        pair.loops.push_back({kind, std::move(loop)});
+    }
+    if (!melted.meet) {
+        pair.outcome = outcomeWithoutLoops(a, b);
+    } else {
+        const bool sound = areSound(pair.loops, a, b) && areasAddUp(pair.loops, a, b);
+        pair.outcome = sound ? MeltOutcome::kLoops : MeltOutcome::kFailed;
+    }
     return pair;
 }
 
@@ -135,4 +137,4 @@ std::vector<MeltedPair> meltContours(const std::vector<Path>& first,
     return pairs;
 }
 
-}  // namespace gmpath
+}  // namespace gmregion

@@ -3,9 +3,10 @@
 #include <cstddef>
 #include <vector>
 
+#include "region/bridge/KernelLimits.h"
 #include "region/model/Path.h"
 
-namespace gmpath {
+namespace gmregion {
 
 /// What a loop of two melted contours runs round.
 enum class LoopKind {
@@ -26,7 +27,7 @@ enum class MeltOutcome {
     kSecondInside,  ///< the second lies inside the first
     kSame,          ///< they run along each other all the way
     kFailed,        ///< they meet, and the loops are not outline and common parts of them
-    kRefused        ///< the kernel cannot take one of them over
+    kRefused        ///< one of them has no place in the kernel
 };
 
 /// Two contours, by index, whose boxes overlap.
@@ -35,6 +36,7 @@ struct MeltedPair {
     std::size_t second;
     MeltOutcome outcome;
     std::vector<MeltLoop> loops;
+    Refusal refusal = Refusal::kNone;  ///< why one of them is refused
 };
 
 /// Melts the closed contours of one list with those of the other, pair by pair; pairs whose boxes
@@ -47,4 +49,4 @@ struct MeltedPair {
 std::vector<MeltedPair> meltContours(const std::vector<Path>& first,
                                      const std::vector<Path>& second);
 
-}  // namespace gmpath
+}  // namespace gmregion

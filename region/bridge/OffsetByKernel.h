@@ -1,12 +1,12 @@
 #pragma once
 
 #include <cstddef>
-#include <optional>
 #include <vector>
 
-#include "region/bridge/PathConversion.h"
+#include "region/bridge/KernelLimits.h"
+#include "region/model/Path.h"
 
-namespace gmpath {
+namespace gmregion {
 
 /// Offsets of one path.
 struct KernelOffset {
@@ -14,11 +14,9 @@ struct KernelOffset {
     /// For every result the index of the source element from which each of its elements comes; an
     /// arc about a corner comes from the element that ends there.
     std::vector<std::vector<std::size_t>> origins;
-    /// The place where the kernel starts a path along the results; nothing where it finds none.
-    std::optional<Vec2> start;
-    /// The kernel took the path over; false when its joints are off beyond the kernel's tolerance
-    /// or an element cannot be built.
-    bool accepted = true;
+    Refusal refusal = Refusal::kNone;  ///< a path that is refused has no results
+
+    bool accepted() const { return refusal == Refusal::kNone; }
 };
 
 /// Offsets a path at the signed distance d, positive to the right of the direction of travel, as
@@ -29,4 +27,4 @@ struct KernelOffset {
 /// offsets cross.
 KernelOffset offsetByKernel(const Path& path, double d, double shortest = kShortestForKernel);
 
-}  // namespace gmpath
+}  // namespace gmregion

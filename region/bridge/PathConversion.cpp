@@ -7,7 +7,7 @@
 #include "gmkernel/GmStretch.h"
 #include "region/model/ShortElements.h"
 
-namespace gmpath {
+namespace gmregion {
 
 namespace {
 
@@ -58,13 +58,15 @@ SimplifiedPath simplifiedForKernel(const Path& path, double shortest) {
     return simplified;
 }
 
-bool fillContour(GmContour& contour, const SimplifiedPath& source) {
+Refusal fillContour(GmContour& contour, const SimplifiedPath& source) {
     for (std::size_t i = 0; i < source.path.elements.size(); ++i) {
         const std::unique_ptr<GmCurve> curve = kernelCurve(source.path.elements[i]);
         const auto id = static_cast<long>(source.indices[i]);
-        if (!curve->CreationOK() || !contour.AddElement(curve.get(), false, id)) return false;
+        if (!curve->CreationOK()) return Refusal::kTooSmall;
+        if (!contour.AddElement(curve.get(), false, id)) return Refusal::kJoint;
     }
-    return contour.IsClosed() == source.path.closed;
+    if (contour.IsClosed() == source.path.closed) return Refusal::kNone;
+    return source.path.closed ? Refusal::kJoint : Refusal::kTouchesStart;
 }
 
 IdentifiedPath pathFromKernel(const GmContour& contour, const std::string& layer) {
@@ -84,4 +86,4 @@ IdentifiedPath pathFromKernel(const GmContour& contour, const std::string& layer
     return result;
 }
 
-}  // namespace gmpath
+}  // namespace gmregion

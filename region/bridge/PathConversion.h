@@ -8,12 +8,10 @@
 #include "gmkernel/GmContour.h"
 #include "gmkernel/GmCurve.h"
 #include "gmkernel/GmPoint.h"
+#include "region/bridge/KernelLimits.h"
 #include "region/model/Path.h"
 
-namespace gmpath {
-
-/// Elements below this length, over which the kernel joins pieces, may tear its results.
-constexpr double kShortestForKernel = 3.0 * kKernelTolerance;
+namespace gmregion {
 
 GmPoint kernelPoint(Vec2 p);
 Vec2 fromKernel(const GmPoint& p);
@@ -29,9 +27,9 @@ struct SimplifiedPath {
 };
 SimplifiedPath simplifiedForKernel(const Path& path, double shortest = kShortestForKernel);
 
-/// Fills an empty contour with a path, the indices as identifiers. False when the joints of the
-/// path are off beyond the kernel's tolerance or an element cannot be built.
-bool fillContour(GmContour& contour, const SimplifiedPath& source);
+/// Fills an empty contour with a path, the indices as identifiers. Where it is refused the contour
+/// holds the elements before the one that is at fault.
+Refusal fillContour(GmContour& contour, const SimplifiedPath& source);
 
 /// A contour of the kernel as a path, and for each of its elements the identifier it comes with. An
 /// arc may become two elements.
@@ -41,4 +39,4 @@ struct IdentifiedPath {
 };
 IdentifiedPath pathFromKernel(const GmContour& contour, const std::string& layer);
 
-}  // namespace gmpath
+}  // namespace gmregion

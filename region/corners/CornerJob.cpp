@@ -2,12 +2,9 @@
 
 #include <cmath>
 
-#include "gmkernel/GmContour.h"
-#include "region/bridge/PathConversion.h"
-#include "region/corners/CornerRoom.h"
-#include "region/model/Measure.h"
+#include "region/model/Area.h"
 
-namespace gmpath {
+namespace gmregion {
 
 namespace {
 
@@ -25,54 +22,19 @@ bool isWanted(double turn, Sense sense, const CornerRequest& request) {
     return turnsWith == (request.choice == CornerChoice::kConvex);
 }
 
-GmContour::eTransType kernelType(CornerKind kind) {
-    switch (kind) {
-        case CornerKind::kChamferDistance:
-            return GmContour::eTransChamferDist;
-        case CornerKind::kChamferLength:
-            return GmContour::eTransChamferLength;
-        case CornerKind::kRounding:
-            break;
-    }
-    return GmContour::eTransRadius;
-}
-
-/// The element that a contour made itself, of a contour whose other elements it did not; -1 when
-/// there is none.
-int insertedElement(const GmContour& contour) {
-    for (int i = 0; i < contour.ElementCount(); ++i) {
-        if (contour.GetContElement(i)->bInserted) return i;
-    }
-    return -1;
-}
-
-/// Puts a transition into the corner where the element `index` ends, if there is room.
-bool breakCorner(GmContour& contour, std::size_t index, const CornerRoom& room,
-                 const CornerRequest& request) {
-    GmContour attempt(contour);
-    const int first = static_cast<int>(index);
-    const Vec2 corner = fromKernel(attempt.GetElement(first)->EP());
-    if (!attempt.AddTrans(kernelType(request.kind), first, request.value, true)) return false;
-    const int made = insertedElement(attempt);
-    if (made < 0 || !room.allows(attempt, made, corner)) return false;
-    contour = attempt;
-    return true;
-}
-
 CornerResult cornersBroken(const Path& contour, const CornerRoom& room,
                            const CornerRequest& request) {
     CornerResult result{contour};
-    const SimplifiedPath source = simplifiedForKernel(contour);
-    GmContour kernel;
-    result.accepted = fillContour(kernel, source);
-    if (!result.accepted) return result;
-    const std::vector<std::size_t> corners = cornersOf(source.path, request);
+    CornerBreaker breaker(contour);
+    result.refusal = breaker.refusal();
+    if (result.refusal != Refusal::kNone) return result;
+    const std::vector<std::size_t> corners = cornersOf(breaker.source(), request);
     // From the last one to the first, so that new elements do not move the corners still to do.
     for (auto corner = corners.rbegin(); corner != corners.rend(); ++corner) {
-        const bool done = breakCorner(kernel, *corner, room, request);
+        const bool done = breaker.breakCorner(*corner, request.kind, request.value, room);
         ++(done ? result.done : result.notDone);
     }
-    if (result.done > 0) result.path = pathFromKernel(kernel, contour.layer).path;
+    if (result.done > 0) result.path = breaker.result();
     return result;
 }
 
@@ -98,4 +60,4 @@ std::vector<CornerResult> breakCorners(const std::vector<Path>& contours,
     return results;
 }
 
-}  // namespace gmpath
+}  // namespace gmregion

@@ -3,16 +3,9 @@
 #include <cstddef>
 #include <vector>
 
-#include "region/model/Path.h"
+#include "region/bridge/CornerBreaker.h"
 
-namespace gmpath {
-
-/// What a corner becomes, and what the value means.
-enum class CornerKind {
-    kRounding,         ///< a tangent arc of this radius
-    kChamferDistance,  ///< a chamfer that starts and ends at this distance from the corner
-    kChamferLength     ///< a chamfer of this length
-};
+namespace gmregion {
 
 /// Which corners of a closed contour are done. Of an open one all are: it has no inside.
 enum class CornerChoice {
@@ -34,9 +27,8 @@ struct CornerRequest {
 struct CornerResult {
     Path path;
     std::size_t done = 0;
-    std::size_t notDone =
-        0;                 ///< corners that have no room for the transition; they stay as they are
-    bool accepted = true;  ///< false when the kernel refused the contour, which then stays as it is
+    std::size_t notDone = 0;  ///< corners without room for the transition; they stay as they are
+    Refusal refusal = Refusal::kNone;  ///< a contour that is refused stays as it is
 };
 
 /// The joints of a path that are corners to be done: the indices of the elements that end there.
@@ -49,4 +41,4 @@ std::vector<std::size_t> cornersOf(const Path& path, const CornerRequest& reques
 std::vector<CornerResult> breakCorners(const std::vector<Path>& contours,
                                        const CornerRequest& request);
 
-}  // namespace gmpath
+}  // namespace gmregion

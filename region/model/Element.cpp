@@ -3,7 +3,7 @@
 #include <algorithm>
 #include <limits>
 
-namespace gmpath {
+namespace gmregion {
 
 namespace {
 
@@ -121,4 +121,4 @@ Element withEnds(const Element& e, Vec2 sp, Vec2 ep) {
     return arcThrough(sp, halvingPoint(e), ep);
 }
 
-}  // namespace gmpath
+}  // namespace gmregion

@@ -2,7 +2,7 @@
 
 #include "region/model/Vec2.h"
 
-namespace gmpath {
+namespace gmregion {
 
 /// Points of the kernel count as equal, and curves as too short, below this length.
 constexpr double kKernelTolerance = 1e-4;
@@ -79,4 +79,4 @@ Element arcThrough(Vec2 sp, Vec2 through, Vec2 ep);
 /// so that a small move of the ends moves no other point of the arc by more.
 Element withEnds(const Element& e, Vec2 sp, Vec2 ep);
 
-}  // namespace gmpath
+}  // namespace gmregion

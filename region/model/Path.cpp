@@ -3,7 +3,7 @@
 #include <algorithm>
 #include <limits>
 
-namespace gmpath {
+namespace gmregion {
 
 namespace {
 
@@ -99,4 +99,4 @@ void meetEnds(Path& path) {
     }
 }
 
-}  // namespace gmpath
+}  // namespace gmregion

@@ -5,7 +5,7 @@
 
 #include "region/model/Element.h"
 
-namespace gmpath {
+namespace gmregion {
 
 /// A chain of elements in which each starts exactly where the one before ends.
 struct Path {
@@ -44,4 +44,4 @@ void appendBulge(std::vector<Element>& elements, const Element& e);
 /// size is closed at its middle.
 void meetEnds(Path& path);
 
-}  // namespace gmpath
+}  // namespace gmregion

@@ -2,7 +2,7 @@
 
 #include <algorithm>
 
-namespace gmpath {
+namespace gmregion {
 
 namespace {
 
@@ -54,4 +54,4 @@ Path startedAt(const Path& path, const PathPlace& place) {
     return result;
 }
 
-}  // namespace gmpath
+}  // namespace gmregion

@@ -4,7 +4,7 @@
 
 #include "region/model/Path.h"
 
-namespace gmpath {
+namespace gmregion {
 
 /// A point of a path.
 struct PathPlace {
@@ -19,4 +19,4 @@ PathPlace nearestPlace(const Path& path, Vec2 p);
 /// within ten times the kernel's tolerance of a joint, which then becomes the start.
 Path startedAt(const Path& path, const PathPlace& place);
 
-}  // namespace gmpath
+}  // namespace gmregion

@@ -2,23 +2,7 @@
 
 #include <cmath>
 
-namespace gmpath {
-
-namespace {
-
-/// Scale factors that differ by less, in relation, count as equal.
-constexpr double kUniformTolerance = 1e-6;
-
-/// The scale with both factors of exactly one size; nothing when they differ or are 0.
-std::optional<Vec2> uniform(Vec2 scale) {
-    const double size = std::abs(scale.x);
-    if (size == 0.0 || std::abs(std::abs(scale.y) - size) > kUniformTolerance * size) {
-        return std::nullopt;
-    }
-    return Vec2{scale.x, std::copysign(size, scale.y)};
-}
-
-}  // namespace
+namespace gmregion {
 
 Placement Placement::scaling(double factor) {
     Placement placement;
@@ -35,22 +19,12 @@ Placement Placement::turning(double angle, Vec2 about) {
     return placement;
 }
 
-std::optional<Placement> Placement::ofReference(const BlockReference& reference, Vec2 base,
-                                                int column, int row) {
-    const std::optional<Vec2> scale = uniform(reference.scale);
-    if (!scale) return std::nullopt;
-    const Vec2 along{std::cos(reference.angle), std::sin(reference.angle)};
-    const Vec2 across{-along.y, along.x};
+Placement Placement::toAxes(Vec2 origin, Vec2 xAxis, Vec2 yAxis) {
     Placement placement;
-    placement.m_xAxis = scale->x * along;
-    placement.m_yAxis = scale->y * across;
-    placement.m_origin = reference.at + (column * reference.spacing.x) * along +
-                         (row * reference.spacing.y) * across;
-    placement.m_origin = placement.apply(Vec2{-base.x, -base.y});
-    if (!reference.mirrored) return placement;
-    Placement mirror;
-    mirror.m_xAxis = {-1.0, 0.0};
-    return mirror.after(placement);
+    placement.m_xAxis = xAxis;
+    placement.m_yAxis = yAxis;
+    placement.m_origin = origin;
+    return placement;
 }
 
 Placement Placement::after(const Placement& inner) const {
@@ -73,4 +47,4 @@ Path Placement::apply(const Path& path) const {
     return placed;
 }
 
-}  // namespace gmpath
+}  // namespace gmregion

@@ -1,10 +1,8 @@
 #pragma once
 
-#include <optional>
+#include "region/model/Path.h"
 
-#include "drawing/dxf/Drawing.h"
-
-namespace gmpath {
+namespace gmregion {
 
 /// A similarity of the plane: uniform scale, turn, move, and possibly a mirroring. Straight
 /// segments and arcs keep their kind under it.
@@ -19,11 +17,9 @@ public:
     /// Turns counter-clockwise about a point by an angle in radians.
     static Placement turning(double angle, Vec2 about);
 
-    /// Where a block with the given base point comes to lie by one cell of a reference, column and
-    /// row counted from 0. Nothing when the scale is not uniform or 0, so that no similarity
-    /// exists.
-    static std::optional<Placement> ofReference(const BlockReference& reference, Vec2 base,
-                                                int column, int row);
+    /// Takes the origin to `origin` and the unit points of the axes to `xAxis` and `yAxis` from
+    /// there. The axes are as long as each other, not 0, and square to each other.
+    static Placement toAxes(Vec2 origin, Vec2 xAxis, Vec2 yAxis);
 
     /// First `inner`, then this.
     Placement after(const Placement& inner) const;
@@ -37,4 +33,4 @@ private:
     Vec2 m_origin;
 };
 
-}  // namespace gmpath
+}  // namespace gmregion

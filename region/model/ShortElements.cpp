@@ -1,6 +1,6 @@
 #include "region/model/ShortElements.h"
 
-namespace gmpath {
+namespace gmregion {
 
 namespace {
 
@@ -33,4 +33,4 @@ std::vector<std::size_t> dropShortElements(Path& path, double shortest) {
     return stay;
 }
 
-}  // namespace gmpath
+}  // namespace gmregion

@@ -4,7 +4,7 @@
 
 #include "region/model/Path.h"
 
-namespace gmpath {
+namespace gmregion {
 
 /// Drops the elements of a path that are shorter than `shortest`, or arcs of a radius below it, and
 /// returns the indices of those that stay. The element behind a dropped one starts where the
@@ -12,4 +12,4 @@ namespace gmpath {
 /// within a tenth of the tolerance become segments. A path may be left without elements.
 std::vector<std::size_t> dropShortElements(Path& path, double shortest);
 
-}  // namespace gmpath
+}  // namespace gmregion

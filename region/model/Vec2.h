@@ -2,7 +2,7 @@
 
 #include <cmath>
 
-namespace gmpath {
+namespace gmregion {
 
 constexpr double kPi = 3.14159265358979323846;
 
@@ -63,4 +63,4 @@ inline Vec2 unit(Vec2 v) {
     return len > 0.0 ? (1.0 / len) * v : Vec2{};
 }
 
-}  // namespace gmpath
+}  // namespace gmregion

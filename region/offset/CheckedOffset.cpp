@@ -4,10 +4,10 @@
 #include <array>
 #include <numeric>
 
-#include "region/model/Measure.h"
+#include "region/model/Box.h"
 #include "region/model/Placement.h"
 
-namespace gmpath {
+namespace gmregion {
 
 namespace {
 
@@ -76,15 +76,15 @@ double firstStep(const Path& path, double d) {
     return std::copysign(kPart * std::min({std::abs(d), size.x, size.y}), d);
 }
 
-/// Offsets every result of the first step by the rest of the distance. No start is searched.
+/// Offsets every result of the first step by the rest of the distance.
 KernelOffset offsetInSteps(const Path& path, double d, const Attempt& attempt) {
     const double first = firstStep(path, d);
     const KernelOffset between = offsetByKernel(path, first, attempt.shortest);
     KernelOffset offset;
-    offset.accepted = between.accepted;
+    offset.refusal = between.refusal;
     for (std::size_t i = 0; i < between.results.size(); ++i) {
         KernelOffset rest = offsetByKernel(between.results[i], d - first, attempt.shortest);
-        offset.accepted = offset.accepted && rest.accepted;
+        if (offset.accepted()) offset.refusal = rest.refusal;
         for (std::size_t k = 0; k < rest.results.size(); ++k) {
             for (std::size_t& origin : rest.origins[k])
                 origin = between.origins[i][origin];
@@ -119,7 +119,6 @@ KernelOffset offsetAs(const Attempt& attempt, const Path& source, double d) {
     const Placement back = Placement::turning(-attempt.angle, about);
     for (Path& path : offset.results)
         path = back.apply(path);
-    if (offset.start) offset.start = back.apply(*offset.start);
     for (std::vector<std::size_t>& origins : offset.origins) {
         for (std::size_t& origin : origins)
             origin = (origin + start) % source.elements.size();
@@ -137,7 +136,6 @@ void closeGap(Path& path, double closable) {
 /// The closed results, among them those that all but close.
 KernelOffset closedOnes(const KernelOffset& offset, double closable) {
     KernelOffset closed;
-    closed.start = offset.start;
     for (std::size_t i = 0; i < offset.results.size(); ++i) {
         Path path = offset.results[i];
         closeGap(path, closable);
@@ -150,7 +148,7 @@ KernelOffset closedOnes(const KernelOffset& offset, double closable) {
 
 CheckedOffset checkedAs(const Attempt& attempt, const Path& source, double d) {
     CheckedOffset found{offsetAs(attempt, source, d)};
-    if (!found.offset.accepted) return found;
+    if (!found.offset.accepted()) return found;
     found.fault = checkOffset(source, d, found.offset.results);
     if (found.fault != OffsetFault::kOpen) return found;
     KernelOffset closed = closedOnes(found.offset, kClosableGap * checkTolerance(source));
@@ -187,14 +185,14 @@ CheckedOffset offsetChecked(const Path& source, double d) {
         if (!isWorthwhile(attempt, source)) continue;
         CheckedOffset found = checkedAs(attempt, source, d);
         const bool first = ++attempts == 1;
-        const bool sound = found.offset.accepted && found.fault == OffsetFault::kNone;
-        if (first || sound || (found.offset.accepted && isBetter(found, best))) {
+        const bool sound = found.offset.accepted() && found.fault == OffsetFault::kNone;
+        if (first || sound || (found.offset.accepted() && isBetter(found, best))) {
             best = std::move(found);
         }
-        if (sound || !best.offset.accepted) break;
+        if (sound || !best.offset.accepted()) break;
     }
     best.attempts = attempts;
     return best;
 }
 
-}  // namespace gmpath
+}  // namespace gmregion

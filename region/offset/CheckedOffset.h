@@ -3,7 +3,7 @@
 #include "region/bridge/OffsetByKernel.h"
 #include "region/offset/OffsetCheck.h"
 
-namespace gmpath {
+namespace gmregion {
 
 /// The best offset that was found, and what is wrong with it.
 struct CheckedOffset {
@@ -21,4 +21,4 @@ struct CheckedOffset {
 /// the kernel refuses is not tried again.
 CheckedOffset offsetChecked(const Path& source, double d);
 
-}  // namespace gmpath
+}  // namespace gmregion

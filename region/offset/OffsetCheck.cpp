@@ -9,11 +9,13 @@
 
 #include <algorithm>
 
-#include "region/model/Measure.h"
+#include "region/model/Area.h"
+#include "region/model/Box.h"
+#include "region/model/Winding.h"
 #include "region/offset/RawOffset.h"
 #include "region/search/ElementTree.h"
 
-namespace gmpath {
+namespace gmregion {
 
 namespace {
 
@@ -168,4 +170,4 @@ OffsetFault checkOffset(const Path& source, double d, const std::vector<Path>& r
     return check.isComplete(results) ? OffsetFault::kNone : OffsetFault::kMissing;
 }
 
-}  // namespace gmpath
+}  // namespace gmregion

@@ -5,7 +5,7 @@
 
 #include "region/model/Path.h"
 
-namespace gmpath {
+namespace gmregion {
 
 /// What is wrong with the offset of a path, the lesser fault first.
 enum class OffsetFault {
@@ -30,4 +30,4 @@ double checkTolerance(const Path& source);
 /// elements, times a logarithm.
 OffsetFault checkOffset(const Path& source, double d, const std::vector<Path>& results);
 
-}  // namespace gmpath
+}  // namespace gmregion

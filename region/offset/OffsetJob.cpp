@@ -1,10 +1,9 @@
 #include "region/offset/OffsetJob.h"
 
-#include "drawing/contours/Nesting.h"
-#include "region/model/Measure.h"
+#include "region/model/Area.h"
 #include "region/offset/CheckedOffset.h"
 
-namespace gmpath {
+namespace gmregion {
 
 namespace {
 
@@ -21,7 +20,7 @@ bool goesOutside(Side side, int depth) {
 void addOffset(ContourOffsets& offsets, std::size_t pass, const Path& contour, double d) {
     CheckedOffset found = offsetChecked(contour, d);
     const bool doubtful = found.fault != OffsetFault::kNone;
-    offsets.accepted = offsets.accepted && found.offset.accepted;
+    if (offsets.refusal == Refusal::kNone) offsets.refusal = found.offset.refusal;
     if (doubtful) offsets.faults.push_back({d, found.fault});
     for (Path& path : found.offset.results)
         offsets.paths.push_back({pass, std::move(path), doubtful});
@@ -55,9 +54,9 @@ std::vector<double> signedDistances(const Path& contour, int depth, Side side, d
 }
 
 std::vector<ContourOffsets> offsetContours(const std::vector<Path>& contours,
+                                           const std::vector<std::optional<int>>& depths,
                                            const OffsetRequest& request,
                                            const ProgressCall& progress) {
-    const std::vector<std::optional<int>> depths = nestingDepths(contours);
     const std::size_t total = contours.size() * request.distances.size();
     std::size_t done = 0;
     const auto passDone = [&] { progress(++done, total); };
@@ -68,4 +67,4 @@ std::vector<ContourOffsets> offsetContours(const std::vector<Path>& contours,
     return offsets;
 }
 
-}  // namespace gmpath
+}  // namespace gmregion

@@ -1,13 +1,14 @@
 #pragma once
 
 #include <functional>
+#include <optional>
 #include <string_view>
 #include <vector>
 
-#include "drawing/ResultDrawing.h"
+#include "region/bridge/KernelLimits.h"
 #include "region/offset/OffsetCheck.h"
 
-namespace gmpath {
+namespace gmregion {
 
 /// On which side of a contour to offset.
 enum class Side {
@@ -32,12 +33,19 @@ struct FaultyOffset {
     OffsetFault fault;
 };
 
+/// One path of an offset.
+struct OffsetPath {
+    std::size_t pass;  ///< index of the pass
+    Path path;
+    bool doubtful;  ///< the offset that it belongs to has a fault
+};
+
 /// What became of one source contour.
 struct ContourOffsets {
-    std::vector<ResultPath> paths;         ///< by pass, doubtful where the offset has a fault
+    std::vector<OffsetPath> paths;         ///< by pass
     std::vector<std::size_t> emptyPasses;  ///< passes that yielded nothing, and rightly so
     std::vector<FaultyOffset> faults;      ///< by pass
-    bool accepted = true;                  ///< false when the kernel refused the contour
+    Refusal refusal = Refusal::kNone;      ///< why the contour has no offsets at all
 };
 
 /// Called with the number of offsets done and their total.
@@ -49,9 +57,11 @@ using ProgressCall = std::function<void(std::size_t done, std::size_t total)>;
 std::vector<double> signedDistances(const Path& contour, int depth, Side side, double distance);
 
 /// Offsets every contour in every pass and checks the offsets (offsetChecked); the result has one
-/// entry a contour, in order.
+/// entry a contour, in order. `depths` has the nesting depth of every contour, nothing for open
+/// ones.
 std::vector<ContourOffsets> offsetContours(const std::vector<Path>& contours,
+                                           const std::vector<std::optional<int>>& depths,
                                            const OffsetRequest& request,
                                            const ProgressCall& progress);
 
-}  // namespace gmpath
+}  // namespace gmregion

@@ -2,7 +2,7 @@
 
 #include <optional>
 
-namespace gmpath {
+namespace gmregion {
 
 namespace {
 
@@ -44,4 +44,4 @@ std::vector<Element> rawOffset(const Path& path, double d) {
     return raw;
 }
 
-}  // namespace gmpath
+}  // namespace gmregion

@@ -4,7 +4,7 @@
 
 #include "region/model/Path.h"
 
-namespace gmpath {
+namespace gmregion {
 
 /// The parallels of a path's elements at the signed distance d (positive: right) and the arcs about
 /// the corners that open to that side, which is right of a turn to the left and left of a turn to
@@ -13,4 +13,4 @@ namespace gmpath {
 /// run with the path, so the path lies on their left for d > 0.
 std::vector<Element> rawOffset(const Path& path, double d);
 
-}  // namespace gmpath
+}  // namespace gmregion

@@ -2,7 +2,7 @@
 
 #include <algorithm>
 
-namespace gmpath {
+namespace gmregion {
 
 namespace {
 
@@ -69,4 +69,4 @@ double ElementTree::distanceWithin(std::size_t index, Vec2 p, double farthest) c
     return farthest;
 }
 
-}  // namespace gmpath
+}  // namespace gmregion

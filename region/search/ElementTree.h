@@ -2,9 +2,9 @@
 
 #include <vector>
 
-#include "region/model/Measure.h"
+#include "region/model/Box.h"
 
-namespace gmpath {
+namespace gmregion {
 
 /// Elements in nested boxes, for asking whether any comes near a point. The elements of a path
 /// follow each other in space too, so each box is that of a run of them. Cost of a question: the
@@ -40,4 +40,4 @@ private:
     std::vector<Node> m_nodes;
 };
 
-}  // namespace gmpath
+}  // namespace gmregion

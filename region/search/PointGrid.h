@@ -8,7 +8,7 @@
 
 #include "region/model/Vec2.h"
 
-namespace gmpath {
+namespace gmregion {
 
 /// Numbered points in square cells, for looking up neighbours within the cell width.
 class PointGrid {
@@ -56,4 +56,4 @@ private:
     std::unordered_map<Cell, std::vector<std::size_t>, CellHash> m_cells;
 };
 
-}  // namespace gmpath
+}  // namespace gmregion

@@ -117,7 +117,7 @@ TEST_F(Program, CornersAndMeltSayWhatTheyDid) {
 
 TEST_F(Program, FaultyOffsetsAreNamedAndDashed) {
     // A polygon that crosses itself has no closed offset.
-    const std::vector<gmpath::Element> crossing = {
+    const std::vector<gmregion::Element> crossing = {
         {{0, 0}, {}}, {{20, 12}, {}}, {{20, 0}, {}}, {{0, 10}, {}}};
     m_scratch.store("a.dxf", drawing_text::drawing(drawing_text::lightPolyline(crossing, true)));
     const Outcome offset = run("offset a.dxf --distance 1 --side left -o a.svg -o b.dxf");
@@ -129,6 +129,22 @@ TEST_F(Program, FaultyOffsetsAreNamedAndDashed) {
     EXPECT_NE(svg.find("dashed: faulty"), std::string::npos);
     run("offset a.dxf --distance 0 -o a.svg");
     EXPECT_EQ(m_scratch.content("a.svg").find("dashed: faulty"), std::string::npos);
+}
+
+TEST_F(Program, RefusedContoursAreToldWithTheCause) {
+    const std::vector<gmregion::Element> touching = {
+        {{0, 0}, {}}, {{10, 0}, {}}, {{10, 10}, {}}, {{0.00005, 0}, {}}};
+    m_scratch.store("a.dxf", drawing_text::drawing(drawing_text::lightPolyline(touching, false)));
+    for (const std::string command :
+         {"offset a.dxf --distance 1 -o b.svg", "corners a.dxf --radius 1 -o b.svg",
+          "toolpath a.dxf --tool 1 -o b.svg"}) {
+        const Outcome outcome = run(command + " --join 1e-6");
+        EXPECT_EQ(outcome.exitCode, 1) << command;
+        EXPECT_NE(outcome.err.find("gmpath: a.dxf: contour 1: "), std::string::npos);
+        EXPECT_NE(outcome.err.find("open, but comes within 0.0001 of its start"),
+                  std::string::npos);
+    }
+    EXPECT_EQ(run("offset a.dxf --distance 1 -o b.svg").exitCode, 0) << "closed by the joining";
 }
 
 TEST_F(Program, BadInputIsOneLineAndExitCodeTwo) {
@@ -180,7 +196,7 @@ TEST_F(Program, BadInputIsOneLineAndExitCodeTwo) {
         {"toolpath feet.dxf --tool 4 -o a.ngc", "feet"},
         {"", "subcommand"},
         {"corners " + kBracket + " -o a.svg", "--radius"},
-        {"corners " + kBracket + " --radius 1 --chamfer 2 -o a.svg", "excludes"},
+        {"corners " + kBracket + " --radius 1 --chamfer 2 -o a.svg", "Exactly 1"},
         {"corners " + kBracket + " --radius 1 --bend nan -o a.svg", "--bend"},
         {"corners " + kBracket + " --chamfer-length nan -o a.svg", "--chamfer-length"},
         {"melt " + kBracket + " -o a.svg", "SECOND"},

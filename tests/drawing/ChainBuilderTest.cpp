@@ -4,10 +4,11 @@
 #include <rapidcheck/gtest.h>
 
 #include "drawing/InputError.h"
-#include "region/model/Measure.h"
+#include "region/model/Area.h"
 #include "tests/support/PathShapes.h"
 
-using namespace gmpath;
+using namespace gmregion;
+using namespace gmdrawing;
 using path_shapes::circle;
 using path_shapes::polygon;
 using path_shapes::rectangle;

@@ -4,7 +4,8 @@
 
 #include "tests/support/PathShapes.h"
 
-using namespace gmpath;
+using namespace gmregion;
+using namespace gmdrawing;
 using path_shapes::circle;
 using path_shapes::polygon;
 using path_shapes::rectangle;

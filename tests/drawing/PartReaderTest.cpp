@@ -5,11 +5,12 @@
 #include <locale>
 
 #include "drawing/InputError.h"
-#include "region/model/Measure.h"
+#include "region/model/Box.h"
 #include "tests/support/DrawingText.h"
 #include "tests/support/PathShapes.h"
 
-using namespace gmpath;
+using namespace gmregion;
+using namespace gmdrawing;
 using namespace drawing_text;
 using path_shapes::kPi;
 
@@ -207,15 +208,22 @@ TEST(PartReader, DamagedTextsNameTheirCause) {
     EXPECT_GT(cuts, 50U);
 }
 
-TEST(PartReader, TheLocaleDoesNotMatter) {
+TEST(PartReader, RefusesALocaleThatReadsOtherNumbers) {
     struct CommaPoint : std::numpunct<char> {
         char do_decimal_point() const override { return ','; }
-        char do_thousands_sep() const override { return '.'; }
+    };
+    struct GroupedDigits : std::numpunct<char> {
+        char do_thousands_sep() const override { return ','; }
         std::string do_grouping() const override { return "\3"; }
     };
     const std::string text = drawing(circle({1.5, 0.25}, 0.125));
-    const std::locale before = std::locale::global(std::locale(std::locale(), new CommaPoint));
-    const Part part = partFromText(text, {});
+    const std::locale before;
+    for (const std::locale& other :
+         {std::locale(before, new CommaPoint), std::locale(before, new GroupedDigits)}) {
+        std::locale::global(other);
+        EXPECT_NE(causeOf(text).find("locale"), std::string::npos);
+        EXPECT_EQ(std::locale(), other) << "left as it is";
+    }
     std::locale::global(before);
-    expectBox(part.contours[0], {1.375, 0.125}, {1.625, 0.375});
+    expectBox(partFromText(text, {}).contours[0], {1.375, 0.125}, {1.625, 0.375});
 }

@@ -4,7 +4,7 @@
 
 #include <limits>
 
-using namespace gmpath;
+using namespace gmdrawing;
 
 TEST(Text, NumbersAreWrittenShortAndReadBack) {
     EXPECT_EQ(formatReal(-0.0), "0");

@@ -10,11 +10,11 @@
 #include "drawing/files/PartReader.h"
 #include "drawing/svg/ResultPicture.h"
 #include "drawing/svg/SvgPage.h"
-#include "region/model/Measure.h"
 #include "tests/support/PathShapes.h"
 #include "tests/support/Scratch.h"
 
-using namespace gmpath;
+using namespace gmregion;
+using namespace gmdrawing;
 using path_shapes::circle;
 using path_shapes::kPi;
 using path_shapes::polygon;

@@ -6,14 +6,18 @@
 
 #include "drawing/InputError.h"
 #include "drawing/contours/Nesting.h"
+#include "drawing/dxf/DxfUnits.h"
 #include "drawing/files/PartReader.h"
 #include "machining/ToolpathJob.h"
 #include "machining/gcode/GcodeWriter.h"
+#include "region/model/Area.h"
 #include "region/model/PathStart.h"
 #include "tests/support/GcodeReader.h"
 #include "tests/support/PathShapes.h"
 
-using namespace gmpath;
+using namespace gmregion;
+using namespace gmdrawing;
+using namespace gmmachining;
 using path_shapes::circle;
 using path_shapes::kPi;
 using path_shapes::polygon;

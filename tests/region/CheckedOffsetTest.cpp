@@ -7,7 +7,7 @@
 #include "region/offset/OffsetJob.h"
 #include "tests/support/PathShapes.h"
 
-using namespace gmpath;
+using namespace gmregion;
 using path_shapes::kPi;
 using path_shapes::polygon;
 
@@ -106,12 +106,12 @@ TEST(CheckedOffset, NamesTheFaultWhereNoAttemptPasses) {
     EXPECT_GT(crossing.attempts, 1);
     EXPECT_FALSE(crossing.offset.results.empty());
     const Path undefined = polygon({{0, 0}, {std::nan(""), 0}, {1, 1}});
-    EXPECT_FALSE(offsetChecked(undefined, 1.0).offset.accepted);
+    EXPECT_NE(offsetChecked(undefined, 1.0).offset.refusal, Refusal::kNone);
     EXPECT_TRUE(offsetChecked({}, 1.0).offset.results.empty());
 }
 
 TEST(CheckedOffset, JobMarksResultsOfFaultyOffsetsOnly) {
-    const auto offsets = offsetContours({reversed(kCrossing), star(5, 20, 5)},
+    const auto offsets = offsetContours({reversed(kCrossing), star(5, 20, 5)}, {0, 0},
                                         {Side::kRight, {1.0, 60.0}}, [](auto, auto) {});
     EXPECT_EQ(offsets[0].faults.at(0).fault, OffsetFault::kOpen);
     EXPECT_TRUE(offsets[0].paths.at(0).doubtful);

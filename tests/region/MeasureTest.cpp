@@ -1,11 +1,13 @@
-#include "region/model/Measure.h"
+#include "region/model/Area.h"
+#include "region/model/Box.h"
+#include "region/model/Winding.h"
 
 #include <gtest/gtest.h>
 #include <rapidcheck/gtest.h>
 
 #include "tests/support/PathShapes.h"
 
-using namespace gmpath;
+using namespace gmregion;
 using path_shapes::circle;
 using path_shapes::kPi;
 using path_shapes::polygon;

@@ -8,7 +8,7 @@
 #include "region/model/Placement.h"
 #include "tests/support/PathShapes.h"
 
-using namespace gmpath;
+using namespace gmregion;
 using path_shapes::circle;
 using path_shapes::polygon;
 using path_shapes::rectangle;

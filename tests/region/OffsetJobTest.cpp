@@ -2,11 +2,10 @@
 
 #include <gtest/gtest.h>
 
-#include "region/model/Measure.h"
 #include "region/offset/CheckedOffset.h"
 #include "tests/support/PathShapes.h"
 
-using namespace gmpath;
+using namespace gmregion;
 using path_shapes::circle;
 using path_shapes::kPi;
 using path_shapes::polygon;

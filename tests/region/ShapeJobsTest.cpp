@@ -4,10 +4,10 @@
 
 #include "region/boolean/MeltJob.h"
 #include "region/corners/CornerJob.h"
-#include "region/model/Measure.h"
+#include "region/model/Area.h"
 #include "tests/support/PathShapes.h"
 
-using namespace gmpath;
+using namespace gmregion;
 using path_shapes::circle;
 using path_shapes::kPi;
 using path_shapes::polygon;

@@ -5,7 +5,7 @@
 #include <set>
 #include <sstream>
 
-using namespace gmpath;
+using namespace gmregion;
 
 namespace {
 

@@ -8,12 +8,12 @@
 /// A move of a program, with positions as the machine takes them.
 struct GcodeMove {
     int kind = 0;  ///< 0 rapid, 1 straight, 2 clockwise, 3 counter-clockwise
-    gmpath::Vec2 from, to, centre;
+    gmregion::Vec2 from, to, centre;
     double fromZ = 0.0, toZ = 0.0;
 
     bool cuts() const { return kind != 0 && !(from == to); }
     /// Points along the move, both ends included, at most `step` apart.
-    std::vector<gmpath::Vec2> points(double step) const;
+    std::vector<gmregion::Vec2> points(double step) const;
 };
 
 /// What a machine makes of a program, and what it would object to.

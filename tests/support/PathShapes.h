@@ -7,10 +7,10 @@
 /// Paths for tests.
 namespace path_shapes {
 
-using gmpath::kPi;
+using gmregion::kPi;
 
-inline gmpath::Path polygon(const std::vector<gmpath::Vec2>& corners, bool closed = true) {
-    gmpath::Path path{{}, closed, "0"};
+inline gmregion::Path polygon(const std::vector<gmregion::Vec2>& corners, bool closed = true) {
+    gmregion::Path path{{}, closed, "0"};
     for (std::size_t i = 0; i + 1 < corners.size(); ++i) {
         path.elements.push_back({corners[i], corners[i + 1]});
     }
@@ -19,13 +19,13 @@ inline gmpath::Path polygon(const std::vector<gmpath::Vec2>& corners, bool close
 }
 
 /// Counter-clockwise from the lower left corner.
-inline gmpath::Path rectangle(gmpath::Vec2 low, gmpath::Vec2 high) {
+inline gmregion::Path rectangle(gmregion::Vec2 low, gmregion::Vec2 high) {
     return polygon({low, {high.x, low.y}, high, {low.x, high.y}});
 }
 
-inline gmpath::Path circle(gmpath::Vec2 m, double r) {
-    gmpath::Path path{{}, true, "0"};
-    gmpath::appendArc(path.elements, m, r, 0.0, 2.0 * kPi);
+inline gmregion::Path circle(gmregion::Vec2 m, double r) {
+    gmregion::Path path{{}, true, "0"};
+    gmregion::appendArc(path.elements, m, r, 0.0, 2.0 * kPi);
     return path;
 }
 

@@ -1,18 +1,16 @@
-#include "drawing/dxf/DrawingUnits.h"
+#include "machining/gcode/MachineUnits.h"
 
 #include <array>
-#include <optional>
 #include <string>
 
 #include "drawing/InputError.h"
-#include "drawing/Text.h"
 
-namespace gmpath {
+namespace gmmachining {
+
+using gmdrawing::DrawingUnits;
+using gmdrawing::InputError;
 
 namespace {
-
-constexpr int kVariableNameCode = 9;
-constexpr int kIntegerCode = 70;
 
 constexpr int kInchCode = 1;
 constexpr int kMillimetreCode = 4;
@@ -40,15 +38,6 @@ constexpr std::array<const char*, 21> kUnitNames = {"no unit",
                                                     "light years",
                                                     "parsecs"};
 
-std::optional<int> headerInteger(const std::vector<DxfGroup>& groups, std::string_view name) {
-    for (std::size_t i = 1; i < groups.size(); ++i) {
-        const DxfGroup& variable = groups[i - 1];
-        if (variable.code != kVariableNameCode || trimmed(variable.value) != name) continue;
-        if (groups[i].code == kIntegerCode) return parseInteger(groups[i].value);
-    }
-    return std::nullopt;
-}
-
 std::string unitName(int code) {
     const auto index = static_cast<std::size_t>(code);
     if (code < 0 || index >= kUnitNames.size()) return "unit " + std::to_string(code);
@@ -56,11 +45,6 @@ std::string unitName(int code) {
 }
 
 }  // namespace
-
-DrawingUnits drawingUnits(const std::vector<DxfGroup>& groups) {
-    return {headerInteger(groups, "$INSUNITS").value_or(0),
-            headerInteger(groups, "$MEASUREMENT").value_or(1) == 0};
-}
 
 Units machineUnits(const DrawingUnits& drawing) {
     if (drawing.code == kInchCode) return Units::kInches;
@@ -70,4 +54,4 @@ Units machineUnits(const DrawingUnits& drawing) {
                      ": give --units, and --scale to get there");
 }
 
-}  // namespace gmpath
+}  // namespace gmmachining

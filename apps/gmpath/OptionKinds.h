@@ -3,8 +3,21 @@
 #include <CLI/CLI.hpp>
 #include <map>
 #include <string>
+#include <vector>
 
 namespace gmpath {
+
+/// Numbers beyond this leave the plane in which the kernel can tell points apart.
+constexpr double kLargestNumber = 1e9;
+
+/// Check for an option: a positive finite number up to 1e9. It does not show in the help.
+CLI::Validator positiveNumber();
+
+/// The same for a number from `low` to 1e9.
+CLI::Validator numberFrom(double low);
+
+/// The same for an angle in degrees above 0, up to `largest`.
+CLI::Validator angleUpTo(double largest);
 
 /// Adds an option whose values have names; anything but the names is refused. `value` and `names`
 /// are used when the command line is parsed.
@@ -17,5 +30,9 @@ CLI::Option* addNamedOption(CLI::App& command, const std::string& option, Target
         ->check(CLI::IsMember(&names).description(""))
         ->type_name("NAME");
 }
+
+/// Adds the option for the files to write, of which there is at least one.
+void addOutputs(CLI::App& command, std::vector<std::string>& outputs,
+                const std::string& description = "output file (.svg or .dxf), repeatable");
 
 }  // namespace gmpath

@@ -2,7 +2,7 @@
 
 #include "region/model/Path.h"
 
-namespace gmpath {
+namespace gmregion {
 
 /// Axis-parallel box. Starts empty: `low` above `high`.
 struct Box {
@@ -28,23 +28,4 @@ struct Box {
 Box boundingBox(const Element& e);
 Box boundingBox(const Path& path);
 
-/// Area enclosed by a closed path, exact for arcs: positive when it runs counter-clockwise. Regions
-/// that the path runs round twice count twice. An open path is taken as closed by its chord.
-double signedArea(const Path& path);
-
-/// Sense in which a closed path runs round what it encloses.
-enum class Sense {
-    kNone,              ///< open, or encloses nothing beyond rounding
-    kCounterClockwise,  ///< the inside lies on the left
-    kClockwise          ///< the inside lies on the right
-};
-
-/// Sense by the sign of the exact area; kNone for open paths and where the area vanishes in
-/// comparison with the length.
-Sense sense(const Path& path);
-
-/// How often a closed path runs round p, counter-clockwise positive. 0 means outside. Points on
-/// the path itself count to one of the sides that meet there.
-int windingNumber(const Path& path, Vec2 p);
-
-}  // namespace gmpath
+}  // namespace gmregion

@@ -1,11 +1,12 @@
-#include "region/corners/CornerRoom.h"
+#include "region/bridge/CornerRoom.h"
 
 #include <algorithm>
 
 #include "gmkernel/GmRect.h"
 #include "region/bridge/PathConversion.h"
+#include "region/model/Winding.h"
 
-namespace gmpath {
+namespace gmregion {
 
 namespace {
 
@@ -66,4 +67,4 @@ bool CornerRoom::cutsOff(const GmCurve& element, Vec2 corner) const {
                        [&](Vec2 p) { return windingNumber(region, p) != 0; });
 }
 
-}  // namespace gmpath
+}  // namespace gmregion

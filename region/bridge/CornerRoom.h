@@ -5,9 +5,9 @@
 #include <vector>
 
 #include "gmkernel/GmContour.h"
-#include "region/model/Measure.h"
+#include "region/model/Box.h"
 
-namespace gmpath {
+namespace gmregion {
 
 /// Tells whether the corners of a contour may be cut off without touching anything else: the rest
 /// of the contour and the other contours of the drawing.
@@ -34,4 +34,4 @@ private:
     std::vector<Vec2> m_starts;         ///< a point of each of the other contours
 };
 
-}  // namespace gmpath
+}  // namespace gmregion

@@ -1,0 +1,42 @@
+#include "drawing/dxf/BlockPlacement.h"
+
+#include <cmath>
+
+namespace gmdrawing {
+
+using gmregion::Placement;
+using gmregion::Vec2;
+
+namespace {
+
+/// Scale factors that differ by less, in relation, count as equal.
+constexpr double kUniformTolerance = 1e-6;
+
+/// The scale with both factors of exactly one size; nothing when they differ or are 0.
+std::optional<Vec2> uniform(Vec2 scale) {
+    const double size = std::abs(scale.x);
+    if (size == 0.0 || std::abs(std::abs(scale.y) - size) > kUniformTolerance * size) {
+        return std::nullopt;
+    }
+    return Vec2{scale.x, std::copysign(size, scale.y)};
+}
+
+}  // namespace
+
+std::optional<Placement> blockPlacement(const BlockReference& reference, Vec2 base, int column,
+                                        int row) {
+    const std::optional<Vec2> scale = uniform(reference.scale);
+    if (!scale) return std::nullopt;
+    const Vec2 along{std::cos(reference.angle), std::sin(reference.angle)};
+    const Vec2 across{-along.y, along.x};
+    const Vec2 xAxis = scale->x * along;
+    const Vec2 yAxis = scale->y * across;
+    const Vec2 cell = reference.at + (column * reference.spacing.x) * along +
+                      (row * reference.spacing.y) * across;
+    const Vec2 origin = Placement::toAxes(cell, xAxis, yAxis).apply(Vec2{-base.x, -base.y});
+    const Placement placement = Placement::toAxes(origin, xAxis, yAxis);
+    if (!reference.mirrored) return placement;
+    return Placement::toAxes({}, {-1.0, 0.0}, {0.0, 1.0}).after(placement);
+}
+
+}  // namespace gmdrawing

@@ -1,0 +1,18 @@
+#pragma once
+
+#include "region/model/Element.h"
+
+namespace gmregion {
+
+/// Elements below this length, over which the kernel joins pieces, may tear its results.
+constexpr double kShortestForKernel = 3.0 * kKernelTolerance;
+
+/// Why a path has no place in the kernel.
+enum class Refusal {
+    kNone,         ///< it has
+    kTooSmall,     ///< an element is shorter than the kernel's tolerance, or no number
+    kJoint,        ///< an arc too flat, or too far from the origin, misses its neighbour
+    kTouchesStart  ///< an open path comes back to its start, within the tolerance
+};
+
+}  // namespace gmregion
