@@ -53,14 +53,15 @@ SvgPage::SvgPage(const Box& drawn)
 
 void SvgPage::begin(const std::string& rules, std::vector<SvgLegendEntry> legend) {
     const Box page = m_drawn.grown(kMarginFraction * m_diagonal);
+    // A page is no wider than its diagonal, so that there are but a few entries a line.
     const double fitting = m_drawn.size().x / (kEntryWidth * m_legendSize);
-    constexpr double kMost = 100.0;
-    m_perLine = fitting > 1.0 ? static_cast<std::size_t>(std::min(fitting, kMost)) : 1;
-    legend.resize(std::min(legend.size(), kMostLegendLines * m_perLine));
+    m_perLine = fitting > 1.0 ? static_cast<std::size_t>(fitting) : 1;
     m_legend = std::move(legend);
-    const auto lines = static_cast<double>((m_legend.size() + m_perLine - 1) / m_perLine);
+    m_legend.resize(std::min(m_legend.size(), kMostLegendLines * m_perLine));
+    const std::size_t lines = (m_legend.size() + m_perLine - 1) / m_perLine;
+    const double legendHeight = (0.5 + kLineHeight * static_cast<double>(lines)) * m_legendSize;
     const double width = std::max(page.size().x, (kEntryWidth + 1.0) * m_legendSize);
-    const double height = page.size().y + (0.5 + kLineHeight * lines) * m_legendSize;
+    const double height = page.size().y + legendHeight;
     const std::string box = svgNumbers({page.low.x, -page.high.y, width, height});
     m_svg.begin("svg", {{"xmlns", "http://www.w3.org/2000/svg"}, {"viewBox", box}});
     m_svg.style(kCommonRules + rules);
@@ -122,9 +123,10 @@ std::string SvgPage::finish() {
     const double top = m_drawn.low.y - kMarginFraction * m_diagonal - size;
     m_svg.begin("g", {{"id", "legend"}});
     for (std::size_t i = 0; i < m_legend.size(); ++i) {
-        const auto line = static_cast<double>(i / m_perLine);
-        const auto column = static_cast<double>(i % m_perLine);
-        const Vec2 at{m_drawn.low.x + column * kEntryWidth * size, top - line * kLineHeight * size};
+        const std::size_t line = i / m_perLine;
+        const std::size_t column = i % m_perLine;
+        const Vec2 at{m_drawn.low.x + static_cast<double>(column) * kEntryWidth * size,
+                      top - static_cast<double>(line) * kLineHeight * size};
         text(at, size, {{"fill", m_legend[i].colour}}, m_legend[i].text);
     }
     return "<?xml version=\"1.0\" encoding=\"UTF-8\"?>\n" + m_svg.finish();
@@ -134,10 +136,7 @@ std::string svgPathData(const Path& path) {
     std::vector<SvgStep> steps;
     for (const Element& e : path.elements) {
         if (steps.empty()) steps.push_back({e.sp.x, -e.sp.y});
-        steps.push_back({e.ep.x, -e.ep.y});
-        // Turned downwards, a counter-clockwise arc runs against SVG's positive angles.
-        if (isArc(e))
-            steps.back() = {e.ep.x, -e.ep.y, radius(e), std::abs(sweep(e)) > kPi, e.bulge < 0.0};
+        steps.push_back({e.ep.x, -e.ep.y, radius(e), -sweep(e)});
     }
     return gmdrawing::svgPathData(steps, path.closed);
 }

@@ -1,5 +1,6 @@
 #include "drawing/svg/SvgWriter.h"
 
+#include <cmath>
 #include <utility>
 
 #include "drawing/Text.h"
@@ -7,6 +8,8 @@
 namespace gmdrawing {
 
 namespace {
+
+constexpr double kPi = 3.14159265358979323846;
 
 std::string escaped(std::string_view text) {
     return gmpath::xmlEscaped(gmpath::printable(text));
@@ -32,14 +35,14 @@ std::string svgNumbers(std::initializer_list<double> numbers) {
 std::string svgPathData(const std::vector<SvgStep>& steps, bool closed) {
     std::string data;
     for (const SvgStep& to : steps) {
-        if (to.r && !data.empty()) {
-            const double turnOfAxes = 0.0;
-            data += " A " +
-                    svgNumbers(
-                        {*to.r, *to.r, turnOfAxes, to.large ? 1.0 : 0.0, to.positive ? 1.0 : 0.0}) +
-                    " ";
+        if (data.empty()) {
+            data = "M ";
+        } else if (to.sweep == 0.0) {
+            data += " L ";
         } else {
-            data += data.empty() ? "M " : " L ";
+            data += " A " + svgNumbers({to.r, to.r}) + " 0 ";
+            data += std::abs(to.sweep) > kPi ? "1 " : "0 ";
+            data += to.sweep > 0.0 ? "1 " : "0 ";
         }
         data += svgNumbers({to.x, to.y});
     }

@@ -1,7 +1,6 @@
 #pragma once
 
 #include <initializer_list>
-#include <optional>
 #include <string>
 #include <string_view>
 #include <vector>
@@ -12,13 +11,12 @@ namespace gmdrawing {
 /// 1e-4 and from 1e12 on, no -0. What is not finite is a word, at which SVG stops reading a path.
 std::string svgNumbers(std::initializer_list<double> numbers);
 
-/// Where an element of a path leads, y downwards: a segment, or an arc when it has a radius.
+/// Where an element of a path leads, y downwards: a segment, or an arc when it turns.
 struct SvgStep {
     double x;
     double y;
-    std::optional<double> r = {};
-    bool large = false;     ///< the arc turns by more than a half
-    bool positive = false;  ///< the arc turns from x to y, clockwise on the screen
+    double r = 0.0;
+    double sweep = 0.0;  ///< in radians, positive from x to y, clockwise on the screen
 };
 
 /// The data of a path that begins in the first step. SVG leaves out arcs that end where they start.

@@ -27,8 +27,6 @@ constexpr double kLegendSample = 28.0;
 constexpr double kHalfCapital = 4.5;  // lowers a text so that it centres on a point
 constexpr double kLegendGap = 8.0;
 
-constexpr double kPi = 3.14159265358979323846;
-
 constexpr const char* kStyleSheet =
     "path { fill: none; stroke-linejoin: round; stroke-linecap: round; }\n"
     "text { font: 13px sans-serif; fill: #212529; }\n"
@@ -106,16 +104,16 @@ private:
         if (steps.empty()) steps.push_back(at(element.SP()));
         if (!element.IsArc()) return steps.push_back(at(element.EP()));
         const auto& arc = static_cast<const GmArc&>(element);
-        // SVG leaves out an arc that ends where it starts, so a full circle has two halves.
-        const bool full = arc.IsFullCircle();
-        if (full) steps.push_back(arcTo(GmPoint(arc.M() + (arc.M() - arc.SP())), arc, false));
-        steps.push_back(arcTo(arc.EP(), arc, !full && arc.Ang() > kPi));
-    }
-
-    /// With y pointing down the clockwise sense is the one that SVG calls positive.
-    SvgStep arcTo(const GmPoint& p, const GmArc& arc, bool large) const {
-        const SvgStep to = at(p);
-        return {to.x, to.y, rounded(m_scale * arc.R()), large, arc.Dir() == GmBase::eRotCW};
+        SvgStep to = at(arc.EP());
+        to.r = rounded(m_scale * arc.R());
+        to.sweep = arc.Dir() == GmBase::eRotCW ? arc.Ang2Pi() : -arc.Ang2Pi();  // y points down
+        if (arc.IsFullCircle()) {
+            // SVG leaves out an arc that ends where it starts, so a full circle has two halves.
+            const SvgStep half = at(GmPoint(arc.M() + (arc.M() - arc.SP())));
+            to.sweep *= 0.5;
+            steps.push_back({half.x, half.y, to.r, to.sweep});
+        }
+        steps.push_back(to);
     }
 
     GmRect m_box;

@@ -39,6 +39,6 @@ TEST(SvgWriter, PathsOfFewSteps) {
     EXPECT_EQ(svgPathData({}, true), "");
     EXPECT_EQ(svgPathData({{1, -0.0}}, true), "M 1 0 Z");
     // An arc of no radius stays an arc; nothing turns into the start.
-    EXPECT_EQ(svgPathData({{0, 0, 5.0}, {1, 2, 0.0, true, false}, {3, 4}}, false),
+    EXPECT_EQ(svgPathData({{0, 0, 5, 1}, {1, 2, 0, -4}, {3, 4, HUGE_VAL, 0}}, false),
               "M 0 0 A 0 0 0 1 0 1 2 L 3 4");
 }
