@@ -93,29 +93,6 @@ std::string printable(std::string_view text) {
     return result;
 }
 
-std::string xmlEscaped(std::string_view text) {
-    std::string result;
-    for (const char c : text) {
-        switch (c) {
-            case '&':
-                result += "&amp;";
-                break;
-            case '<':
-                result += "&lt;";
-                break;
-            case '>':
-                result += "&gt;";
-                break;
-            case '"':
-                result += "&quot;";
-                break;
-            default:
-                result += c;
-        }
-    }
-    return result;
-}
-
 std::size_t characterCount(std::string_view text) {
     const std::string shown = printable(text);
     return static_cast<std::size_t>(utf8::distance(shown.begin(), shown.end()));

@@ -27,9 +27,6 @@ std::string formatFixed(double value, int decimals);
 /// that names from a drawing can go to a terminal or into XML.
 std::string printable(std::string_view text);
 
-/// The text with the characters escaped that mean something in XML. Expects printable text.
-std::string xmlEscaped(std::string_view text);
-
 /// Number of characters of UTF-8 text as `printable` shows it.
 std::size_t characterCount(std::string_view text);
 

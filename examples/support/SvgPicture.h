@@ -4,10 +4,10 @@
 
 #include <memory>
 #include <string>
+#include <utility>
 #include <vector>
 
 #include "gmkernel/GmCurve.h"
-#include "gmkernel/GmDir.h"
 #include "gmkernel/GmPoint.h"
 #include "gmkernel/GmRect.h"
 
@@ -23,14 +23,14 @@ enum class Style {
 
 /// Collects curves and marked points and writes them as one SVG picture of fixed width, y up.
 ///
-/// The picture shows the bounding boxes of the curves and of the marks, of lines and beams that of
-/// their start; these run on to its edge. The legend stands below it, in the order in which its
-/// texts came.
+/// The picture shows the bounding boxes of the curves and of the marks, of lines that of their
+/// start; these run on to its edge. The legend stands below it, in the order in which its texts
+/// came.
 class SvgPicture {
 public:
-    /// Keeps a copy of a segment, arc, circle, line, beam or contour; other curves are not drawn.
+    /// Keeps a copy of a segment, arc, circle, line or contour; other curves are not drawn.
     void add(const GmCurve& curve, Style style);
-    /// Explains a style: one line of text without markup characters.
+    /// Explains a style: one line of text.
     void legend(Style style, const std::string& text);
     /// A dot.
     void mark(const GmPoint& p, Style style);
@@ -40,28 +40,13 @@ public:
     bool save(const std::string& fileName) const;
 
 private:
-    struct DrawnCurve {
-        std::unique_ptr<GmCurve> curve;
-        Style style;
-    };
-    struct Mark {
-        GmPoint p;
-        Style style;
-    };
-    struct ArrowHead {
-        GmPoint tip;
-        GmDir along;
-        Style style;
-    };
-    struct LegendEntry {
-        Style style;
-        std::string text;
-    };
+    template <typename T>
+    using Styled = std::pair<T, Style>;
 
-    std::vector<DrawnCurve> m_curves;
-    std::vector<Mark> m_marks;
-    std::vector<ArrowHead> m_arrows;
-    std::vector<LegendEntry> m_legend;
+    std::vector<Styled<std::unique_ptr<GmCurve>>> m_curves;
+    std::vector<Styled<std::unique_ptr<GmCurve>>> m_arrows;
+    std::vector<Styled<GmPoint>> m_marks;
+    std::vector<Styled<std::string>> m_legend;
     GmRect m_box;
 };
 

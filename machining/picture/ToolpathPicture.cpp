@@ -2,17 +2,13 @@
 
 #include <algorithm>
 
-#include "drawing/Text.h"
 #include "drawing/svg/SvgPage.h"
-#include "drawing/svg/SvgSymbols.h"
 
 namespace gmmachining {
 
-using gmdrawing::formatReal;
-using gmdrawing::startMark;
 using gmdrawing::SvgLegendEntry;
 using gmdrawing::SvgPage;
-using gmdrawing::svgPathTag;
+using gmdrawing::svgRule;
 using gmregion::Box;
 using gmregion::Path;
 using gmregion::Vec2;
@@ -46,112 +42,79 @@ Box boxOf(const std::vector<Path>& contours, const ToolpathResult& result) {
     return box;
 }
 
-double lowestLevel(const Toolpath& moves) {
+std::vector<SvgLegendEntry> legendOf(const ToolpathResult& result) {
+    std::vector<SvgLegendEntry> legend = {{"part", kSourceColour},
+                                          {"cuts", kCutColour},
+                                          {"leads", kLeadColour},
+                                          {"rapid moves", kRapidColour}};
+    const bool doubtful = std::any_of(result.contours.begin(), result.contours.end(),
+                                      [](const ContourCut& cut) { return !cut.doubtful.empty(); });
+    if (doubtful) legend.insert(legend.begin() + 1, {"dashed: faulty", kSourceColour});
+    return legend;
+}
+
+/// Where strokes can keep their width they do; elsewhere it follows the size of the drawing.
+std::string styleRules(double diagonal) {
+    const auto stroke = [&](const char* name, const char* colour, double width) {
+        return svgRule(name, {{"stroke", colour}, {"stroke-width", width * diagonal}});
+    };
+    return stroke(".source", kSourceColour, kStroke) + stroke(".cut", kCutColour, kStroke) +
+           stroke(".lead", kLeadColour, kStroke) + stroke(".rapid", kRapidColour, kThinStroke) +
+           svgRule(".rapid", {{"stroke-dasharray", kDash * diagonal}}) +
+           svgRule(".cut-mark", {{"fill", kCutColour}}) +
+           stroke(".doubtful", kSourceColour, kThinStroke) +
+           svgRule(".doubtful", {{"stroke-dasharray", kShortDash * diagonal}}) +
+           stroke(".plunge", kLeadColour, kThinStroke) +
+           ".plunge { fill: none; }\n"
+           "@supports (vector-effect: non-scaling-stroke) {\n"
+           "path, circle { vector-effect: non-scaling-stroke; }\n"
+           ".source, .cut, .lead { stroke-width: 1.5px; }\n"
+           ".rapid { stroke-width: 0.8px; stroke-dasharray: 6px; }\n"
+           ".doubtful { stroke-width: 1.2px; stroke-dasharray: 5px; }\n"
+           ".plunge { stroke-width: 0.8px; }\n}\n";
+}
+
+/// A move in the material, which begins where the tool is.
+void drawInMaterial(SvgPage& page, const Move& move, Vec2 place) {
+    if (move.kind == MoveKind::kPlunge) {
+        page.circle(place, kPlungeRadius * page.diagonal(), "plunge");
+    } else if (move.kind == MoveKind::kLead) {
+        page.draw(move.path, "lead");
+    } else {
+        page.draw(move.path, "cut");
+        page.startMark(move.path, "cut-mark");
+    }
+}
+
+void drawMoves(SvgPage& page, const Toolpath& moves) {
     double lowest = 0.0;
     for (const Move& move : moves)
         lowest = std::min(lowest, move.z);
-    return lowest;
+    Vec2 place;
+    for (const Move& move : moves) {
+        const bool goesOn = !move.path.elements.empty();
+        if (move.kind != MoveKind::kRapid) {
+            if (move.z == lowest) drawInMaterial(page, move, place);
+        } else if (goesOn) {
+            page.draw(move.path, "rapid");
+        }
+        if (goesOn) place = move.path.elements.back().ep;
+    }
 }
-
-class ToolpathSvg {
-public:
-    ToolpathSvg(const std::vector<Path>& contours, const ToolpathResult& result)
-        : m_contours(contours),
-          m_result(result),
-          m_lowest(lowestLevel(result.moves)),
-          m_page(boxOf(contours, result)) {}
-
-    std::string run() {
-        for (const Path& contour : m_contours)
-            m_svg += svgPathTag(contour, "source");
-        for (const Move& move : m_result.moves)
-            draw(move);
-        std::vector<SvgLegendEntry> legend = {{"part", kSourceColour},
-                                              {"cuts", kCutColour},
-                                              {"leads", kLeadColour},
-                                              {"rapid moves", kRapidColour}};
-        if (drawDoubtful()) legend.insert(legend.begin() + 1, {"dashed: faulty", kSourceColour});
-        return m_page.picture(styleRules(), m_svg, legend);
-    }
-
-private:
-    std::string strokeRule(const std::string& name, const std::string& colour, double width) const {
-        return "." + name + " { stroke: " + colour +
-               "; stroke-width: " + formatReal(width * m_page.diagonal()) + "; }\n";
-    }
-
-    /// Where strokes can keep their width they do; elsewhere it follows the size of the drawing.
-    std::string styleRules() const {
-        return strokeRule("source", kSourceColour, kStroke) +
-               strokeRule("cut", kCutColour, kStroke) + strokeRule("lead", kLeadColour, kStroke) +
-               strokeRule("rapid", kRapidColour, kThinStroke) +
-               ".rapid { stroke-dasharray: " + formatReal(kDash * m_page.diagonal()) +
-               "; }\n.cut-mark { fill: " + kCutColour + "; }\n" +
-               strokeRule("doubtful", kSourceColour, kThinStroke) +
-               ".doubtful { stroke-dasharray: " + formatReal(kShortDash * m_page.diagonal()) +
-               "; }\n" + strokeRule("plunge", kLeadColour, kThinStroke) +
-               ".plunge { fill: none; }\n"
-               "@supports (vector-effect: non-scaling-stroke) {\n"
-               "path, circle { vector-effect: non-scaling-stroke; }\n"
-               ".source, .cut, .lead { stroke-width: 1.5px; }\n"
-               ".rapid { stroke-width: 0.8px; stroke-dasharray: 6px; }\n"
-               ".doubtful { stroke-width: 1.2px; stroke-dasharray: 5px; }\n"
-               ".plunge { stroke-width: 0.8px; }\n}\n";
-    }
-
-    void draw(const Move& move) {
-        switch (move.kind) {
-            case MoveKind::kRapid:
-                if (!move.path.elements.empty()) m_svg += svgPathTag(move.path, "rapid");
-                break;
-            case MoveKind::kPlunge:
-                if (move.z == m_lowest) drawPlunge();
-                break;
-            case MoveKind::kLead:
-                if (move.z == m_lowest) m_svg += svgPathTag(move.path, "lead");
-                break;
-            case MoveKind::kCut:
-                if (move.z == m_lowest) drawCut(move.path);
-                break;
-        }
-        if (!move.path.elements.empty()) m_place = move.path.elements.back().ep;
-    }
-
-    /// Offsets that are not cut because they have a fault; false when there is none.
-    bool drawDoubtful() {
-        bool any = false;
-        for (const ContourCut& cut : m_result.contours) {
-            for (const Path& path : cut.doubtful) {
-                m_svg += svgPathTag(path, "doubtful");
-                any = true;
-            }
-        }
-        return any;
-    }
-
-    void drawPlunge() {
-        m_svg += "<circle class=\"plunge\" cx=\"" + formatReal(m_place.x) + "\" cy=\"" +
-                 formatReal(-m_place.y) + "\" r=\"" +
-                 formatReal(kPlungeRadius * m_page.diagonal()) + "\"/>\n";
-    }
-
-    void drawCut(const Path& path) {
-        m_svg += svgPathTag(path, "cut");
-        m_svg += startMark(path, "cut-mark", m_page.diagonal());
-    }
-
-    const std::vector<Path>& m_contours;
-    const ToolpathResult& m_result;
-    double m_lowest;
-    SvgPage m_page;
-    Vec2 m_place;
-    std::string m_svg;
-};
 
 }  // namespace
 
 std::string svgOf(const std::vector<Path>& contours, const ToolpathResult& result) {
-    return ToolpathSvg(contours, result).run();
+    SvgPage page(boxOf(contours, result));
+    page.begin(styleRules(page.diagonal()), legendOf(result));
+    for (const Path& contour : contours)
+        page.draw(contour, "source");
+    drawMoves(page, result.moves);
+    for (const ContourCut& cut : result.contours) {
+        for (const Path& path : cut.doubtful)
+            page.draw(path, "doubtful");
+    }
+    return page.finish();
 }
 
 }  // namespace gmmachining

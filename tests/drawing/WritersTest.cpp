@@ -75,7 +75,7 @@ TEST(DxfWriter, GeometryIsReadBack) {
     }
 }
 
-TEST(SvgWriter, PathDataEndsWhereTheElementsEnd) {
+TEST(SvgPicture, PathDataEndsWhereTheElementsEnd) {
     for (const Path& path : someContours()) {
         const std::string data = svgPathData(path);
         const std::vector<Vec2> ends = commandEnds(data);
@@ -92,7 +92,7 @@ TEST(SvgWriter, PathDataEndsWhereTheElementsEnd) {
               "M 1 0 A 1 1 0 1 1 0 -1");
 }
 
-TEST(SvgWriter, PictureIsWellFormedAndFits) {
+TEST(SvgPicture, PictureIsWellFormedAndFits) {
     const Sample sample;
     const std::string svg = svgOf(sample.drawing());
     // Every tag is closed in order, and the layer's name did not open one.
