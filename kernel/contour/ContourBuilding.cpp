@@ -2,6 +2,7 @@
 
 #include "gmkernel/GmContour.h"
 #include "kernel/contour/ContourElements.h"
+#include "kernel/values/HandedOver.h"
 
 using gmkernel_detail::ChainEnd;
 using gmkernel_detail::ChainStart;
@@ -20,8 +21,8 @@ struct ElementHolder {
         : curve(c.Clone()), record(new GmContElement{curve.get(), id, index, bInserted}) {}
 
     void Release() {
-        curve.release();
-        record.release();
+        gmkernel_detail::handedOver(curve);
+        gmkernel_detail::handedOver(record);
     }
 };
 

@@ -1,12 +1,14 @@
 #include "kernel/contour/GmContourArray.h"
 
+#include "kernel/values/HandedOver.h"
+
 void GmContourArray::Add(GmContour* contour) {
     m_entries.Add(contour);
 }
 
 void GmContourArray::Take(std::unique_ptr<GmContour> contour) {
     Add(contour.get());
-    static_cast<void>(contour.release());
+    gmkernel_detail::handedOver(contour);
 }
 
 int GmContourArray::GetCount() const {

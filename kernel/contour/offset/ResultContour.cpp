@@ -5,6 +5,7 @@
 #include "gmkernel/GmContElement.h"
 #include "gmkernel/GmStretch.h"
 #include "kernel/contour/ContourElements.h"
+#include "kernel/values/HandedOver.h"
 
 namespace gmkernel_detail {
 
@@ -17,9 +18,8 @@ void append(GmContour& contour, std::unique_ptr<GmCurve> curve, int id, bool ins
     record->lIndex = contour.ElementCount();
     record->bInserted = inserted;
     if (!contour.AddElement(record.get(), false)) return;
-    // The contour owns both now.
-    static_cast<void>(curve.release());
-    static_cast<void>(record.release());
+    handedOver(curve);
+    handedOver(record);
 }
 
 void bridgeGap(GmContour& contour, GmPoint const& to, int id) {

@@ -6,6 +6,7 @@
 #include "gmkernel/GmContour.h"
 #include "gmkernel/GmStretch.h"
 #include "kernel/contour/transitions/FilletCircle.h"
+#include "kernel/values/HandedOver.h"
 
 namespace {
 
@@ -54,8 +55,8 @@ void GmContour::RoundCorners(double dRadius, int nMode) {
         cur.SetSP(fillet.end);
         std::unique_ptr<GmContElement> record(CreateContElement(fillet.arc.get(), j, j, true));
         m_pElements->InsertAt(j, record.get());
-        static_cast<void>(record.release());
-        static_cast<void>(fillet.arc.release());
+        gmkernel_detail::handedOver(record);
+        gmkernel_detail::handedOver(fillet.arc);
         ++j;
         ++corners;
     }

@@ -1,5 +1,7 @@
 #include "kernel/contour/variable_offset/CurveList.h"
 
+#include "kernel/values/HandedOver.h"
+
 namespace gmkernel_detail {
 
 CurveList::~CurveList() {
@@ -23,7 +25,7 @@ void CurveList::Add(std::unique_ptr<GmCurve> curve) {
 
 void CurveList::Insert(std::unique_ptr<GmCurve> curve, int index) {
     m_entries.Insert(curve.get(), static_cast<size_t>(index));
-    static_cast<void>(curve.release());
+    handedOver(curve);
 }
 
 void CurveList::RemoveAt(int index) {

@@ -5,6 +5,7 @@
 
 #include "gmkernel/GmArc.h"
 #include "gmkernel/GmContour.h"
+#include "kernel/values/HandedOver.h"
 
 namespace {
 
@@ -110,8 +111,8 @@ bool GmContour::SplitElement(int index, GmPoint const& p) {
     std::unique_ptr<GmContElement> record(
         CreateContElement(rest.get(), source.lId, source.lIndex, true));
     m_pElements->InsertAt(index + 1, record.get());
-    static_cast<void>(record.release());
-    static_cast<void>(rest.release());
+    gmkernel_detail::handedOver(record);
+    gmkernel_detail::handedOver(rest);
     source.pCurve->SetEP(p);
     return true;
 }
