@@ -1,4 +1,3 @@
-#include "gmkernel/GmArc.h"
 #include "gmkernel/GmContour.h"
 #include "gmkernel/GmRect.h"
 #include "gmkernel/GmStretch.h"
@@ -10,36 +9,27 @@
 
 namespace {
 
+/// Where a point lies.
 enum class Location {
-    eOnContour,  // some element contains the point
-    eOutside,    // not strictly inside the bounding rectangle, or an even number of crossings
-    eInside      // an odd number of crossings
+    kOnContour,  ///< some element contains the point
+    kOutside,    ///< not strictly inside the bounding rectangle, or an even number of crossings
+    kInside      ///< an odd number of crossings
 };
 
-Location Locate(GmContour const& contour, GmPoint const& p) {
-    if (contour.Element(p)) return Location::eOnContour;
-    if (!contour.BoundingRect().In(p)) return Location::eOutside;
-    const GmPoint middle = gmkernel_detail::MiddleOf(contour.GetElement(0));
+Location locate(GmContour const& contour, GmPoint const& p) {
+    if (contour.Element(p)) return Location::kOnContour;
+    if (!contour.BoundingRect().In(p)) return Location::kOutside;
+    const GmPoint middle = gmkernel_detail::middleOf(contour.GetElement(0));
     const GmStretch probe(p, GmPoint(p + 2.0 * (middle - p)));
-    return contour.Intersection(&probe) % 2 != 0 ? Location::eInside : Location::eOutside;
+    return contour.Intersection(&probe) % 2 != 0 ? Location::kInside : Location::kOutside;
 }
 
 }  // namespace
 
-GmPoint gmkernel_detail::MiddleOf(GmCurve const* element) {
-    if (element && element->IsStretch()) return static_cast<GmStretch const&>(*element).HP();
-    if (element && element->IsArc()) return static_cast<GmArc const&>(*element).HP();
-    return GmPoint();
-}
-
 bool GmContour::In(GmPoint const& p) {
-    return Locate(*this, p) == Location::eInside;
+    return locate(*this, p) == Location::kInside;
 }
 
 bool GmContour::Out(GmPoint const& p) {
-    return Locate(*this, p) == Location::eOutside;
-}
-
-GmPoint GmContour::GetHP(int index) {
-    return gmkernel_detail::MiddleOf(GetElement(index));
+    return locate(*this, p) == Location::kOutside;
 }

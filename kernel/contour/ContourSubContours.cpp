@@ -6,11 +6,11 @@
 #include "kernel/contour/ContourElements.h"
 #include "kernel/contour/GmContourArray.h"
 
-using gmkernel_detail::ChainStart;
+using gmkernel_detail::chainStart;
 
 namespace {
 
-bool Encloses(GmRect const& outer, GmRect const& inner) {
+bool encloses(GmRect const& outer, GmRect const& inner) {
     return outer.Or(inner) == outer;
 }
 
@@ -36,8 +36,8 @@ GmContour* GmContour::GetMaxSubContour() {
         GmContour* const candidate = (*m_pSubConts)[i];
         if (!candidate || candidate->ElementCount() == 0) continue;
         const GmRect candidateBox = candidate->BoundingRect();
-        if (largest && Encloses(box, candidateBox)) continue;
-        if (largest && !Encloses(candidateBox, box)) return nullptr;
+        if (largest && encloses(box, candidateBox)) continue;
+        if (largest && !encloses(candidateBox, box)) return nullptr;
         largest = candidate;
         box = candidateBox;
     }
@@ -50,7 +50,7 @@ GmContour* GmContour::GetNearSubContour(GmPoint const& p) {
     for (int i = 0; i < m_pSubConts->GetCount(); ++i) {
         GmContour* const candidate = (*m_pSubConts)[i];
         if (!candidate || candidate->ElementCount() == 0) continue;
-        const double candidateDist = p.Dist(ChainStart(*candidate));
+        const double candidateDist = p.Dist(chainStart(*candidate));
         if (nearest && !(candidateDist < dist)) continue;
         nearest = candidate;
         dist = candidateDist;

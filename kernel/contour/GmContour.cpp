@@ -9,8 +9,8 @@
 
 namespace {
 
-// What does not join is left out, as the result of AddElement() says.
-void AppendClones(GmContour& target, GmContour const& source) {
+/// What does not join is left out, as the result of AddElement() says.
+void appendClones(GmContour& target, GmContour const& source) {
     for (int i = 0; i < source.ElementCount(); ++i) {
         target.AddElement(source.GetElement(i), false, 0);
     }
@@ -29,7 +29,7 @@ GmContour::GmContour() : m_pElements(nullptr), m_bClosed(false), m_pSubConts(nul
 // Delegates, so that the destructor cleans up when cloning an element throws.
 GmContour::GmContour(GmContour const& source) : GmContour() {
     GmCurve::operator=(source);
-    AppendClones(*this, source);
+    appendClones(*this, source);
 }
 
 GmContour::~GmContour() {

@@ -16,7 +16,7 @@ struct Piece {
     /// To be called when the curve has changed.
     void measure() {
         reach = reachOf(element.curve());
-        halving = MiddleOf(&element.curve());
+        halving = middleOf(&element.curve());
         keepsDistance = false;
     }
 

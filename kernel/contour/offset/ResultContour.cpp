@@ -24,7 +24,7 @@ void append(GmContour& contour, std::unique_ptr<GmCurve> curve, int id, bool ins
 
 void bridgeGap(GmContour& contour, GmPoint const& to, int id) {
     if (contour.ElementCount() == 0) return;
-    const GmPoint from = ChainEnd(contour);
+    const GmPoint from = chainEnd(contour);
     if (from != to) append(contour, std::make_unique<GmStretch>(from, to), id, true);
 }
 

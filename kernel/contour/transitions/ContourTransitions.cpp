@@ -87,7 +87,7 @@ bool GmContour::AddTransBetween(eTransType type, GmCurve* first, GmCurve* second
     first->SetEP(transition.contacts.onFirst);
     second->SetSP(transition.contacts.onSecond);
     // Between the last and the first element the chain was open until now.
-    m_bClosed = gmkernel_detail::ChainEnd(*this) == gmkernel_detail::ChainStart(*this);
+    m_bClosed = gmkernel_detail::chainEnd(*this) == gmkernel_detail::chainStart(*this);
     return true;
 }
 
