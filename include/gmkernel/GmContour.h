@@ -430,7 +430,7 @@ private:
     /// Splits an element at a point of it other than its ends; false where there is no such point.
     GMKERNEL_NO_EXPORT bool SplitInside(int index, GmPoint const& p);
     int FindNextPoint(GmPoint p, GmCurve* curve, int index,
-                      KxArray<GmContIntPoint*, GmContIntPoint*> const& passages) const;
+                      KxArray<GmContIntPoint*, GmContIntPoint*> const& crossings) const;
     GmContour* GetSubContour_private(int index) const;
     /// Replaces the sub-contours by one copy of this chain that keeps the identifiers.
     void CopyContourToSubContour();
