@@ -70,8 +70,8 @@ public:
     /// A new curve that connects this curve's end with the start of `next`, owned by the caller:
     /// a stretch for mode 0, an arc leaving tangentially for mode 1; here null.
     virtual GmCurve* Concat(GmCurve const& next, int mode);
-    /// Extends or cuts this curve's end and the start of `next` to the crossing of their carriers;
-    /// moves the start of `next` although it is passed as constant.
+    /// Extends or cuts this curve's end and the start of `next` to the crossing of their supporting
+    /// lines and circles; moves the start of `next` although it is passed as constant.
     /// @return false, with nothing changed, when there is none; here always
     virtual bool Concat(GmCurve const& next);
     /// Reverses the sense in which the curve is travelled; here nothing.

@@ -143,13 +143,13 @@ double GmCircle::Dist(GmCircle const& circle) const {
 }
 
 int GmCircle::IntersectionWithLine(GmLine const& line) const {
-    const auto hits = gmkernel_detail::carrierHits(*this, line);
+    const auto hits = gmkernel_detail::supportHits(*this, line);
     m_ptSol.assign(hits.begin(), hits.end());
     return static_cast<int>(m_ptSol.size());
 }
 
 int GmCircle::IntersectionWithCircle(GmCircle const& circle) const {
-    const auto hits = gmkernel_detail::carrierHits(*this, circle);
+    const auto hits = gmkernel_detail::supportHits(*this, circle);
     m_ptSol.assign(hits.begin(), hits.end());
     return static_cast<int>(m_ptSol.size());
 }

@@ -65,9 +65,9 @@ GmLine::GmLine(GmLine const& line, double d) : GmLine() {
 
 GmLine::GmLine(GmLine const& a, GmLine const& b) : GmLine() {
     if (!a.CreationOK() || !b.CreationOK()) return;
-    const GmLine carrier(a);
-    if (carrier.IntersectionWithLine(b) > 0) {
-        Define(carrier.GetSolution(0), a.m_Dir.Sym(b.m_Dir));
+    const GmLine supportingLine(a);
+    if (supportingLine.IntersectionWithLine(b) > 0) {
+        Define(supportingLine.GetSolution(0), a.m_Dir.Sym(b.m_Dir));
     } else {
         Define(a.SP().Mean(b.SP()), a.m_Dir);
     }
@@ -184,7 +184,7 @@ int GmLine::PointPos(GmPoint const& p) const {
 }
 
 int GmLine::IntersectionWithLine(GmLine const& line) const {
-    const auto hits = gmkernel_detail::carrierHits(*this, line);
+    const auto hits = gmkernel_detail::supportHits(*this, line);
     m_ptSol.assign(hits.begin(), hits.end());
     return static_cast<int>(m_ptSol.size());
 }

@@ -74,16 +74,17 @@ GmCurve* GmStretch::Concat(GmCurve const& next, int mode) {
 }
 
 bool GmStretch::Concat(GmCurve const& next) {
-    const GmLine carrier(*this);
+    const GmLine supportingLine(*this);
     if (next.IsStretch()) {
-        if (carrier.IntersectionWithLine(static_cast<GmStretch const&>(next)) == 0) return false;
-        gmkernel_detail::joinAt(*this, next, carrier.GetSolution(0));
+        if (supportingLine.IntersectionWithLine(static_cast<GmStretch const&>(next)) == 0)
+            return false;
+        gmkernel_detail::joinAt(*this, next, supportingLine.GetSolution(0));
         return true;
     }
     if (!next.IsArc()) return false;
 
     const GmCircle circle(static_cast<GmArc const&>(next));
-    const int count = circle.IntersectionWithLine(carrier);
+    const int count = circle.IntersectionWithLine(supportingLine);
     if (count == 0) return false;
     const auto turn = [&](unsigned i) { return EP().AngDist(circle.GetSolution(i), circle.M()); };
     const unsigned chosen = count > 1 && turn(0) > turn(1) ? 1 : 0;

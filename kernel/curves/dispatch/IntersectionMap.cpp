@@ -1,9 +1,9 @@
 /// @file
 /// Which kernel intersects which ordered pair of curves.
 ///
-/// A kernel works on the infinite carriers and full circles; its points are kept where every
-/// bounded curve of the pair accepts them. Swapped pairs run the same function with swapped
-/// arguments, so that both give the same points in the same order.
+/// A kernel works on the supporting lines and circles, which have no bounds; its points are kept
+/// where every bounded curve of the pair accepts them. Swapped pairs run the same function with
+/// swapped arguments, so that both give the same points in the same order.
 #include <stdexcept>
 #include <unordered_map>
 #include <vector>
@@ -22,7 +22,7 @@ using Points = std::vector<GmPoint>;
 using IntersectionEntry = void (*)(GmBase const&, GmBase const&, Points&);
 using IntersectionMap = std::unordered_map<int, IntersectionEntry>;
 
-// Does a point that lies on the carrier or the full circle also lie on the curve itself?
+/// Does a point that lies on the supporting line or circle also lie on the curve itself?
 bool holds(GmLine const&, GmPoint const&) {
     return true;
 }
@@ -43,7 +43,7 @@ template <class A, class B>
 void intersectPair(GmBase const& first, GmBase const& second, Points& result) {
     auto const& a = static_cast<A const&>(first);
     auto const& b = static_cast<B const&>(second);
-    for (GmPoint const& p : carrierHits(a, b)) {
+    for (GmPoint const& p : supportHits(a, b)) {
         if (holds(a, p) && holds(b, p)) result.push_back(p);
     }
 }

@@ -35,7 +35,7 @@ struct ArcEntry {
     GmDir alongArc;
     double angle;  // polar angle of the common end, radians
     GmBase::eRotDir sense;
-    GmLine carrier;
+    GmLine supportingLine;
 };
 
 ArcEntry entryOf(GmArc const& a, GmStretch const& s, bool bArcFirst) {
@@ -66,5 +66,5 @@ GmCircle::GmCircle(GmArc const& a, GmStretch const& s, double r, bool bArcFirst,
     if (!a.CreationOK() || !s.CreationOK() || !(r > 0.0)) return;
     const ArcEntry entry = entryOf(a, s, bArcFirst);
     const eRotDir turn = turnInto(entry);
-    CreateTangCircle(a, entry.carrier, r, turn == eRotCW, turn != entry.sense, bOther);
+    CreateTangCircle(a, entry.supportingLine, r, turn == eRotCW, turn != entry.sense, bOther);
 }

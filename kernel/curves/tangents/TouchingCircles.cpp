@@ -44,7 +44,7 @@ GmCircle::GmCircle(GmLine const& l1, GmLine const& l2, GmLine const& l3) : GmCir
 
 GmCircle::GmCircle(GmLine const& l1, GmLine const& l2, double r) : GmCircle() {
     if (!l1.CreationOK() || !l2.CreationOK()) return;
-    const auto crossing = gmkernel_detail::carrierHits(l1, l2);
+    const auto crossing = gmkernel_detail::supportHits(l1, l2);
     if (crossing.begin() == crossing.end()) return;
     const GmVec bisector(l1.Dir().Sym(l2.Dir()));
     const double angle = l1.Dir().RAngle(l2.Dir());
