@@ -76,8 +76,8 @@ std::vector<GmOffsetElement> bandPieces(GmCurve const& element, int source, int 
     std::vector<GmOffsetElement> pieces;
     if (!element.IsStretch() && !element.IsArc()) return pieces;
 
-    const auto add = [&](std::unique_ptr<GmCurve> curve, bool kept, bool auxiliary) {
-        pieces.emplace_back(std::move(curve), source, id, kept, auxiliary);
+    const auto add = [&](PieceRole role, std::unique_ptr<GmCurve> curve) {
+        pieces.emplace_back(std::move(curve), source, id, role);
     };
     const GmBase::eRotDir rot = d > 0.0 ? GmBase::eRotCCW : GmBase::eRotCW;
     const auto arcOf = [rot](Cap const& cap) {
@@ -87,12 +87,12 @@ std::vector<GmOffsetElement> bandPieces(GmCurve const& element, int source, int 
     Cap end = endCap(element, d);
     if (element.IsArc()) shortenCaps(static_cast<GmArc const&>(element), d, start, end);
 
-    add(arcOf(start), false, true);
-    if (auto offset = offsetOf(element, d)) add(std::move(offset), true, false);
-    add(arcOf(end), true, true);
+    add(PieceRole::kStartCap, arcOf(start));
+    if (auto offset = offsetOf(element, d)) add(PieceRole::kChosenSide, std::move(offset));
+    add(PieceRole::kEndCap, arcOf(end));
     if (auto other = offsetOf(element, -d)) {
         other->Invert();
-        add(std::move(other), false, true);
+        add(PieceRole::kOtherSide, std::move(other));
     }
     return pieces;
 }

@@ -4,20 +4,28 @@
 
 #include <utility>
 
-GmOffsetElement::GmOffsetElement(std::unique_ptr<GmCurve> curve, int source, int id, bool kept,
-                                 bool auxiliary)
-    : m_curve(std::move(curve)), m_source(source), m_id(id), m_kept(kept), m_auxiliary(auxiliary) {}
+using gmkernel_detail::PieceRole;
+
+GmOffsetElement::GmOffsetElement(std::unique_ptr<GmCurve> curve, int source, int id, PieceRole role)
+    : m_curve(std::move(curve)), m_source(source), m_id(id), m_role(role) {}
 
 GmOffsetElement::GmOffsetElement(GmOffsetElement const& other)
     : m_curve(other.m_curve->Clone()),
       m_source(other.m_source),
       m_id(other.m_id),
-      m_kept(other.m_kept),
-      m_auxiliary(other.m_auxiliary) {}
+      m_role(other.m_role) {}
 
 GmOffsetElement& GmOffsetElement::operator=(GmOffsetElement const& other) {
     if (this != &other) *this = GmOffsetElement(other);
     return *this;
+}
+
+bool GmOffsetElement::kept() const {
+    return m_role == PieceRole::kChosenSide || m_role == PieceRole::kEndCap;
+}
+
+bool GmOffsetElement::auxiliary() const {
+    return m_role != PieceRole::kChosenSide;
 }
 
 void GmOffsetElement::Trace() const {

@@ -23,11 +23,11 @@ bool isNear(GmPoint const& p, SourceSpan const& span, int count, double threshol
 void removeFromRun(PieceRun& run, SourceSpan const& span, int newest, double threshold) {
     const int all = static_cast<int>(span.nearby.size());
     for (auto piece = run.pieces.begin(); piece != run.pieces.end();) {
-        const int count = piece->keepsDistance ? newest : all;
+        const int count = piece->clearOfSpan ? newest : all;
         if (isNear(piece->halving, span, count, threshold)) {
             piece = run.pieces.erase(piece);
         } else {
-            piece->keepsDistance = true;
+            piece->clearOfSpan = true;
             ++piece;
         }
     }
