@@ -1,7 +1,5 @@
 #include "gmkernel/GmArc.h"
 
-#include <wx/string.h>
-
 #include <cmath>
 #include <utility>
 
@@ -11,6 +9,7 @@
 #include "kernel/curves/Joining.h"
 #include "kernel/curves/kernels/AngleOrder.h"
 #include "kernel/values/Constants.h"
+#include "kernel/values/TraceText.h"
 
 namespace {
 
@@ -188,10 +187,8 @@ void GmArc::Transform(GmMatrix const& m) {
 }
 
 std::string GmArc::GetTraceString() const {
-    return wxString::Format("circ%d (%0.5f, %0.5f) - (%0.5f, %0.5f) mp (%0.5f, %0.5f)",
-                            m_eDir == eRotCW ? 2 : 3, m_SP.X(), m_SP.Y(), m_EP.X(), m_EP.Y(),
-                            m_M.X(), m_M.Y())
-        .ToStdString();
+    return gmkernel_detail::arcText("circ", m_eDir == eRotCW, m_SP.X(), m_SP.Y(), m_EP.X(),
+                                    m_EP.Y(), m_M.X(), m_M.Y());
 }
 
 GmBase::eRotDir GmArc::Dir() const {

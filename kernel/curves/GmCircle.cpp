@@ -1,13 +1,12 @@
 #include "gmkernel/GmCircle.h"
 
-#include <wx/string.h>
-
 #include <algorithm>
 #include <cmath>
 
 #include "gmkernel/GmRect.h"
 #include "kernel/curves/SupportHits.h"
 #include "kernel/values/Constants.h"
+#include "kernel/values/TraceText.h"
 
 GmCircle::GmCircle() {
     m_eType = eGmCircle;
@@ -108,7 +107,7 @@ void GmCircle::Translation(GmVec const& v) {
 void GmCircle::Transform(GmMatrix const& /*m*/) {}
 
 std::string GmCircle::GetTraceString() const {
-    return wxString::Format("circ (%0.5f, %0.5f) R = %0.5f", m_M.X(), m_M.Y(), m_dR).ToStdString();
+    return gmkernel_detail::circleText(m_M.X(), m_M.Y(), m_dR);
 }
 
 GmPoint GmCircle::M() const {

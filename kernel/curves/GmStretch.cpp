@@ -1,13 +1,12 @@
 #include "gmkernel/GmStretch.h"
 
-#include <wx/string.h>
-
 #include <utility>
 
 #include "gmkernel/GmArc.h"
 #include "gmkernel/GmRect.h"
 #include "kernel/curves/Joining.h"
 #include "kernel/curves/kernels/OnSegment.h"
+#include "kernel/values/TraceText.h"
 
 GmStretch::GmStretch() {
     m_eType = eGmStretch;
@@ -159,9 +158,7 @@ void GmStretch::Transform(GmMatrix const& m) {
 }
 
 std::string GmStretch::GetTraceString() const {
-    return wxString::Format("line (%0.5f, %0.5f) - (%0.5f, %0.5f)", m_SP.X(), m_SP.Y(), m_EP.X(),
-                            m_EP.Y())
-        .ToStdString();
+    return gmkernel_detail::stretchText(m_SP.X(), m_SP.Y(), m_EP.X(), m_EP.Y());
 }
 
 GmPoint GmStretch::HP() const {

@@ -1,7 +1,5 @@
 #include "gmkernel/GmVec.h"
 
-#include <wx/string.h>
-
 #include <cmath>
 
 #include "gmkernel/GmAngle.h"
@@ -10,6 +8,7 @@
 #include "gmkernel/GmPoint.h"
 #include "gmkernel/GmRect.h"
 #include "kernel/values/Constants.h"
+#include "kernel/values/TraceText.h"
 
 namespace {
 
@@ -298,7 +297,7 @@ void GmVec::Transform(GmMatrix const& m) {
 }
 
 std::string GmVec::GetRawTraceString() const {
-    return wxString::Format("(%0.5f, %0.5f, %0.5f)", m_dX, m_dY, m_dZ).ToStdString();
+    return gmkernel_detail::coordinatesText(m_dX, m_dY, m_dZ);
 }
 
 void SetCoordByIndex(GmVec& v, int i, double value) {

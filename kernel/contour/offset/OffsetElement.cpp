@@ -1,8 +1,8 @@
 #include "kernel/contour/offset/OffsetElement.h"
 
-#include <wx/string.h>
-
 #include <utility>
+
+#include "kernel/values/TraceText.h"
 
 using gmkernel_detail::PieceRole;
 
@@ -29,7 +29,5 @@ bool GmOffsetElement::auxiliary() const {
 }
 
 void GmOffsetElement::Trace() const {
-    const wxString text =
-        wxString::Format("p-path %i %s", m_id, wxString(m_curve->GetTraceString()));
-    static_cast<void>(text);
+    static_cast<void>(gmkernel_detail::offsetPieceText(m_id, m_curve->GetTraceString()));
 }
