@@ -3,6 +3,7 @@
 #include <limits>
 
 #include "gmkernel/GmContour.h"
+#include "kernel/curves/VerifiedCast.h"
 
 namespace {
 
@@ -62,10 +63,10 @@ GmPoint GmContour::MinDist(double& d, GmPoint const& p, bool bPreferSP) const {
 
 GmPoint GmContour::MinDist(double& d, GmCurve const* c, bool) const {
     Approach best;
-    if (c && c->IsContour()) {
-        GmContour const& other = static_cast<GmContour const&>(*c);
-        for (int i = 0; i < other.ElementCount(); ++i) {
-            approachCurve(*this, other.GetElement(i), best);
+    GmContour const* const other = c ? gmkernel_detail::curveAs<GmContour>(*c) : nullptr;
+    if (other) {
+        for (int i = 0; i < other->ElementCount(); ++i) {
+            approachCurve(*this, other->GetElement(i), best);
         }
     } else if (c) {
         approachCurve(*this, c, best);

@@ -2,13 +2,15 @@
 
 #include "gmkernel/GmArc.h"
 #include "gmkernel/GmStretch.h"
+#include "kernel/curves/VerifiedCast.h"
 
 namespace gmkernel_detail {
 
 GmPoint middleOf(GmCurve const* element) {
-    if (element && element->IsStretch()) return static_cast<GmStretch const&>(*element).HP();
-    if (element && element->IsArc()) return static_cast<GmArc const&>(*element).HP();
-    return GmPoint();
+    if (element == nullptr) return GmPoint();
+    if (auto const* stretch = curveAs<GmStretch>(*element)) return stretch->HP();
+    auto const* const arc = curveAs<GmArc>(*element);
+    return arc != nullptr ? arc->HP() : GmPoint();
 }
 
 GmPoint chainStart(GmContour const& contour) {

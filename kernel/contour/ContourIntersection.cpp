@@ -2,6 +2,7 @@
 
 #include "gmkernel/GmArc.h"
 #include "gmkernel/GmContour.h"
+#include "kernel/curves/VerifiedCast.h"
 
 // Points are collected aside and handed over at the end: intersecting a contour with itself comes
 // back to this list through the elements, and an exception must leave it empty.
@@ -9,7 +10,8 @@
 namespace {
 
 bool isFullCircle(GmCurve const& element) {
-    return element.IsArc() && static_cast<GmArc const&>(element).IsFullCircle();
+    auto const* const arc = gmkernel_detail::curveAs<GmArc>(element);
+    return arc && arc->IsFullCircle();
 }
 
 bool isEndOf(GmPoint const& p, GmCurve const& element) {

@@ -3,6 +3,7 @@
 #include "gmkernel/GmArc.h"
 #include "gmkernel/GmContour.h"
 #include "kernel/contour/ContourElements.h"
+#include "kernel/curves/VerifiedCast.h"
 #include "kernel/values/Constants.h"
 
 // The sense of rotation is the sign of the area of a polygon through the joints and through points
@@ -42,11 +43,10 @@ double doubledArea(GmContour const& contour, GmPoint const& reference) {
     SweptArea area(reference, start);
     for (int i = 0; i < contour.ElementCount(); ++i) {
         GmCurve const& element = *contour.GetElement(i);
-        if (element.IsArc()) {
-            GmArc const& arc = static_cast<GmArc const&>(element);
-            const int chords = chordCount(arc);
+        if (auto const* arc = gmkernel_detail::curveAs<GmArc>(element)) {
+            const int chords = chordCount(*arc);
             for (int k = 1; k < chords; ++k)
-                area.moveTo(arc.SectionPoint(k, chords));
+                area.moveTo(arc->SectionPoint(k, chords));
         }
         area.moveTo(element.EP());
     }

@@ -4,16 +4,20 @@
 #include "gmkernel/GmRect.h"
 #include "gmkernel/GmStretch.h"
 #include "kernel/contour/ContourElements.h"
+#include "kernel/curves/VerifiedCast.h"
+
+using gmkernel_detail::curveAs;
 
 namespace {
 
 /// Are both segments, or both arcs, and equal as such?
 bool sameElement(GmCurve const& a, GmCurve const& b) {
-    if (a.GetType() != b.GetType()) return false;
-    if (a.IsStretch()) {
-        return static_cast<GmStretch const&>(a) == static_cast<GmStretch const&>(b);
-    }
-    return a.IsArc() && static_cast<GmArc const&>(a) == static_cast<GmArc const&>(b);
+    auto const* const stretchA = curveAs<GmStretch>(a);
+    auto const* const stretchB = curveAs<GmStretch>(b);
+    if (stretchA && stretchB) return *stretchA == *stretchB;
+    auto const* const arcA = curveAs<GmArc>(a);
+    auto const* const arcB = curveAs<GmArc>(b);
+    return arcA && arcB && *arcA == *arcB;
 }
 
 }  // namespace

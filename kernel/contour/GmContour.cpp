@@ -6,6 +6,7 @@
 #include "gmkernel/GmArc.h"
 #include "gmkernel/GmStretch.h"
 #include "kernel/contour/GmContourArray.h"
+#include "kernel/curves/VerifiedCast.h"
 
 namespace {
 
@@ -98,9 +99,10 @@ GmCurve* GmContour::GetElement(int index) {
 GmCurve* GmContour::GetNewElement(int index) const {
     GmCurve const* const element = GetElement(index);
     if (!element) return nullptr;
-    if (element->IsStretch()) return new GmStretch(static_cast<GmStretch const&>(*element));
-    if (element->IsArc()) return new GmArc(static_cast<GmArc const&>(*element));
-    return nullptr;
+    if (auto const* stretch = gmkernel_detail::curveAs<GmStretch>(*element))
+        return new GmStretch(*stretch);
+    auto const* const arc = gmkernel_detail::curveAs<GmArc>(*element);
+    return arc ? new GmArc(*arc) : nullptr;
 }
 
 bool GmContour::IsClosed() const {

@@ -2,6 +2,7 @@
 
 #include "gmkernel/GmArc.h"
 #include "gmkernel/GmRect.h"
+#include "kernel/curves/VerifiedCast.h"
 
 namespace gmkernel_detail {
 
@@ -38,8 +39,8 @@ CurveBox boxOf(GmPoint const& p) {
 }
 
 CurveBox reachOf(GmCurve const& curve) {
-    const GmRect box =
-        curve.IsArc() ? arcReach(static_cast<GmArc const&>(curve)) : curve.BoundingRect();
+    auto const* const arc = curveAs<GmArc>(curve);
+    const GmRect box = arc != nullptr ? arcReach(*arc) : curve.BoundingRect();
     return {box.Left() - kReachMargin, box.Right() + kReachMargin, box.Bottom() - kReachMargin,
             box.Top() + kReachMargin};
 }

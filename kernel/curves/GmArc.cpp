@@ -7,9 +7,12 @@
 #include "gmkernel/GmMatrix.h"
 #include "gmkernel/GmStretch.h"
 #include "kernel/curves/Joining.h"
+#include "kernel/curves/VerifiedCast.h"
 #include "kernel/curves/kernels/AngleOrder.h"
 #include "kernel/values/Constants.h"
 #include "kernel/values/TraceText.h"
+
+using gmkernel_detail::curveAs;
 
 namespace {
 
@@ -59,10 +62,10 @@ bool GmArc::Trim(GmCurve* next) {
 
 GmCurve* GmArc::Concat(GmCurve const& next, int mode) {
     GmLine normalAtNext;
-    if (next.IsStretch()) {
-        normalAtNext = GmLine(static_cast<GmStretch const&>(next), next.SP(), ePLNormal);
-    } else if (next.IsArc()) {
-        normalAtNext = GmLine(next.SP(), static_cast<GmArc const&>(next).M());
+    if (auto const* stretch = curveAs<GmStretch>(next)) {
+        normalAtNext = GmLine(*stretch, next.SP(), ePLNormal);
+    } else if (auto const* arc = curveAs<GmArc>(next)) {
+        normalAtNext = GmLine(next.SP(), arc->M());
     }
     return gmkernel_detail::connectingCurve(*this, GmLine(m_EP, m_M), next, normalAtNext, mode);
 }
@@ -71,12 +74,12 @@ bool GmArc::Concat(GmCurve const& next) {
     const GmCircle circle(*this);
     int count = 0;
     bool takeSecond = false;
-    if (next.IsStretch()) {
-        count = circle.IntersectionWithLine(GmLine(static_cast<GmStretch const&>(next)));
+    if (auto const* stretch = curveAs<GmStretch>(next)) {
+        count = circle.IntersectionWithLine(GmLine(*stretch));
         takeSecond =
             count > 1 && m_EP.Dist(circle.GetSolution(0)) > m_EP.Dist(circle.GetSolution(1));
-    } else if (next.IsArc()) {
-        count = circle.IntersectionWithCircle(static_cast<GmArc const&>(next));
+    } else if (auto const* arc = curveAs<GmArc>(next)) {
+        count = circle.IntersectionWithCircle(*arc);
         if (count == 0) return next.SP() == m_EP;
         takeSecond = count > 1 && m_EP.AngDist(circle.GetSolution(0), m_M) >
                                       m_EP.AngDist(circle.GetSolution(1), m_M);

@@ -6,16 +6,7 @@
 #include "gmkernel/GmCircle.h"
 #include "gmkernel/GmLine.h"
 #include "gmkernel/GmRect.h"
-
-namespace {
-
-/// The circle part of a circle or an arc, null for every other kind of curve.
-GmCircle const* asCircle(GmCurve const* curve) {
-    const bool round = curve->IsCircle() || curve->IsArc();
-    return round ? static_cast<GmCircle const*>(curve) : nullptr;
-}
-
-}  // namespace
+#include "kernel/curves/VerifiedCast.h"
 
 GmCurve::GmCurve() {
     m_eType = eGmCurve;
@@ -132,11 +123,11 @@ GmPoint GmCurve::MinDist(double& d, GmCurve const* c, bool bPreferSP) const {
             CheckDist(d, best, end, endOfOther);
         }
     }
-    if (GmCircle const* circle = asCircle(this)) {
+    if (GmCircle const* circle = gmkernel_detail::roundPart(*this)) {
         const GmPoint facing = circle->NP(c);
         if (facing.CreationOK()) CheckDist(d, best, facing, c->NP(facing));
     }
-    if (GmCircle const* circle = asCircle(c)) {
+    if (GmCircle const* circle = gmkernel_detail::roundPart(*c)) {
         const GmPoint facing = circle->NP(this);
         if (facing.CreationOK()) offerFoot(facing);
     }

@@ -5,8 +5,11 @@
 #include "gmkernel/GmArc.h"
 #include "gmkernel/GmRect.h"
 #include "kernel/curves/Joining.h"
+#include "kernel/curves/VerifiedCast.h"
 #include "kernel/curves/kernels/OnSegment.h"
 #include "kernel/values/TraceText.h"
+
+using gmkernel_detail::curveAs;
 
 GmStretch::GmStretch() {
     m_eType = eGmStretch;
@@ -63,10 +66,10 @@ bool GmStretch::Trim(GmCurve* next) {
 
 GmCurve* GmStretch::Concat(GmCurve const& next, int mode) {
     GmLine normalAtNext;
-    if (next.IsStretch()) {
-        normalAtNext = GmLine(static_cast<GmStretch const&>(next), next.SP(), ePLNormal);
-    } else if (next.IsArc()) {
-        normalAtNext = GmLine(static_cast<GmArc const&>(next).M(), next.SP());
+    if (auto const* stretch = curveAs<GmStretch>(next)) {
+        normalAtNext = GmLine(*stretch, next.SP(), ePLNormal);
+    } else if (auto const* arc = curveAs<GmArc>(next)) {
+        normalAtNext = GmLine(arc->M(), next.SP());
     }
     return gmkernel_detail::connectingCurve(*this, GmLine(*this, EP(), ePLNormal), next,
                                             normalAtNext, mode);
@@ -74,15 +77,15 @@ GmCurve* GmStretch::Concat(GmCurve const& next, int mode) {
 
 bool GmStretch::Concat(GmCurve const& next) {
     const GmLine supportingLine(*this);
-    if (next.IsStretch()) {
-        if (supportingLine.IntersectionWithLine(static_cast<GmStretch const&>(next)) == 0)
-            return false;
+    if (auto const* stretch = curveAs<GmStretch>(next)) {
+        if (supportingLine.IntersectionWithLine(*stretch) == 0) return false;
         gmkernel_detail::joinAt(*this, next, supportingLine.GetSolution(0));
         return true;
     }
-    if (!next.IsArc()) return false;
+    auto const* const arc = curveAs<GmArc>(next);
+    if (arc == nullptr) return false;
 
-    const GmCircle circle(static_cast<GmArc const&>(next));
+    const GmCircle circle(*arc);
     const int count = circle.IntersectionWithLine(supportingLine);
     if (count == 0) return false;
     const auto turn = [&](unsigned i) { return EP().AngDist(circle.GetSolution(i), circle.M()); };

@@ -17,6 +17,7 @@
 #include "kernel/contour/walk/CrossingWalk.h"
 #include "kernel/contour/walk/LoopContour.h"
 #include "kernel/curves/CurveBox.h"
+#include "kernel/curves/VerifiedCast.h"
 
 namespace {
 
@@ -28,8 +29,7 @@ constexpr int kDidNotComeBack = -2;
 bool isClosedChain(GmContour const& contour) {
     if (!contour.IsClosed()) return false;
     for (int i = 0; i < contour.ElementCount(); ++i) {
-        GmCurve const& element = *contour.GetElement(i);
-        if (!element.IsStretch() && !element.IsArc()) return false;
+        if (!isSegmentOrArc(*contour.GetElement(i))) return false;
     }
     return true;
 }

@@ -12,6 +12,7 @@
 
 #include "gmkernel/GmArc.h"
 #include "gmkernel/GmStretch.h"
+#include "kernel/curves/VerifiedCast.h"
 
 namespace gmkernel_detail {
 
@@ -74,7 +75,7 @@ std::unique_ptr<GmCurve> offsetOf(GmCurve const& element, double d) {
 
 std::vector<GmOffsetElement> bandPieces(GmCurve const& element, int source, int id, double d) {
     std::vector<GmOffsetElement> pieces;
-    if (!element.IsStretch() && !element.IsArc()) return pieces;
+    if (!isSegmentOrArc(element)) return pieces;
 
     const auto add = [&](PieceRole role, std::unique_ptr<GmCurve> curve) {
         pieces.emplace_back(std::move(curve), source, id, role);
@@ -85,7 +86,7 @@ std::vector<GmOffsetElement> bandPieces(GmCurve const& element, int source, int 
     };
     Cap start = startCap(element, d);
     Cap end = endCap(element, d);
-    if (element.IsArc()) shortenCaps(static_cast<GmArc const&>(element), d, start, end);
+    if (auto const* arc = curveAs<GmArc>(element)) shortenCaps(*arc, d, start, end);
 
     add(PieceRole::kStartCap, arcOf(start));
     if (auto offset = offsetOf(element, d)) add(PieceRole::kChosenSide, std::move(offset));

@@ -5,6 +5,7 @@
 
 #include "kernel/contour/offset/BandPieces.h"
 #include "kernel/contour/offset/Insertion.h"
+#include "kernel/curves/VerifiedCast.h"
 
 namespace gmkernel_detail {
 
@@ -14,8 +15,7 @@ namespace {
 /// that are neither segments nor arcs.
 CurveBox nearbyOf(GmCurve const& element, double d) {
     constexpr double kEverywhere = std::numeric_limits<double>::max();
-    if (!element.IsStretch() && !element.IsArc())
-        return {-kEverywhere, kEverywhere, -kEverywhere, kEverywhere};
+    if (!isSegmentOrArc(element)) return {-kEverywhere, kEverywhere, -kEverywhere, kEverywhere};
     return reachOf(element).grown(std::fabs(d));
 }
 

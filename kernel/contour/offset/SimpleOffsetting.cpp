@@ -7,6 +7,7 @@
 #include "gmkernel/GmContElement.h"
 #include "gmkernel/GmContour.h"
 #include "kernel/contour/GmContourArray.h"
+#include "kernel/curves/VerifiedCast.h"
 
 namespace {
 
@@ -21,7 +22,7 @@ OffsetCurves offsetElements(GmContour const& contour, double d) {
     OffsetCurves offsets;
     for (int i = 0; i < contour.ElementCount(); ++i) {
         GmContElement const& record = *contour.GetContElement(i);
-        if (!record.pCurve->IsStretch() && !record.pCurve->IsArc()) continue;
+        if (!gmkernel_detail::isSegmentOrArc(*record.pCurve)) continue;
         std::unique_ptr<GmCurve> offset(record.pCurve->GetParallel(d));
         if (offset->CreationOK()) offsets.push_back({std::move(offset), record.lId});
     }

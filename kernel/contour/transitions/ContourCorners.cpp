@@ -6,16 +6,17 @@
 #include "gmkernel/GmContour.h"
 #include "gmkernel/GmStretch.h"
 #include "kernel/contour/transitions/FilletCircle.h"
+#include "kernel/curves/VerifiedCast.h"
 #include "kernel/values/HandedOver.h"
 
 namespace {
 
 GmCircle circleInCorner(GmCurve const& prev, GmCurve const& cur, double radius) {
-    if (!prev.IsStretch() || !cur.IsStretch())
-        return gmkernel_detail::filletCircle(prev, cur, radius);
+    auto const* const first = gmkernel_detail::curveAs<GmStretch>(prev);
+    auto const* const second = gmkernel_detail::curveAs<GmStretch>(cur);
+    if (!first || !second) return gmkernel_detail::filletCircle(prev, cur, radius);
     // Reversed as a line: height and rounding of the corner come from the start of `prev`.
-    return GmCircle(static_cast<GmLine const&>(prev).Inverted(), static_cast<GmLine const&>(cur),
-                    radius);
+    return GmCircle(first->GmLine::Inverted(), *second, radius);
 }
 
 /// The arc that rounds a corner and the points where it meets the elements.

@@ -6,6 +6,7 @@
 #include "gmkernel/GmStretch.h"
 #include "kernel/contour/ContourElements.h"
 #include "kernel/contour/transitions/Transition.h"
+#include "kernel/curves/VerifiedCast.h"
 
 using gmkernel_detail::Transition;
 
@@ -46,19 +47,9 @@ bool GmContour::AddTransAt(eTransType type, int index, double value, bool bIdOfF
     const long id = GetContElement(bIdOfFirst ? index : next)->lId;
     GmCurve* const first = GetElement(index);
     GmCurve* const second = GetElement(next);
-    if (first->IsStretch() && second->IsStretch())
-        return AddTrans(type, static_cast<GmStretch*>(first), static_cast<GmStretch*>(second),
-                        index, value, id);
-    if (first->IsStretch() && second->IsArc())
-        return AddTrans(type, static_cast<GmStretch*>(first), static_cast<GmArc*>(second), index,
-                        value, id, false);
-    if (first->IsArc() && second->IsStretch())
-        return AddTrans(type, static_cast<GmStretch*>(second), static_cast<GmArc*>(first), index,
-                        value, id, true);
-    if (first->IsArc() && second->IsArc())
-        return AddTrans(type, static_cast<GmArc*>(first), static_cast<GmArc*>(second), index, value,
-                        id);
-    return false;
+    if (!gmkernel_detail::isSegmentOrArc(*first) || !gmkernel_detail::isSegmentOrArc(*second))
+        return false;
+    return AddTransBetween(type, first, second, index, value, id);
 }
 
 bool GmContour::AddTrans(eTransType type, GmStretch* first, GmStretch* second, int index,

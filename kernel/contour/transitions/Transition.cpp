@@ -6,6 +6,7 @@
 #include "gmkernel/GmArc.h"
 #include "gmkernel/GmStretch.h"
 #include "kernel/contour/transitions/FilletCircle.h"
+#include "kernel/curves/VerifiedCast.h"
 
 namespace gmkernel_detail {
 
@@ -21,7 +22,7 @@ bool areSegments(GmCurve const& first, GmCurve const& second) {
 
 /// A circle has to meet a segment in exactly one point.
 GmPoint contactWith(GmCircle const& circle, GmCurve const& element) {
-    if (element.IsArc()) return contactWithArc(circle, static_cast<GmArc const&>(element));
+    if (auto const* arc = curveAs<GmArc>(element)) return contactWithArc(circle, *arc);
     return circle.Intersection(&element) == 1 ? circle.GetSolution(0) : GmPoint();
 }
 
@@ -76,10 +77,10 @@ Transition chamferBySearch(GmCurve const& first, GmCurve const& second, double l
 }
 
 Transition chamferOfLength(GmCurve const& first, GmCurve const& second, double length) {
-    if (!areSegments(first, second)) return chamferBySearch(first, second, length);
-    auto const& a = static_cast<GmStretch const&>(first);
-    auto const& b = static_cast<GmStretch const&>(second);
-    return chamferAtDistance(first, second, distanceForLength(a, b, length));
+    auto const* const a = curveAs<GmStretch>(first);
+    auto const* const b = curveAs<GmStretch>(second);
+    if (!a || !b) return chamferBySearch(first, second, length);
+    return chamferAtDistance(first, second, distanceForLength(*a, *b, length));
 }
 
 }  // namespace

@@ -5,6 +5,7 @@
 
 #include "gmkernel/GmArc.h"
 #include "gmkernel/GmContour.h"
+#include "kernel/curves/VerifiedCast.h"
 #include "kernel/values/HandedOver.h"
 
 namespace {
@@ -75,11 +76,11 @@ bool GmContour::SplitBothAtMinDist(GmContour* other) {
 
 bool GmContour::SplitArcs(GmDir const& dir, bool bBoth) {
     for (int i = 0; i < ElementCount(); ++i) {
-        if (!GetElement(i)->IsArc()) continue;
-        auto const& arc = static_cast<GmArc const&>(*GetElement(i));
-        const GmVec toCut = arc.R() * GmVec(dir);
-        int pieces = SplitInside(i, GmPoint(arc.M() + toCut)) ? 1 : 0;
-        if (bBoth && SplitInside(i, GmPoint(arc.M() - toCut))) ++pieces;
+        auto const* const arc = gmkernel_detail::curveAs<GmArc>(*GetElement(i));
+        if (arc == nullptr) continue;
+        const GmVec toCut = arc->R() * GmVec(dir);
+        int pieces = SplitInside(i, GmPoint(arc->M() + toCut)) ? 1 : 0;
+        if (bBoth && SplitInside(i, GmPoint(arc->M() - toCut))) ++pieces;
         i += pieces;
     }
     return true;
@@ -87,10 +88,10 @@ bool GmContour::SplitArcs(GmDir const& dir, bool bBoth) {
 
 bool GmContour::SplitArcsQuadrant() {
     for (int i = 0; i < ElementCount(); ++i) {
-        if (!GetElement(i)->IsArc()) continue;
-        auto const& arc = static_cast<GmArc const&>(*GetElement(i));
-        const GmPoint centre = arc.M();
-        for (GmVec const& toCut : quadrantOffsets(arc)) {
+        auto const* const arc = gmkernel_detail::curveAs<GmArc>(*GetElement(i));
+        if (arc == nullptr) continue;
+        const GmPoint centre = arc->M();
+        for (GmVec const& toCut : quadrantOffsets(*arc)) {
             if (SplitInside(i, GmPoint(centre + toCut))) ++i;
         }
     }

@@ -14,6 +14,7 @@
 
 #include "gmkernel/GmArc.h"
 #include "gmkernel/GmStretch.h"
+#include "kernel/curves/VerifiedCast.h"
 
 namespace gmkernel_detail {
 
@@ -23,14 +24,24 @@ namespace {
 /// arcs.
 constexpr double kAheadPrec = 1e-4;
 
-/// How far `q` lies ahead of `p` on a segment (length units) or an arc (degrees).
-double aheadOn(GmCurve const& curve, GmPoint const& p, GmPoint const& q) {
-    if (curve.IsArc()) {
-        auto const& arc = static_cast<GmArc const&>(curve);
-        return p.AngDist(q, arc.M(), arc.Dir());
+/// How far points lie ahead of `p` on a segment (length units) or an arc (degrees).
+class Ahead {
+public:
+    Ahead(GmCurve const& curve, GmPoint const& p)
+        : m_from(p), m_segment(curveAs<GmStretch>(curve)), m_arc(curveAs<GmArc>(curve)) {}
+
+    /// Is the curve a segment or an arc?
+    bool isMeasurable() const { return m_segment != nullptr || m_arc != nullptr; }
+    double operator()(GmPoint const& q) const {
+        if (m_arc != nullptr) return m_from.AngDist(q, m_arc->M(), m_arc->Dir());
+        return m_from.DirDist(q, m_segment->Dir());
     }
-    return p.DirDist(q, static_cast<GmStretch const&>(curve).Dir());
-}
+
+private:
+    GmPoint const& m_from;
+    GmStretch const* m_segment;
+    GmArc const* m_arc;
+};
 
 }  // namespace
 
@@ -46,17 +57,18 @@ void Crossings::Add(int from, int to, GmPoint const& p) {
 
 int nextCrossing(GmPoint const& p, GmCurve const& curve, int index,
                  CrossingArray const& crossings) {
-    if (!curve.IsStretch() && !curve.IsArc()) return -1;
-    double nearest = aheadOn(curve, p, curve.EP());
+    const Ahead ahead(curve, p);
+    if (!ahead.isMeasurable()) return -1;
+    double nearest = ahead(curve.EP());
     if (nearest < kAheadPrec) return -1;
     int found = -1;
     for (int i = 0; i < crossings.GetSize(); ++i) {
         GmContIntPoint const& crossing = *crossings[i];
         if (crossing.bUsed || crossing.nFrom != index || crossing.Point == p) continue;
-        const double ahead = aheadOn(curve, p, crossing.Point);
-        if (ahead <= -kAheadPrec) continue;
-        if (ahead < nearest || std::fabs(ahead - nearest) < kAheadPrec) {
-            nearest = ahead;
+        const double dist = ahead(crossing.Point);
+        if (dist <= -kAheadPrec) continue;
+        if (dist < nearest || std::fabs(dist - nearest) < kAheadPrec) {
+            nearest = dist;
             found = i;
         }
     }
