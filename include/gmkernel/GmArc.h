@@ -14,7 +14,7 @@
 ///
 /// A circle with start point, end point, their direction angles seen from the centre and a sense of
 /// rotation; the arc runs from start to end in that sense. Coincident ends (within m_scdPrecCalc)
-/// make a full circle; membership takes ends that are equal within m_scdPrec for one. `double`
+/// make a full circle; for Element() ends that are equal within m_scdPrec do so already. `double`
 /// angles are in radians unless the name ends in Deg. In() and Out() answer false.
 class GMKERNEL_EXPORT GmArc : public GmCircle, public boost::equality_comparable<GmArc> {
 public:
