@@ -184,6 +184,9 @@ public:
     GmContour const* GetSubContour(int index) const;
     /// The sub-contour whose bounding rectangle encloses those of all others; null when there is
     /// none. Sub-contours without elements are passed over.
+    ///
+    /// Known limit: null also where a rectangle in the list neither encloses the largest one before
+    /// it nor lies inside it, even when a later one encloses both.
     GmContour* GetMaxSubContour();
     /// The sub-contour whose start is nearest to the point, the first of equally near ones; null
     /// without sub-contours. Sub-contours without elements are passed over.

@@ -1,3 +1,11 @@
+/// @file
+/// Distances from a contour and nearest points on it.
+///
+/// The nearest point of a chain is the nearest of its elements' own: every element is asked, and
+/// the first of equally near ones stays. With a second point to break ties, distances that agree
+/// within a tolerance count as equal; as such a comparison is not transitive, the order of the
+/// elements has a say. Crossings are not looked for. Cost: linear in the elements, elements times
+/// elements for two contours.
 #include <algorithm>
 #include <cmath>
 #include <limits>

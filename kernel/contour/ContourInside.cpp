@@ -1,11 +1,15 @@
+/// @file
+/// Inside and outside by the parity of crossings along a segment from the point.
+///
+/// A segment that ends outside crosses the contour an odd number of times when it starts inside. It
+/// is aimed at the middle of the first element, and as far beyond, instead of running along an
+/// axis: it then crosses that element away from the joints, where a crossing could be counted twice
+/// or not at all. Whether its far end lies outside is not tested; where that is inside the contour,
+/// the answer is wrong.
 #include "gmkernel/GmContour.h"
 #include "gmkernel/GmRect.h"
 #include "gmkernel/GmStretch.h"
 #include "kernel/contour/ContourElements.h"
-
-// Inside and outside by the parity of crossings along a segment from the point. The segment is
-// aimed at the middle of the first element instead of running along an axis: it then crosses that
-// element away from the joints, where a crossing could be counted twice or not at all.
 
 namespace {
 

@@ -1,11 +1,17 @@
+/// @file
+/// Intersections of a contour with a curve and with another contour.
+///
+/// Every element is intersected by itself. A crossing at a joint is found with both elements and
+/// listed with the first: a point at the start of an element is left out when the element before
+/// had a point too. That it was the same one is not tested. Points are collected aside and handed
+/// over at the end: intersecting a contour with itself comes back to this list through the
+/// elements, and an exception must leave it empty. Cost: linear in the elements, elements times
+/// elements for two contours.
 #include <vector>
 
 #include "gmkernel/GmArc.h"
 #include "gmkernel/GmContour.h"
 #include "kernel/curves/VerifiedCast.h"
-
-// Points are collected aside and handed over at the end: intersecting a contour with itself comes
-// back to this list through the elements, and an exception must leave it empty.
 
 namespace {
 

@@ -1,3 +1,11 @@
+/// @file
+/// The sense of rotation of a contour.
+///
+/// It is the sign of the area of a polygon through the joints and through points of the arcs, by
+/// the sum of cross products of neighbouring radius vectors (the shoelace formula), which is right
+/// for any point of reference. Some chords an arc are enough, as the sign alone counts. A contour
+/// that crosses itself answers with the sense that encloses more; the area between arcs and their
+/// chords is left out.
 #include <cmath>
 
 #include "gmkernel/GmArc.h"
@@ -5,9 +13,6 @@
 #include "kernel/contour/ContourElements.h"
 #include "kernel/curves/VerifiedCast.h"
 #include "kernel/values/Constants.h"
-
-// The sense of rotation is the sign of the area of a polygon through the joints and through points
-// of the arcs, by the sum of cross products of neighbouring radius vectors (the shoelace formula).
 
 namespace {
 

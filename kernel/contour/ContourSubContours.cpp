@@ -1,3 +1,9 @@
+/// @file
+/// The sub-contours that operations leave in a contour.
+///
+/// The largest one is found in one pass: as enclosing carries over from box to box, the largest so
+/// far stands for all before it. The pass gives up at the first two that do not enclose each other,
+/// also where a later one would enclose both.
 #include <limits>
 #include <memory>
 

@@ -1,3 +1,10 @@
+/// @file
+/// Searches among the joints of a contour.
+///
+/// Each is one pass in which a later joint has to be clearly better than the best so far. "Clearly"
+/// means by a fixed number, which acts on distances in some searches and on squared distances in
+/// others, so that there it is wide near to the point and narrow far from it. With it the order of
+/// the elements has a say among nearly equal joints.
 #include <cmath>
 
 #include "gmkernel/GmContour.h"

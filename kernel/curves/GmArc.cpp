@@ -1,3 +1,11 @@
+/// @file
+/// The arc: its sweep over a circle.
+///
+/// Whether a point lies in the sweep is told by the cyclic order of the angles of start, point and
+/// end, and not by ranges, so that the seam of the angles at 180 degrees is no special case. The
+/// ends are accepted first and by their own tolerance, since the order of angles next to them is a
+/// matter of rounding. Ends, angles and radius are stored side by side; moving an end does not
+/// project it onto the circle.
 #include "gmkernel/GmArc.h"
 
 #include <cmath>

@@ -1,3 +1,11 @@
+/// @file
+/// What all curves share: the solution list and two general searches for nearest points.
+///
+/// Nearest points are sought among the ends, their foot points on the other curve and, for round
+/// curves, the points that face it. Where one of the curves is nearest at an end, that is exact;
+/// between inner points of two round curves it is a choice of candidates that can miss the nearest
+/// pair. Crossings are not looked for. A later candidate wins only when strictly nearer. Constant
+/// cost but for contours, which search their elements.
 #include "gmkernel/GmCurve.h"
 
 #include <cmath>

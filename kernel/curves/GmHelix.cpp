@@ -1,3 +1,9 @@
+/// @file
+/// The helix as an arc and a height.
+///
+/// All questions in the plane go to the arc below; the height at a point is linear in the angle
+/// swept up to it. Distances in space to a helix would need an equation without a closed solution:
+/// what asks for them is not provided, and the nearest point is that of the arc, lifted.
 #include "gmkernel/GmHelix.h"
 
 #include <cmath>

@@ -1,3 +1,10 @@
+/// @file
+/// The line as a point and a unit direction.
+///
+/// Nearest points are projections onto the direction. Distances go by the slope form instead, the
+/// one in which the intersection kernels decide about touching, so that both agree to the last
+/// digit; they leave z out. A bisector runs along the sum of both unit directions. Directions are
+/// not tested for being zero: what follows from a line through coincident points has no meaning.
 #include "gmkernel/GmLine.h"
 
 #include <cmath>

@@ -1,3 +1,11 @@
+/// @file
+/// The segment: a line with two ends.
+///
+/// A point lies on the segment when its foot on the supporting line does, by the parameter along
+/// the longer axis, and when it is near to the foot. The direction follows the ends and keeps its
+/// last value when they meet, so that a segment without length still has one. Where a foot lies
+/// beyond the ends the nearer end is the nearest point, as distance along a line grows away from
+/// the foot.
 #include "gmkernel/GmStretch.h"
 
 #include <utility>

@@ -1,3 +1,10 @@
+/// @file
+/// Vectors, their angles and quadrants.
+///
+/// The angle between vectors is the arc cosine of their scalar product with the sign of the cross
+/// product, which loses digits next to 0 and 180 degrees. The polar angle instead snaps to the
+/// axes: a component below the length tolerance counts as zero, so that vectors meant to be
+/// axis-parallel are. As this is a length, short vectors snap from far off the axes.
 #include "gmkernel/GmVec.h"
 
 #include <cmath>

@@ -1,3 +1,11 @@
+/// @file
+/// Removing the pieces that come too near to the source.
+///
+/// Pieces end at every crossing with the boundary of a band, so that a piece is wholly inside a
+/// band or wholly not, and one point of it, the halving point, decides for all. Caps and offsets of
+/// neighbours touch at exactly the distance; the calculation tolerance keeps rounding from removing
+/// them. A crossing next to the end of a piece does not cut it: then the point may stand for a
+/// piece of both kinds.
 #include "kernel/contour/offset/Removal.h"
 
 #include <cmath>

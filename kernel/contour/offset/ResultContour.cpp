@@ -1,3 +1,9 @@
+/// @file
+/// From a chain of pieces to a contour.
+///
+/// Ends that are equal as points become a joint as they are; wider gaps, which chaining allows up
+/// to three length tolerances, get a segment of their own, so that the contour stays a chain.
+/// Linear in the pieces.
 #include "kernel/contour/offset/ResultContour.h"
 
 #include <algorithm>

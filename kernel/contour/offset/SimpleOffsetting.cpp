@@ -1,5 +1,10 @@
 /// @file
 /// Offsetting element by element, with neighbours trimmed to each other and nothing else cut.
+///
+/// Parallels of neighbours that cross do so at the corner of the parallel chain, so each is cut
+/// back to that point. It fails where neighbours do not cross: at corners that open away from the
+/// offset. It does not notice parts that run backwards or come nearer to the source than the
+/// distance, and it does not trim the last element to the first. Linear in the elements.
 #include <cmath>
 #include <memory>
 #include <vector>

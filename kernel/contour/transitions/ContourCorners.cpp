@@ -1,5 +1,11 @@
 /// @file
 /// Rounding the corners of a contour.
+///
+/// The circle that touches both elements at a corner gives the arc between its two contacts, and
+/// the elements are cut back to them. Only a circle with exactly one contact on each element is
+/// taken, so that the contacts lie on the elements themselves. New arcs are passed over, so that
+/// what was rounded is not rounded again. Cost: linear in the elements, and for each arc the
+/// elements that move in the list.
 #include <memory>
 
 #include "gmkernel/GmArc.h"

@@ -1,5 +1,10 @@
 /// @file
 /// Roundings and chamfers at the junctions of a contour.
+///
+/// What comes into a corner is decided from its two elements alone; here it is put between them and
+/// the elements are cut back to its ends. Elements that have become too short are then removed from
+/// the whole contour, which shifts the indices behind them. Nothing is tested against other
+/// elements.
 #include <cmath>
 
 #include "gmkernel/GmArc.h"

@@ -1,3 +1,9 @@
+/// @file
+/// Which constructor of a circle rounds which pair of segments and arcs.
+///
+/// All constructors choose the circle by the way in which a path turns at the corner. Two segments
+/// are lines to their constructor, which wants both directions to leave the corner: the first is
+/// reversed.
 #include "kernel/contour/transitions/FilletCircle.h"
 
 #include "gmkernel/GmArc.h"

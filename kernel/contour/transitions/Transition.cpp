@@ -1,3 +1,12 @@
+/// @file
+/// The arc or chamfer that comes into a corner, from its two elements alone.
+///
+/// A rounding is the arc between the contacts of a touching circle. A chamfer joins the points in
+/// which a circle about the corner meets both elements: its radius is the distance, or gives the
+/// length. Between segments leg and length form an isosceles triangle, which is solved; beside an
+/// arc the length grows with the radius, and bisection finds it to within a fixed number, in a
+/// fixed number of steps. Where a circle does not meet both elements there is no transition. Other
+/// elements of the contour are not looked at.
 #include "kernel/contour/transitions/Transition.h"
 
 #include <algorithm>

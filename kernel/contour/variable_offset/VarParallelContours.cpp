@@ -3,7 +3,8 @@
 ///
 /// Every element moves by a vector that the quadrant of its direction chooses. Neighbours are
 /// trimmed or bridged; where the resulting chain crosses itself, walks from crossing to crossing
-/// take it apart into loops, of which those with the sense of the source are kept.
+/// take it apart into loops, of which those with the sense of the source are kept. A loop is not
+/// tested for its distance from the source. Cost: elements times elements.
 #include "gmkernel/GmContour.h"
 #include "kernel/contour/GmContourArray.h"
 #include "kernel/contour/variable_offset/ShiftedElements.h"

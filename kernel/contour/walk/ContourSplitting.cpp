@@ -1,5 +1,11 @@
 /// @file
 /// Splitting the elements of a contour.
+///
+/// An element is split by a copy of it: the copy starts at the point, the element ends there, and
+/// the copy follows it in the chain. The point is not projected, so an arc that is split within its
+/// tolerance of 0.01 gets an end off its circle. Splitting at quadrants goes through the four axis
+/// points in the order of travel, beginning with the first one ahead of the start, so that each one
+/// found lies on the rest that is still to be split.
 #include <memory>
 #include <vector>
 

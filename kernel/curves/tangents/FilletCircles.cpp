@@ -1,5 +1,11 @@
 /// @file
 /// Fillets between arcs, and between an arc and a segment.
+///
+/// A path that turns at a corner is rounded on the inner side of the turn. The fillet touches an
+/// arc from inside when the path turns the way the arc does, else from outside; with sides and
+/// kinds of contact known, the touching circles of the full figures give it. Where the path
+/// reverses there is no turn, and the side follows from the shape. Contacts may lie beyond the ends
+/// of the arcs: that is for the caller to test. Constant cost.
 #include <cmath>
 
 #include "gmkernel/GmAngle.h"

@@ -1,5 +1,11 @@
 /// @file
 /// Circles through points and circles that touch lines and circles.
+///
+/// The centre is equally far from all that is touched, so it is the crossing of two places of such
+/// points: perpendicular bisectors, bisectors of lines, parallels at the radius, and circles with
+/// the radius added or taken off. Two crossings are told apart by the order of the contacts around
+/// the centre. Without a crossing the circle is undefined; contacts are not tested against the
+/// bounds of curves. Constant cost.
 #include <cmath>
 
 #include "gmkernel/GmCircle.h"
