@@ -71,7 +71,8 @@ GmPoint GmContour::MinDist(double& d, GmPoint const& p, bool bPreferSP) const {
 
 GmPoint GmContour::MinDist(double& d, GmCurve const* c, bool) const {
     Approach best;
-    GmContour const* const other = c ? gmkernel_detail::curveAs<GmContour>(*c) : nullptr;
+    GmContour const* const other =
+        c && c->IsContour() ? gmkernel_detail::verifiedCast<GmContour>(*c) : nullptr;
     if (other) {
         for (int i = 0; i < other->ElementCount(); ++i) {
             approachCurve(*this, other->GetElement(i), best);

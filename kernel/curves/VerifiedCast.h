@@ -15,7 +15,6 @@
 class GmArc;
 class GmBeam;
 class GmCircle;
-class GmContour;
 class GmLine;
 class GmStretch;
 
@@ -41,8 +40,6 @@ template <>
 inline constexpr GmBase::eGmTypes kTagOf<GmCircle> = GmBase::eGmCircle;
 template <>
 inline constexpr GmBase::eGmTypes kTagOf<GmArc> = GmBase::eGmArc;
-template <>
-inline constexpr GmBase::eGmTypes kTagOf<GmContour> = GmBase::eGmContour;
 
 /// The curve as a `T` when its tag says that it is one, and it is; else null. A stretch is no
 /// GmLine here, and an arc no GmCircle.
