@@ -61,13 +61,14 @@ bool isOfTaggedClass(GmCurve const& curve) {
     }
 }
 
-/// Empty where the pair intersects, else what was thrown.
-std::string refusal(GmCurve const& a, GmCurve const& b) {
+/// Empty where the objects can be intersected, else what was thrown.
+std::string refusal(GmBase const& a, GmBase const& b) {
+    std::vector<GmPoint> points(1);
     try {
-        a.Intersection(&b);
+        Intersection(a, b, points);
         return "";
     } catch (std::runtime_error const& e) {
-        EXPECT_TRUE(a.GetPtSol().empty());
+        EXPECT_TRUE(points.empty());
         return e.what();
     }
 }
@@ -79,35 +80,62 @@ double generalDistance(GmCurve const& a, GmCurve const& b) {
     return d;
 }
 
+/// Every object that has got the tag of another one: the tag alone, not the fields.
+Curves withCopiedTags() {
+    Curves curves;
+    for (auto const& source : allClasses()) {
+        for (auto& object : allClasses()) {
+            GmCurve& curve = *object;
+            curve = *source;
+            curves.push_back(std::move(object));
+        }
+    }
+    return curves;
+}
+
+void expectRefusal(GmBase const& a, GmBase const& b, std::string const& expected) {
+    EXPECT_EQ(refusal(a, b), expected);
+    EXPECT_EQ(refusal(b, a), expected);
+}
+
+void expectGeneralDistance(GmCurve const& a, GmCurve const& b) {
+    EXPECT_EQ(Distance(a, b), generalDistance(a, b));
+    EXPECT_EQ(Distance(b, a), generalDistance(b, a));
+}
+
+/// A contour of three segments and an arc, in which one element has got another tag.
+void expectPassedOver(GmContour& contour, int index) {
+    GmCurve const& element = *contour.GetElement(index);
+    GmContour other = shapes::Moved(shapes::Square(7), 5, -3);
+    EXPECT_FALSE(gmkernel_detail::middleOf(&element).CreationOK());
+    EXPECT_EQ(contour.GetNewElement(index), nullptr);
+    EXPECT_FALSE(contour == GmContour(contour)) << "the clone has its own tag";
+    EXPECT_EQ(contour.MeltContours(&other, true), -1);
+    EXPECT_EQ(refusal(contour, other), "Function not found");
+    EXPECT_FALSE(contour.AddTrans(GmContour::eTransRadius, index, 1, true));
+    const std::unique_ptr<GmCurve> link(contour.GetElement(2)->Concat(element, 1));
+    EXPECT_TRUE(link == nullptr && !contour.GetElement(2)->Concat(element));
+    // Nothing to compare with: what counts is that they read no field that is not there.
+    contour.Dir(GmPoint(0, 0));
+    contour.Offsetting(-0.5, 1000, false);
+    gmkernel_detail::reachOf(element);
+}
+
 }  // namespace
 
 TEST(CopiedTag, IsNotBelievedByIntersectionsAndDistances) {
     const Curves partners = allClasses();
     int believed = 0;
     int refused = 0;
-    for (auto const& source : allClasses()) {
-        Curves objects = allClasses();
-        for (auto const& object : objects) {
-            GmCurve& curve = *object;
-            curve = *source;  // the tag, not the fields
-            ASSERT_EQ(curve.GetType(), source->GetType());
-            for (auto const& partner : partners) {
-                SCOPED_TRACE(PairName(curve.GetType(), partner->GetType()));
-                const bool fits = isOfTaggedClass(curve) && isOfTaggedClass(*partner);
-                const std::string expected = fits ? "" : "Function not found";
-                EXPECT_EQ(refusal(curve, *partner), expected);
-                EXPECT_EQ(refusal(*partner, curve), expected);
-                const double there = Distance(curve, *partner);
-                const double back = Distance(*partner, curve);
-                if (!isOfTaggedClass(curve)) {
-                    EXPECT_EQ(there, generalDistance(curve, *partner));
-                    EXPECT_EQ(back, generalDistance(*partner, curve));
-                }
-                ++(fits ? believed : refused);
-            }
-            EXPECT_GE(Distance(GmPoint(1, 2), curve), 0.0);
-            EXPECT_EQ(Distance(GmPoint(1, 2), curve), Distance(curve, GmPoint(1, 2)));
+    for (auto const& curve : withCopiedTags()) {
+        for (auto const& partner : partners) {
+            SCOPED_TRACE(PairName(curve->GetType(), partner->GetType()));
+            const bool fits = isOfTaggedClass(*curve) && isOfTaggedClass(*partner);
+            expectRefusal(*curve, *partner, fits ? "" : "Function not found");
+            if (!fits) expectGeneralDistance(*curve, *partner);
+            ++(fits ? believed : refused);
         }
+        EXPECT_EQ(Distance(GmPoint(1, 2), *curve), Distance(*curve, GmPoint(1, 2)));
     }
     EXPECT_GT(believed, 60) << "own tags, and those of base classes";
     EXPECT_GT(refused, 100);
@@ -121,9 +149,8 @@ TEST(CopiedTag, OfAPointIsNotBelievedEither) {
     for (GmCurve const* source :
          {static_cast<GmCurve const*>(&stretch), static_cast<GmCurve const*>(&square)}) {
         base = *source;
-        std::vector<GmPoint> points;
-        EXPECT_THROW(Intersection(point, stretch, points), std::runtime_error);
-        EXPECT_THROW(Intersection(square, point, points), std::runtime_error);
+        expectRefusal(point, stretch, "Function not found");
+        expectRefusal(point, square, "Function not found");
         EXPECT_EQ(Distance(point, stretch), std::numeric_limits<double>::max());
         EXPECT_EQ(Distance(stretch, point), std::numeric_limits<double>::max());
     }
@@ -143,28 +170,17 @@ TEST(CopiedTag, DerivedClassesAnswerAsTheirBase) {
 }
 
 TEST(CopiedTag, MakesAnElementOneThatContoursPassOver) {
+    int tried = 0;
     for (auto const& source : allClasses()) {
-        for (int kind = 0; kind < 2; ++kind) {
+        for (const int index : {0, 1}) {  // a segment, the arc
             GmContour contour = shapes::Path("0 0  10 0  ccw 10 5 10 10  0 10  0 0");
-            const int index = kind;  // the first segment, the arc
             GmCurve& element = *contour.GetElement(index);
             element = *source;
             if (isOfTaggedClass(element)) continue;
             SCOPED_TRACE(PairName(element.GetType(), source->GetType()));
-            EXPECT_FALSE(gmkernel_detail::middleOf(&element).CreationOK());
-            EXPECT_EQ(contour.GetNewElement(index), nullptr);
-            EXPECT_FALSE(contour == GmContour(contour)) << "the clone has its own tag";
-            GmContour other = shapes::Moved(shapes::Square(7), 5, -3);
-            EXPECT_EQ(contour.MeltContours(&other, true), -1);
-            EXPECT_THROW(contour.Intersection(&other), std::runtime_error);
-            contour.Dir(GmPoint(0, 0));
-            contour.BoundingRect();
-            gmkernel_detail::reachOf(element);
-            contour.AddTrans(GmContour::eTransChamferLength, 3, 1, true);
-            EXPECT_FALSE(contour.AddTrans(GmContour::eTransRadius, index, 1, true));
-            const std::unique_ptr<GmCurve> link(contour.GetElement(2)->Concat(element, 1));
-            EXPECT_EQ(link, nullptr);
-            EXPECT_FALSE(contour.GetElement(2)->Concat(element));
+            expectPassedOver(contour, index);
+            ++tried;
         }
     }
+    EXPECT_GT(tried, 8);
 }
