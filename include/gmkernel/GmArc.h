@@ -14,7 +14,7 @@
 ///
 /// A circle with start point, end point, their direction angles seen from the centre and a sense of
 /// rotation; the arc runs from start to end in that sense. Coincident ends (within m_scdPrecCalc)
-/// make a full circle; membership takes ends that are equal within m_scdPrec for one. `double`
+/// make a full circle; for Element() ends that are equal within m_scdPrec do so already. `double`
 /// angles are in radians unless the name ends in Deg. In() and Out() answer false.
 class GMKERNEL_EXPORT GmArc : public GmCircle, public boost::equality_comparable<GmArc> {
 public:
@@ -74,9 +74,9 @@ public:
     /// neither a stretch nor an arc.
     GmCurve* Concat(GmCurve const& next, int mode) override;
     /// Moves this end and the start of `next` (although it is passed as constant) to the crossing
-    /// of this full circle with the carrier of a stretch (the crossing nearer to this end) or with
-    /// the full circle of an arc (at the smaller angle from this end). Without a crossing true only
-    /// for an arc that already starts at this end.
+    /// of the supporting circle with the supporting line of a stretch (the crossing nearer to this
+    /// end) or with the supporting circle of an arc (the one at the smaller angle from this end).
+    /// Without a crossing true only for an arc that already starts at this end.
     bool Concat(GmCurve const& next) override;
     /// Swaps the ends and reverses the sense.
     void Invert() override;

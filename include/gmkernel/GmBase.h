@@ -9,10 +9,11 @@ class GmRect;
 
 /// Root of every geometric object: a type tag and a creation flag.
 ///
-/// The tag says of which class an object is and steers the dispatch of pairs of curves. The flag
-/// says whether the object was built from valid input: constructors never throw, they leave the
-/// flag false when they cannot build their object. Operations run on undefined operands as well,
-/// with whatever values these hold.
+/// The tag says of which class an object is and steers the dispatch of pairs of curves. Assignment
+/// through a reference to a base class copies it, see GmCurve::operator=. The flag says whether the
+/// object was built from valid input: constructors never throw, they leave the flag false when they
+/// cannot build their object. Operations run on undefined operands as well, with whatever values
+/// these hold.
 class GMKERNEL_EXPORT GmBase : public boost::equality_comparable<GmBase> {
 public:
     /// The class of an object.

@@ -11,7 +11,7 @@
 /// A ray that starts at its origin and runs to infinity along its direction.
 ///
 /// Bounded only in membership and nearest points: distances of points, parallels (which are lines),
-/// the bounding rectangle (of the origin), tangents and the trace are those of the carrying line.
+/// the bounding rectangle (of the origin), tangents and the trace are those of the supporting line.
 class GMKERNEL_EXPORT GmBeam : public GmLine, public boost::equality_comparable<GmBeam> {
 public:
     /// An undefined beam.
@@ -32,11 +32,11 @@ public:
     /// A new beam; the caller owns it.
     GmBeam* Clone() const override;
     /// Reverses the direction in place: the origin stays, the ray covers the other half of the
-    /// carrier.
+    /// supporting line.
     void Invert() override;
     using GmLine::Element;
-    /// Is the foot of the point on the carrier strictly nearer than `eps`, and ahead of the origin
-    /// or equal to it?
+    /// Is the foot of the point on the supporting line strictly nearer than `eps`, and ahead of the
+    /// origin or equal to it?
     bool Element(GmPoint const& p, double eps) const override;
     using GmLine::MinDist;
     /// The foot of the point where it lies on the ray, else the origin; the flag is ignored.

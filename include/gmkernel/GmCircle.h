@@ -78,7 +78,7 @@ public:
     GmCircle(GmArc const& a1, GmArc const& a2, double r, bool bOther);
     /// The fillet of radius `r` between an arc and a segment, chosen as between two arcs.
     /// @param a the arc
-    /// @param s the segment; only its carrier counts
+    /// @param s the segment; only its supporting line counts
     /// @param r the radius, positive
     /// @param bArcFirst the end of the arc joins the start of the segment, else the end of the
     ///        segment joins the start of the arc
@@ -157,8 +157,8 @@ public:
     double Dist(GmLine const& line) const;
     /// The gap between two circles, also when one lies inside the other; 0 where they meet.
     double Dist(GmCircle const& circle) const;
-    /// Intersects the full circle with the carrier of a straight curve; the points replace the
-    /// solution list. Only touching is judged by the curve itself: a stretch has to reach the
+    /// Intersects the full circle with the supporting line of a straight curve; the points replace
+    /// the solution list. Only touching is judged by the curve itself: a stretch has to reach the
     /// point. A line up to m_scdPrec outside the circle touches it.
     ///
     /// Known limit: a line parallel to the y axis touches only up to about 1e-9 / R outside.

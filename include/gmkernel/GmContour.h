@@ -39,6 +39,17 @@ struct GmContIntPoint;
 /// hand out new objects that the caller owns. Element indices run from 0 to ElementCount()-1; an
 /// index outside answers null or changes nothing.
 ///
+/// A contour has no move: returning one by value, where the compiler does not elide it, and
+/// assigning a temporary clone the elements. Assigning through a reference to GmCurve or GmBase
+/// copies creation flag and type tag and leaves the elements. A contour with the tag of another
+/// class is refused by intersections like a pair that cannot be intersected, and distances from it
+/// are still those from its elements.
+///
+/// Elements that cannot be intersected (a helix, a rectangle) make every operation throw that
+/// intersects the elements: Intersection(), IntersectionWithCurve(), In() and Out(), SplitAt() with
+/// a curve, and AddElement() and Close() with validation. What is thrown is std::runtime_error
+/// "Function not found"; the contour then is unchanged, with an empty solution list.
+///
 /// Unless said otherwise a query costs time linear in the number of elements, and it writes the
 /// solution lists of the elements: one contour must not be used from two threads at once.
 class GMKERNEL_EXPORT GmContour : public GmCurve,
@@ -111,8 +122,12 @@ public:
     /// Known limit: the parity is right only where the far end of that segment lies outside. For a
     /// convex contour this holds for all points inside it, but not for points outside it that are
     /// within its rectangle and close to the middle of the first element.
+    /// @throw std::runtime_error "Function not found" for a point off the contour and within its
+    ///        rectangle, when an element cannot be intersected (a helix, a rectangle)
     bool In(GmPoint const& p) override;
-    /// True when the point is neither on the contour nor In(), true without elements.
+    /// True when the point is neither on the contour nor In(), true without elements. Replaces the
+    /// solution list.
+    /// @throw std::runtime_error as In()
     bool Out(GmPoint const& p) override;
     /// Not provided for contours: an undefined point.
     GmPoint NP(GmPoint const& p) const override;
@@ -137,11 +152,14 @@ public:
     /// @param bAtEnds false: only points that are no end of either element involved count;
     ///        true: points at ends count too, each joint once
     /// @return the number of points
+    /// @throw std::runtime_error "Function not found" when two elements cannot be intersected (one
+    ///        is a helix or a rectangle); the list is empty then
     virtual int Intersection(GmContour const* other, bool bAtEnds) const;
     /// Intersects this contour with any curve and leaves the points in the solution list, in the
     /// order of the elements; a crossing at a joint is listed once. A null curve gives no points.
-    /// @throw std::runtime_error "Function not found" for a curve that cannot be intersected (a
-    ///        helix or a rectangle); the list is empty then
+    /// @throw std::runtime_error "Function not found" for a curve or an element that cannot be
+    ///        intersected (a helix or a rectangle); the list is empty then. Without elements there
+    ///        is nothing to throw for.
     void IntersectionWithCurve(GmCurve const* c) const;
 
     /// True for the same contour, and for chains of equal count whose elements are pairwise of the
@@ -166,6 +184,9 @@ public:
     GmContour const* GetSubContour(int index) const;
     /// The sub-contour whose bounding rectangle encloses those of all others; null when there is
     /// none. Sub-contours without elements are passed over.
+    ///
+    /// Known limit: null also where a rectangle in the list neither encloses the largest one before
+    /// it nor lies inside it, even when a later one encloses both.
     GmContour* GetMaxSubContour();
     /// The sub-contour whose start is nearest to the point, the first of equally near ones; null
     /// without sub-contours. Sub-contours without elements are passed over.
@@ -192,8 +213,9 @@ public:
     /// @param bValidate with the tests against the whole contour
     /// @param id identifier stored with the element
     /// @return false when the curve is refused and nothing was appended
-    /// @throw std::runtime_error "Function not found" with validation, for a curve that cannot be
-    ///        intersected
+    /// @throw std::runtime_error "Function not found" with validation, when the curve or an element
+    ///        cannot be intersected (a helix, a rectangle); nothing is appended then. A first
+    ///        element is not tested.
     bool AddElement(GmCurve const* c, bool bValidate, long id);
     bool AddElement(GmCurve const& c, bool bValidate, long id);
     /// The same with a record from the heap, which is taken over with its curve and keeps its
@@ -209,6 +231,7 @@ public:
     /// Appends a segment with identifier 0 from the end of the chain to its start unless they meet
     /// already. Validation may refuse the segment; the contour then stays open. Nothing happens
     /// without elements.
+    /// @throw std::runtime_error as AddElement()
     void Close(bool bValidate);
 
     /// The point of the contour nearest to `p`; among points equally near to it (within 1e-4) one
@@ -262,6 +285,7 @@ public:
     /// AddElement() with the curve, the validation flag and the identifier, then AddTrans() between
     /// it and the element before it. False when the curve is refused, when there is no transition
     /// (the curve stays appended) and for the first element.
+    /// @throw std::runtime_error as AddElement()
     bool AddElementAndTrans(GmCurve const* c, bool bValidate, long id, eTransType type,
                             double value, bool bIdOfFirst);
     bool AddElementAndTrans(GmCurve const& c, bool bValidate, long id, eTransType type,
@@ -287,7 +311,8 @@ public:
     bool SplitAt(GmPoint const& p);
     /// Splits at every point in which a curve meets the contour; replaces the solution list. False
     /// when they do not meet.
-    /// @throw std::runtime_error "Function not found" for a curve that cannot be intersected
+    /// @throw std::runtime_error "Function not found" when the curve or an element cannot be
+    ///        intersected (a helix, a rectangle); nothing is split then
     bool SplitAt(GmCurve* curve);
     /// Splits at the point nearest to `p`; false without elements.
     bool SplitAtMinDist(GmPoint const& p);
@@ -310,8 +335,8 @@ public:
     /// Known limits: where sides lie flush on each other there are no crossings; only the joints at
     /// their ends count. Contours that touch along a side may yield one loop, parts or none. A
     /// crossing within m_scdPrec of a joint can be lost when the next element misses it by more
-    /// than that; a loop may then not come back. Nor does one that starts a full circle, split it
-    /// first.
+    /// than that; a loop may then not come back. Nor does a loop that starts on a full circle:
+    /// split the circle first.
     /// @param other the other contour; may be one of the sub-contours
     /// @param bSameSense keeps only loops with the sense of this contour
     /// @return the number of sub-contours, 0 for contours apart from each other; -1, with nothing
@@ -326,10 +351,12 @@ public:
     ///
     /// Corners that open away from the offset side are rounded by arcs of radius |d|; what would
     /// come closer than |d| to the contour is cut away, so that one contour may yield several
-    /// results or none. A corner carries the identifier of the element that ends there. The result
-    /// of an open contour goes on with the half circle around its end. A distance below m_scdPrec
-    /// in magnitude stores a copy, one that is not finite nothing. The elements of this contour are
-    /// not changed. Cost: for each element the runs of pieces in the span, and the pieces near it.
+    /// results or none. A corner carries the identifier of the element that ends there; identifiers
+    /// are carried as int, so that one outside -2147483648..2147483647 comes out as another number.
+    /// The result of an open contour goes on with the half circle around its end. A distance below
+    /// m_scdPrec in magnitude stores a copy, one that is not finite nothing. The elements of this
+    /// contour are not changed. Cost: for each element the runs of pieces in the span, and the
+    /// pieces near it.
     ///
     /// Known limits: results can be lost or stay open beside sides that are tilted from the
     /// vertical by about 1e-6 or less, beside a first element shorter than 0.001, where an arc
@@ -430,7 +457,7 @@ private:
     /// Splits an element at a point of it other than its ends; false where there is no such point.
     GMKERNEL_NO_EXPORT bool SplitInside(int index, GmPoint const& p);
     int FindNextPoint(GmPoint p, GmCurve* curve, int index,
-                      KxArray<GmContIntPoint*, GmContIntPoint*> const& passages) const;
+                      KxArray<GmContIntPoint*, GmContIntPoint*> const& crossings) const;
     GmContour* GetSubContour_private(int index) const;
     /// Replaces the sub-contours by one copy of this chain that keeps the identifiers.
     void CopyContourToSubContour();
@@ -439,7 +466,7 @@ private:
 /// Picks where a path along the offsets of a contour starts: at the element with the smallest
 /// identifier, of several the one whose start is nearest to the start of the contour moved sideways
 /// by the distance. Of an open contour with exactly one open offset only that one is searched, for
-/// the first element with the smallest identifier.
+/// the first element with the smallest identifier. Identifiers from 2147483647 on count as none.
 /// @param c the contour; null or without elements answers false
 /// @param count how many of its sub-contours are searched; more than there are stand for all
 /// @param d the signed distance of the offsets, positive to the right

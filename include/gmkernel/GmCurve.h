@@ -36,6 +36,12 @@ public:
     /// Releases the solution list.
     ~GmCurve() override;
     /// Copies type tag, creation flag and solution list; nothing when assigned to itself.
+    ///
+    /// Assigning through a reference to GmCurve therefore gives an object the tag of another class
+    /// and leaves its fields. Such an object is not taken for what it is not: where its tag decides
+    /// and it is not of the class named there (nor of one derived from it), an intersection is
+    /// refused like that of a pair of kinds that cannot be intersected, a distance is that of the
+    /// general nearest-point search, and a contour treats it as neither a segment nor an arc.
     GmCurve& operator=(GmCurve const& other);
 
     /// A new heap copy of the curve in its own class; the caller owns it.
@@ -57,7 +63,8 @@ public:
     /// reverses the order of their points. Coincident curves have no intersection.
     /// @return the number of points found
     /// @throw std::runtime_error "Function not found" for a pair of kinds that cannot be
-    ///        intersected (a helix or a rectangle); the list is empty then
+    ///        intersected (a helix or a rectangle takes part, also as an element of a contour), and
+    ///        for an object that is not of the class its tag names; the list is empty then
     virtual int Intersection(GmCurve const* other) const;
     /// Point `i` of the solution list; the defined point (0, 0, 0) when `i` is out of range.
     virtual GmPoint GetSolution(unsigned int i) const;
@@ -70,8 +77,8 @@ public:
     /// A new curve that connects this curve's end with the start of `next`, owned by the caller:
     /// a stretch for mode 0, an arc leaving tangentially for mode 1; here null.
     virtual GmCurve* Concat(GmCurve const& next, int mode);
-    /// Extends or cuts this curve's end and the start of `next` to the crossing of their carriers;
-    /// moves the start of `next` although it is passed as constant.
+    /// Extends or cuts this curve's end and the start of `next` to the crossing of their supporting
+    /// lines and circles; moves the start of `next` although it is passed as constant.
     /// @return false, with nothing changed, when there is none; here always
     virtual bool Concat(GmCurve const& next);
     /// Reverses the sense in which the curve is travelled; here nothing.
@@ -165,8 +172,7 @@ private:
 /// Intersects two objects and stores the points in `result`, which is cleared first. The same as
 /// GmCurve::Intersection, but no curve's own solution list is touched unless a contour takes part.
 /// @throw std::runtime_error "Function not found" for a pair that cannot be intersected; `result`
-/// is
-///        empty then
+///        is empty then
 GMKERNEL_EXPORT void Intersection(GmBase const& a, GmBase const& b, std::vector<GmPoint>& result);
 
 /// Orders points by their distance from a curve's start, for sorting points along the curve.

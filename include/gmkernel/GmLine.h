@@ -94,20 +94,20 @@ public:
     bool Element(GmPoint const& p, double eps) const override;
     /// Membership within m_scdPrec; shared unchanged by beams and stretches.
     bool Element(GmPoint const& p) const override;
-    /// The distance from the carrying line in the x-y plane (z is ignored), by the slope form
+    /// The distance from the supporting line in the x-y plane (z is ignored), by the slope form
     /// |y - kx - d| / sqrt(k^2 + 1).
     double Dist(GmPoint const& p) const override;
     /// The distance from the start point.
     double DistSP(GmPoint const& p) const override;
     using GmCurve::MinDist;
-    /// The projection of the point onto the carrying line, SP + t Dir with t = (p - SP) . Dir; the
-    /// flag is ignored.
+    /// The projection of the point onto the supporting line, SP + t Dir with t = (p - SP) . Dir;
+    /// the flag is ignored.
     GmPoint MinDist(GmPoint const& p, bool bPreferSP) const override;
     /// The start point.
     GmPoint SP() const override;
     /// The nearest point of the curve, on beams and stretches within their bounds.
     GmPoint NP(GmPoint const& p) const override;
-    /// A copy of the carrying line, whatever the point.
+    /// A copy of the supporting line, whatever the point.
     GmLine Tangent(GmPoint const& p) const override;
     /// A new line at the signed distance `d`, positive to the right; the caller owns it.
     GmCurve* GetParallel(double d) const override;
@@ -131,14 +131,14 @@ public:
     /// The side of a point seen along the direction: 0 within m_scdPrec of the curve, -1 left,
     /// +1 right.
     int PointPos(GmPoint const& p) const;
-    /// Intersects the carrying lines, the bounds of beams and stretches ignored. The point replaces
-    /// this line's solution list; its z comes from this line's start point, or from `line`'s where
-    /// only that one is parallel to the y axis.
-    /// @return 0 (parallel or coincident carriers) or 1
+    /// Intersects the supporting lines, the bounds of beams and stretches ignored. The point
+    /// replaces this line's solution list; its z comes from this line's start point, or from
+    /// `line`'s where only that one is parallel to the y axis.
+    /// @return 0 (parallel or coincident lines) or 1
     int IntersectionWithLine(GmLine const& line) const;
     /// The line with the opposite direction.
     GmLine Inverted() const;
-    /// The same carrier, in either sense.
+    /// The same supporting line, in either sense.
     bool operator==(GmLine const& line) const;
 
 protected:

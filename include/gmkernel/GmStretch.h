@@ -54,9 +54,9 @@ public:
     /// normals coincide; else a stretch. Null for any other mode, and for mode 1 where `next` is
     /// neither a stretch nor an arc.
     GmCurve* Concat(GmCurve const& next, int mode) override;
-    /// Extends or shortens this segment to the carrier of a stretch or the full circle of an arc
-    /// and moves the start of `next` there (although it is passed as constant). Of two points on a
-    /// circle the one at the smaller angle from this end, seen from the centre.
+    /// Extends or shortens this segment to the supporting line of a stretch or the supporting
+    /// circle of an arc and moves the start of `next` there (although it is passed as constant).
+    /// Of two points on a circle the one at the smaller angle from this end, seen from the centre.
     bool Concat(GmCurve const& next) override;
     /// Swaps the ends and reverses the direction.
     void Invert() override;

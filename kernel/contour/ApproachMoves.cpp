@@ -1,5 +1,10 @@
 /// @file
 /// Contours that lead onto a curve and off it.
+///
+/// Every kind of move is built once, from the free point to the curve: a departure is the approach
+/// to the curve's end against its tangent, and is reversed at last. Leads go over one auxiliary
+/// point; the arcs touch the curve because their centre lies on its normal. Nothing is tested
+/// against the rest of the curve: a move may cross it. Constant cost.
 #include <cmath>
 
 #include "gmkernel/GmAngle.h"

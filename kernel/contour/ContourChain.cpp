@@ -4,8 +4,8 @@
 #include "gmkernel/GmStretch.h"
 #include "kernel/contour/ContourElements.h"
 
-using gmkernel_detail::ChainEnd;
-using gmkernel_detail::ChainStart;
+using gmkernel_detail::chainEnd;
+using gmkernel_detail::chainStart;
 
 // Only the pointers move: every record keeps its fields.
 void GmContour::Invert() {
@@ -25,8 +25,8 @@ GmContour GmContour::Inverted() const {
 
 void GmContour::Close(bool bValidate) {
     if (ElementCount() == 0) return;
-    const GmPoint start = ChainStart(*this);
-    const GmPoint end = ChainEnd(*this);
+    const GmPoint start = chainStart(*this);
+    const GmPoint end = chainEnd(*this);
     if (end == start) return;
     const GmStretch closing(end, start);
     AddElement(&closing, bValidate, 0);
@@ -39,7 +39,7 @@ bool GmContour::CheckContour() {
         if (!(GetElement(i)->SP() == end)) return false;
         end = GetElement(i)->EP();
     }
-    return !m_bClosed || end == ChainStart(*this);
+    return !m_bClosed || end == chainStart(*this);
 }
 
 void GmContour::Translation(GmVec const& v) {

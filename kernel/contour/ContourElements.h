@@ -6,16 +6,12 @@
 namespace gmkernel_detail {
 
 /// The middle point of a segment or an arc; undefined for any other curve and for null.
-GmPoint MiddleOf(GmCurve const* element);
+GmPoint middleOf(GmCurve const* element);
 
 /// The start of the chain; the contour must have an element.
-inline GmPoint ChainStart(GmContour const& contour) {
-    return contour.GetElement(0)->SP();
-}
+GmPoint chainStart(GmContour const& contour);
 
 /// The end of the chain; the contour must have an element.
-inline GmPoint ChainEnd(GmContour const& contour) {
-    return contour.GetElement(static_cast<int>(contour.ElementCount()) - 1)->EP();
-}
+GmPoint chainEnd(GmContour const& contour);
 
 }  // namespace gmkernel_detail

@@ -3,15 +3,21 @@
 #include "gmkernel/GmLine.h"
 #include "gmkernel/GmRect.h"
 #include "gmkernel/GmStretch.h"
+#include "kernel/contour/ContourElements.h"
+#include "kernel/curves/VerifiedCast.h"
+
+using gmkernel_detail::curveAs;
 
 namespace {
 
-bool SameElement(GmCurve const& a, GmCurve const& b) {
-    if (a.GetType() != b.GetType()) return false;
-    if (a.IsStretch()) {
-        return static_cast<GmStretch const&>(a) == static_cast<GmStretch const&>(b);
-    }
-    return a.IsArc() && static_cast<GmArc const&>(a) == static_cast<GmArc const&>(b);
+/// Are both segments, or both arcs, and equal as such?
+bool sameElement(GmCurve const& a, GmCurve const& b) {
+    auto const* const stretchA = curveAs<GmStretch>(a);
+    auto const* const stretchB = curveAs<GmStretch>(b);
+    if (stretchA && stretchB) return *stretchA == *stretchB;
+    auto const* const arcA = curveAs<GmArc>(a);
+    auto const* const arcB = curveAs<GmArc>(b);
+    return arcA && arcB && *arcA == *arcB;
 }
 
 }  // namespace
@@ -35,6 +41,10 @@ bool GmContour::Element(GmPoint const& p) const {
     return Element(p, m_scdPrec);
 }
 
+GmPoint GmContour::GetHP(int index) {
+    return gmkernel_detail::middleOf(GetElement(index));
+}
+
 GmLine GmContour::Tangent(GmPoint const& p) const {
     GmCurve const* const element = GetElement(LastPointElem(p));
     return element ? element->Tangent(p) : GmLine();
@@ -48,7 +58,7 @@ bool GmContour::operator==(GmContour const& other) const {
     if (this == &other) return true;
     if (ElementCount() != other.ElementCount()) return false;
     for (int i = 0; i < ElementCount(); ++i) {
-        if (!SameElement(*GetElement(i), *other.GetElement(i))) return false;
+        if (!sameElement(*GetElement(i), *other.GetElement(i))) return false;
     }
     return true;
 }

@@ -1,3 +1,9 @@
+/// @file
+/// The sub-contours that operations leave in a contour.
+///
+/// The largest one is found in one pass: as enclosing carries over from box to box, the largest so
+/// far stands for all before it. The pass gives up at the first two that do not enclose each other,
+/// also where a later one would enclose both.
 #include <limits>
 #include <memory>
 
@@ -6,11 +12,11 @@
 #include "kernel/contour/ContourElements.h"
 #include "kernel/contour/GmContourArray.h"
 
-using gmkernel_detail::ChainStart;
+using gmkernel_detail::chainStart;
 
 namespace {
 
-bool Encloses(GmRect const& outer, GmRect const& inner) {
+bool encloses(GmRect const& outer, GmRect const& inner) {
     return outer.Or(inner) == outer;
 }
 
@@ -36,8 +42,8 @@ GmContour* GmContour::GetMaxSubContour() {
         GmContour* const candidate = (*m_pSubConts)[i];
         if (!candidate || candidate->ElementCount() == 0) continue;
         const GmRect candidateBox = candidate->BoundingRect();
-        if (largest && Encloses(box, candidateBox)) continue;
-        if (largest && !Encloses(candidateBox, box)) return nullptr;
+        if (largest && encloses(box, candidateBox)) continue;
+        if (largest && !encloses(candidateBox, box)) return nullptr;
         largest = candidate;
         box = candidateBox;
     }
@@ -50,7 +56,7 @@ GmContour* GmContour::GetNearSubContour(GmPoint const& p) {
     for (int i = 0; i < m_pSubConts->GetCount(); ++i) {
         GmContour* const candidate = (*m_pSubConts)[i];
         if (!candidate || candidate->ElementCount() == 0) continue;
-        const double candidateDist = p.Dist(ChainStart(*candidate));
+        const double candidateDist = p.Dist(chainStart(*candidate));
         if (nearest && !(candidateDist < dist)) continue;
         nearest = candidate;
         dist = candidateDist;

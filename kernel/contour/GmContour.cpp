@@ -6,11 +6,12 @@
 #include "gmkernel/GmArc.h"
 #include "gmkernel/GmStretch.h"
 #include "kernel/contour/GmContourArray.h"
+#include "kernel/curves/VerifiedCast.h"
 
 namespace {
 
-// What does not join is left out, as the result of AddElement() says.
-void AppendClones(GmContour& target, GmContour const& source) {
+/// What does not join is left out, as the result of AddElement() says.
+void appendClones(GmContour& target, GmContour const& source) {
     for (int i = 0; i < source.ElementCount(); ++i) {
         target.AddElement(source.GetElement(i), false, 0);
     }
@@ -29,7 +30,7 @@ GmContour::GmContour() : m_pElements(nullptr), m_bClosed(false), m_pSubConts(nul
 // Delegates, so that the destructor cleans up when cloning an element throws.
 GmContour::GmContour(GmContour const& source) : GmContour() {
     GmCurve::operator=(source);
-    AppendClones(*this, source);
+    appendClones(*this, source);
 }
 
 GmContour::~GmContour() {
@@ -98,9 +99,10 @@ GmCurve* GmContour::GetElement(int index) {
 GmCurve* GmContour::GetNewElement(int index) const {
     GmCurve const* const element = GetElement(index);
     if (!element) return nullptr;
-    if (element->IsStretch()) return new GmStretch(static_cast<GmStretch const&>(*element));
-    if (element->IsArc()) return new GmArc(static_cast<GmArc const&>(*element));
-    return nullptr;
+    if (auto const* stretch = gmkernel_detail::curveAs<GmStretch>(*element))
+        return new GmStretch(*stretch);
+    auto const* const arc = gmkernel_detail::curveAs<GmArc>(*element);
+    return arc ? new GmArc(*arc) : nullptr;
 }
 
 bool GmContour::IsClosed() const {

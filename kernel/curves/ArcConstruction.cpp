@@ -1,5 +1,11 @@
 /// @file
 /// The constructors of arcs.
+///
+/// An arc is centre, radius, ends, angles and sense, whatever it is built from. Three points give
+/// the centre as the crossing of two perpendicular bisectors. Ends and a radius give two centres,
+/// where the circle about the start crosses the bisector; their sweeps add up to a full turn, so
+/// the sweep picks one. A given centre that is not equally far from both ends moves onto their
+/// bisector. Input that determines no arc leaves one that is not created. Constant cost.
 #include <cmath>
 
 #include "gmkernel/GmArc.h"

@@ -8,6 +8,7 @@
 
 #include "gmkernel/GmBeam.h"
 #include "gmkernel/GmCircle.h"
+#include "kernel/curves/VerifiedCast.h"
 
 namespace {
 
@@ -59,10 +60,8 @@ GmPoint GmCircle::NP(GmPoint const& p) const {
 
 GmPoint GmCircle::NP(GmCurve const* c) const {
     if (c == nullptr) return GmPoint();
-    if (c->IsLine() || c->IsStretch() || c->IsBeam()) {
-        return facingStraight(*this, *static_cast<GmLine const*>(c));
-    }
-    if (c->IsCircle() || c->IsArc()) return facingRound(*this, *static_cast<GmCircle const*>(c));
+    if (auto const* line = gmkernel_detail::straightPart(*c)) return facingStraight(*this, *line);
+    if (auto const* circle = gmkernel_detail::roundPart(*c)) return facingRound(*this, *circle);
     return GmPoint();
 }
 

@@ -1,7 +1,15 @@
+/// @file
+/// The box of all points that can come out of an intersection with a curve.
+///
+/// Points of an intersection are kept where membership tests accept them, and these accept points
+/// beside the curve. So the box is that of the curve, the stored angles and ends of an arc
+/// included, which may differ a little, and is grown by more than any such tolerance. It is never
+/// too small for segments and arcs; it may be larger than needed. Endless curves have no such box.
 #include "kernel/curves/CurveBox.h"
 
 #include "gmkernel/GmArc.h"
 #include "gmkernel/GmRect.h"
+#include "kernel/curves/VerifiedCast.h"
 
 namespace gmkernel_detail {
 
@@ -38,8 +46,8 @@ CurveBox boxOf(GmPoint const& p) {
 }
 
 CurveBox reachOf(GmCurve const& curve) {
-    const GmRect box =
-        curve.IsArc() ? arcReach(static_cast<GmArc const&>(curve)) : curve.BoundingRect();
+    auto const* const arc = curveAs<GmArc>(curve);
+    const GmRect box = arc != nullptr ? arcReach(*arc) : curve.BoundingRect();
     return {box.Left() - kReachMargin, box.Right() + kReachMargin, box.Bottom() - kReachMargin,
             box.Top() + kReachMargin};
 }

@@ -1,6 +1,12 @@
+/// @file
+/// The arc: its sweep over a circle.
+///
+/// Whether a point lies in the sweep is told by the cyclic order of the angles of start, point and
+/// end, and not by ranges, so that the seam of the angles at 180 degrees is no special case. The
+/// ends are accepted first and by their own tolerance, since the order of angles next to them is a
+/// matter of rounding. Ends, angles and radius are stored side by side; moving an end does not
+/// project it onto the circle.
 #include "gmkernel/GmArc.h"
-
-#include <wx/string.h>
 
 #include <cmath>
 #include <utility>
@@ -9,8 +15,12 @@
 #include "gmkernel/GmMatrix.h"
 #include "gmkernel/GmStretch.h"
 #include "kernel/curves/Joining.h"
+#include "kernel/curves/VerifiedCast.h"
 #include "kernel/curves/kernels/AngleOrder.h"
 #include "kernel/values/Constants.h"
+#include "kernel/values/TraceText.h"
+
+using gmkernel_detail::curveAs;
 
 namespace {
 
@@ -60,10 +70,10 @@ bool GmArc::Trim(GmCurve* next) {
 
 GmCurve* GmArc::Concat(GmCurve const& next, int mode) {
     GmLine normalAtNext;
-    if (next.IsStretch()) {
-        normalAtNext = GmLine(static_cast<GmStretch const&>(next), next.SP(), ePLNormal);
-    } else if (next.IsArc()) {
-        normalAtNext = GmLine(next.SP(), static_cast<GmArc const&>(next).M());
+    if (auto const* stretch = curveAs<GmStretch>(next)) {
+        normalAtNext = GmLine(*stretch, next.SP(), ePLNormal);
+    } else if (auto const* arc = curveAs<GmArc>(next)) {
+        normalAtNext = GmLine(next.SP(), arc->M());
     }
     return gmkernel_detail::connectingCurve(*this, GmLine(m_EP, m_M), next, normalAtNext, mode);
 }
@@ -72,12 +82,12 @@ bool GmArc::Concat(GmCurve const& next) {
     const GmCircle circle(*this);
     int count = 0;
     bool takeSecond = false;
-    if (next.IsStretch()) {
-        count = circle.IntersectionWithLine(GmLine(static_cast<GmStretch const&>(next)));
+    if (auto const* stretch = curveAs<GmStretch>(next)) {
+        count = circle.IntersectionWithLine(GmLine(*stretch));
         takeSecond =
             count > 1 && m_EP.Dist(circle.GetSolution(0)) > m_EP.Dist(circle.GetSolution(1));
-    } else if (next.IsArc()) {
-        count = circle.IntersectionWithCircle(static_cast<GmArc const&>(next));
+    } else if (auto const* arc = curveAs<GmArc>(next)) {
+        count = circle.IntersectionWithCircle(*arc);
         if (count == 0) return next.SP() == m_EP;
         takeSecond = count > 1 && m_EP.AngDist(circle.GetSolution(0), m_M) >
                                       m_EP.AngDist(circle.GetSolution(1), m_M);
@@ -188,10 +198,8 @@ void GmArc::Transform(GmMatrix const& m) {
 }
 
 std::string GmArc::GetTraceString() const {
-    return wxString::Format("circ%d (%0.5f, %0.5f) - (%0.5f, %0.5f) mp (%0.5f, %0.5f)",
-                            m_eDir == eRotCW ? 2 : 3, m_SP.X(), m_SP.Y(), m_EP.X(), m_EP.Y(),
-                            m_M.X(), m_M.Y())
-        .ToStdString();
+    return gmkernel_detail::arcText("circ", m_eDir == eRotCW, m_SP.X(), m_SP.Y(), m_EP.X(),
+                                    m_EP.Y(), m_M.X(), m_M.Y());
 }
 
 GmBase::eRotDir GmArc::Dir() const {

@@ -1,13 +1,12 @@
 #include "gmkernel/GmCircle.h"
 
-#include <wx/string.h>
-
 #include <algorithm>
 #include <cmath>
 
 #include "gmkernel/GmRect.h"
 #include "kernel/curves/SupportHits.h"
 #include "kernel/values/Constants.h"
+#include "kernel/values/TraceText.h"
 
 GmCircle::GmCircle() {
     m_eType = eGmCircle;
@@ -108,7 +107,7 @@ void GmCircle::Translation(GmVec const& v) {
 void GmCircle::Transform(GmMatrix const& /*m*/) {}
 
 std::string GmCircle::GetTraceString() const {
-    return wxString::Format("circ (%0.5f, %0.5f) R = %0.5f", m_M.X(), m_M.Y(), m_dR).ToStdString();
+    return gmkernel_detail::circleText(m_M.X(), m_M.Y(), m_dR);
 }
 
 GmPoint GmCircle::M() const {
@@ -143,13 +142,13 @@ double GmCircle::Dist(GmCircle const& circle) const {
 }
 
 int GmCircle::IntersectionWithLine(GmLine const& line) const {
-    const auto hits = gmkernel_detail::carrierHits(*this, line);
+    const auto hits = gmkernel_detail::supportHits(*this, line);
     m_ptSol.assign(hits.begin(), hits.end());
     return static_cast<int>(m_ptSol.size());
 }
 
 int GmCircle::IntersectionWithCircle(GmCircle const& circle) const {
-    const auto hits = gmkernel_detail::carrierHits(*this, circle);
+    const auto hits = gmkernel_detail::supportHits(*this, circle);
     m_ptSol.assign(hits.begin(), hits.end());
     return static_cast<int>(m_ptSol.size());
 }

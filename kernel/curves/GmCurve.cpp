@@ -1,3 +1,11 @@
+/// @file
+/// What all curves share: the solution list and two general searches for nearest points.
+///
+/// Nearest points are sought among the ends, their foot points on the other curve and, for round
+/// curves, the points that face it. Where one of the curves is nearest at an end, that is exact;
+/// between inner points of two round curves it is a choice of candidates that can miss the nearest
+/// pair. Crossings are not looked for. A later candidate wins only when strictly nearer. Constant
+/// cost but for contours, which search their elements.
 #include "gmkernel/GmCurve.h"
 
 #include <cmath>
@@ -6,16 +14,7 @@
 #include "gmkernel/GmCircle.h"
 #include "gmkernel/GmLine.h"
 #include "gmkernel/GmRect.h"
-
-namespace {
-
-/// The circle part of a circle or an arc, null for every other kind of curve.
-GmCircle const* asCircle(GmCurve const* curve) {
-    const bool round = curve->IsCircle() || curve->IsArc();
-    return round ? static_cast<GmCircle const*>(curve) : nullptr;
-}
-
-}  // namespace
+#include "kernel/curves/VerifiedCast.h"
 
 GmCurve::GmCurve() {
     m_eType = eGmCurve;
@@ -132,11 +131,11 @@ GmPoint GmCurve::MinDist(double& d, GmCurve const* c, bool bPreferSP) const {
             CheckDist(d, best, end, endOfOther);
         }
     }
-    if (GmCircle const* circle = asCircle(this)) {
+    if (GmCircle const* circle = gmkernel_detail::roundPart(*this)) {
         const GmPoint facing = circle->NP(c);
         if (facing.CreationOK()) CheckDist(d, best, facing, c->NP(facing));
     }
-    if (GmCircle const* circle = asCircle(c)) {
+    if (GmCircle const* circle = gmkernel_detail::roundPart(*c)) {
         const GmPoint facing = circle->NP(this);
         if (facing.CreationOK()) offerFoot(facing);
     }

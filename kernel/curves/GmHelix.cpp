@@ -1,12 +1,17 @@
+/// @file
+/// The helix as an arc and a height.
+///
+/// All questions in the plane go to the arc below; the height at a point is linear in the angle
+/// swept up to it. Distances in space to a helix would need an equation without a closed solution:
+/// what asks for them is not provided, and the nearest point is that of the arc, lifted.
 #include "gmkernel/GmHelix.h"
-
-#include <wx/string.h>
 
 #include <cmath>
 
 #include "gmkernel/GmLine.h"
 #include "gmkernel/GmMatrix.h"
 #include "gmkernel/GmRect.h"
+#include "kernel/values/TraceText.h"
 
 namespace {
 
@@ -142,9 +147,8 @@ std::string GmHelix::GetTraceString() const {
     const GmPoint sp = SP();
     const GmPoint ep = EP();
     const GmPoint m = M();
-    return wxString::Format("helix%d (%0.5f, %0.5f) - (%0.5f, %0.5f) mp (%0.5f, %0.5f)",
-                            Dir() == eRotCW ? 2 : 3, sp.X(), sp.Y(), ep.X(), ep.Y(), m.X(), m.Y())
-        .ToStdString();
+    return gmkernel_detail::arcText("helix", Dir() == eRotCW, sp.X(), sp.Y(), ep.X(), ep.Y(), m.X(),
+                                    m.Y());
 }
 
 GmPoint GmHelix::M() const {

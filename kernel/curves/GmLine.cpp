@@ -1,3 +1,10 @@
+/// @file
+/// The line as a point and a unit direction.
+///
+/// Nearest points are projections onto the direction. Distances go by the slope form instead, the
+/// one in which the intersection kernels decide about touching, so that both agree to the last
+/// digit; they leave z out. A bisector runs along the sum of both unit directions. Directions are
+/// not tested for being zero: what follows from a line through coincident points has no meaning.
 #include "gmkernel/GmLine.h"
 
 #include <cmath>
@@ -65,9 +72,9 @@ GmLine::GmLine(GmLine const& line, double d) : GmLine() {
 
 GmLine::GmLine(GmLine const& a, GmLine const& b) : GmLine() {
     if (!a.CreationOK() || !b.CreationOK()) return;
-    const GmLine carrier(a);
-    if (carrier.IntersectionWithLine(b) > 0) {
-        Define(carrier.GetSolution(0), a.m_Dir.Sym(b.m_Dir));
+    const GmLine supportingLine(a);
+    if (supportingLine.IntersectionWithLine(b) > 0) {
+        Define(supportingLine.GetSolution(0), a.m_Dir.Sym(b.m_Dir));
     } else {
         Define(a.SP().Mean(b.SP()), a.m_Dir);
     }
@@ -184,7 +191,7 @@ int GmLine::PointPos(GmPoint const& p) const {
 }
 
 int GmLine::IntersectionWithLine(GmLine const& line) const {
-    const auto hits = gmkernel_detail::carrierHits(*this, line);
+    const auto hits = gmkernel_detail::supportHits(*this, line);
     m_ptSol.assign(hits.begin(), hits.end());
     return static_cast<int>(m_ptSol.size());
 }

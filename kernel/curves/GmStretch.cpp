@@ -1,13 +1,23 @@
+/// @file
+/// The segment: a line with two ends.
+///
+/// A point lies on the segment when its foot on the supporting line does, by the parameter along
+/// the longer axis, and when it is near to the foot. The direction follows the ends and keeps its
+/// last value when they meet, so that a segment without length still has one. Where a foot lies
+/// beyond the ends the nearer end is the nearest point, as distance along a line grows away from
+/// the foot.
 #include "gmkernel/GmStretch.h"
-
-#include <wx/string.h>
 
 #include <utility>
 
 #include "gmkernel/GmArc.h"
 #include "gmkernel/GmRect.h"
 #include "kernel/curves/Joining.h"
+#include "kernel/curves/VerifiedCast.h"
 #include "kernel/curves/kernels/OnSegment.h"
+#include "kernel/values/TraceText.h"
+
+using gmkernel_detail::curveAs;
 
 GmStretch::GmStretch() {
     m_eType = eGmStretch;
@@ -64,26 +74,27 @@ bool GmStretch::Trim(GmCurve* next) {
 
 GmCurve* GmStretch::Concat(GmCurve const& next, int mode) {
     GmLine normalAtNext;
-    if (next.IsStretch()) {
-        normalAtNext = GmLine(static_cast<GmStretch const&>(next), next.SP(), ePLNormal);
-    } else if (next.IsArc()) {
-        normalAtNext = GmLine(static_cast<GmArc const&>(next).M(), next.SP());
+    if (auto const* stretch = curveAs<GmStretch>(next)) {
+        normalAtNext = GmLine(*stretch, next.SP(), ePLNormal);
+    } else if (auto const* arc = curveAs<GmArc>(next)) {
+        normalAtNext = GmLine(arc->M(), next.SP());
     }
     return gmkernel_detail::connectingCurve(*this, GmLine(*this, EP(), ePLNormal), next,
                                             normalAtNext, mode);
 }
 
 bool GmStretch::Concat(GmCurve const& next) {
-    const GmLine carrier(*this);
-    if (next.IsStretch()) {
-        if (carrier.IntersectionWithLine(static_cast<GmStretch const&>(next)) == 0) return false;
-        gmkernel_detail::joinAt(*this, next, carrier.GetSolution(0));
+    const GmLine supportingLine(*this);
+    if (auto const* stretch = curveAs<GmStretch>(next)) {
+        if (supportingLine.IntersectionWithLine(*stretch) == 0) return false;
+        gmkernel_detail::joinAt(*this, next, supportingLine.GetSolution(0));
         return true;
     }
-    if (!next.IsArc()) return false;
+    auto const* const arc = curveAs<GmArc>(next);
+    if (arc == nullptr) return false;
 
-    const GmCircle circle(static_cast<GmArc const&>(next));
-    const int count = circle.IntersectionWithLine(carrier);
+    const GmCircle circle(*arc);
+    const int count = circle.IntersectionWithLine(supportingLine);
     if (count == 0) return false;
     const auto turn = [&](unsigned i) { return EP().AngDist(circle.GetSolution(i), circle.M()); };
     const unsigned chosen = count > 1 && turn(0) > turn(1) ? 1 : 0;
@@ -158,9 +169,7 @@ void GmStretch::Transform(GmMatrix const& m) {
 }
 
 std::string GmStretch::GetTraceString() const {
-    return wxString::Format("line (%0.5f, %0.5f) - (%0.5f, %0.5f)", m_SP.X(), m_SP.Y(), m_EP.X(),
-                            m_EP.Y())
-        .ToStdString();
+    return gmkernel_detail::stretchText(m_SP.X(), m_SP.Y(), m_EP.X(), m_EP.Y());
 }
 
 GmPoint GmStretch::HP() const {

@@ -1,5 +1,11 @@
 /// @file
 /// How a curve's end and the next curve's start are brought together.
+///
+/// Trimming cuts both back to a crossing of the bounded curves. A bridge is a segment or an arc: an
+/// arc leaves the curve tangentially when its centre lies on the normal there, and arrives
+/// tangentially when it lies on the normal of the next curve too. So the normals are crossed, and
+/// the arc is taken when that point is about equally far from both ends; else a segment has to do.
+/// Constant cost.
 #include "kernel/curves/Joining.h"
 
 #include <cmath>

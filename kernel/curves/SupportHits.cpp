@@ -6,16 +6,16 @@
 
 namespace gmkernel_detail {
 
-Hits<1> carrierHits(GmLine const& a, GmLine const& b) {
+Hits<1> supportHits(GmLine const& a, GmLine const& b) {
     return intersectLineLine(a.SP(), a.Dir(), b.SP(), b.Dir());
 }
 
-Hits<2> carrierHits(GmCircle const& a, GmLine const& b) {
+Hits<2> supportHits(GmCircle const& a, GmLine const& b) {
     return intersectCircleLine(a.M(), a.R(), b.SP(), b.Dir(),
                                [&](GmPoint const& p) { return b.Dist(p); });
 }
 
-Hits<2> carrierHits(GmCircle const& a, GmCircle const& b) {
+Hits<2> supportHits(GmCircle const& a, GmCircle const& b) {
     return intersectCircleCircle(a.M(), a.R(), b.M(), b.R());
 }
 

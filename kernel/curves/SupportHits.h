@@ -6,10 +6,10 @@
 
 namespace gmkernel_detail {
 
-// The kernels applied to curves, whose bounds are ignored: straight ones as their carriers, round
-// ones as full circles. Only a stretch that touches a circle has to do so itself.
-Hits<1> carrierHits(GmLine const& a, GmLine const& b);
-Hits<2> carrierHits(GmCircle const& a, GmLine const& b);
-Hits<2> carrierHits(GmCircle const& a, GmCircle const& b);
+// The kernels applied to the supporting lines of straight curves and the supporting circles of
+// round ones: bounds are ignored. Only a stretch that touches a circle has to do so itself.
+Hits<1> supportHits(GmLine const& a, GmLine const& b);
+Hits<2> supportHits(GmCircle const& a, GmLine const& b);
+Hits<2> supportHits(GmCircle const& a, GmCircle const& b);
 
 }  // namespace gmkernel_detail

@@ -1,3 +1,9 @@
+/// @file
+/// Angles in degrees, kept in (-180, 180].
+///
+/// Every operation brings its result back by whole turns. A few are taken off one by one, many by
+/// the remainder, since stepping would then take for ever; neither rounds. Comparisons do not wrap
+/// around: 180 and -179.999 are far apart.
 #include "gmkernel/GmAngle.h"
 
 #include <cmath>

@@ -1,3 +1,10 @@
+/// @file
+/// Homogeneous transformations.
+///
+/// The inverse comes from cofactors over the determinant: for affine matrices those of the 3x3
+/// part, with the translation carried through it; for others from the 2x2 minors of the two pairs
+/// of rows (Laplace expansion). There is no pivoting: digits are lost where the determinant is
+/// small against the values. Only an exact zero counts as singular.
 #include "gmkernel/GmMatrix.h"
 
 #include <algorithm>

@@ -1,6 +1,11 @@
+/// @file
+/// Vectors, their angles and quadrants.
+///
+/// The angle between vectors is the arc cosine of their scalar product with the sign of the cross
+/// product, which loses digits next to 0 and 180 degrees. The polar angle instead snaps to the
+/// axes: a component below the length tolerance counts as zero, so that vectors meant to be
+/// axis-parallel are. As this is a length, short vectors snap from far off the axes.
 #include "gmkernel/GmVec.h"
-
-#include <wx/string.h>
 
 #include <cmath>
 
@@ -10,6 +15,7 @@
 #include "gmkernel/GmPoint.h"
 #include "gmkernel/GmRect.h"
 #include "kernel/values/Constants.h"
+#include "kernel/values/TraceText.h"
 
 namespace {
 
@@ -298,7 +304,7 @@ void GmVec::Transform(GmMatrix const& m) {
 }
 
 std::string GmVec::GetRawTraceString() const {
-    return wxString::Format("(%0.5f, %0.5f, %0.5f)", m_dX, m_dY, m_dZ).ToStdString();
+    return gmkernel_detail::coordinatesText(m_dX, m_dY, m_dZ);
 }
 
 void SetCoordByIndex(GmVec& v, int i, double value) {

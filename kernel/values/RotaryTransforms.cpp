@@ -1,3 +1,10 @@
+/// @file
+/// Between a plane and a rotary axis.
+///
+/// Unrolling a cylinder maps the circumference to one turn. On an end face a point is its distance
+/// from the axis and its angle, clockwise from the positive y axis, where the rest of the library
+/// counts counter-clockwise from x. Turns of the cylinder are not reduced, and radii are not tested
+/// against the offset.
 #include <cmath>
 
 #include "gmkernel/GmRotary.h"

@@ -1,17 +1,23 @@
 /// @file
 /// Melting two closed contours: the loops that their boundaries form together.
 ///
-/// The elements of both contours are numbered in one row, this contour's first. Every crossing
-/// gives up to two passages, one from each boundary onto the other. A walk follows one boundary to
-/// the next passage, changes over, and so on until it is back where it started.
+/// The elements of both contours are numbered in one row, this contour's first. Where
+/// two of them cross there are up to two crossings, one from each boundary onto the other. A walk
+/// follows one boundary to the next crossing, changes over, and so on until it is back where it
+/// started. As every crossing is used once, the walks together give every loop once.
+///
+/// What overlaps instead of crossing gives no crossings: contours that touch along a side may yield
+/// one loop, parts or none. Cost: elements times elements box tests, then the number of crossings
+/// for each step of a walk.
 #include <memory>
 #include <vector>
 
 #include "gmkernel/GmContour.h"
 #include "kernel/contour/GmContourArray.h"
+#include "kernel/contour/walk/CrossingWalk.h"
 #include "kernel/contour/walk/LoopContour.h"
-#include "kernel/contour/walk/PassageWalk.h"
 #include "kernel/curves/CurveBox.h"
+#include "kernel/curves/VerifiedCast.h"
 
 namespace {
 
@@ -23,8 +29,7 @@ constexpr int kDidNotComeBack = -2;
 bool isClosedChain(GmContour const& contour) {
     if (!contour.IsClosed()) return false;
     for (int i = 0; i < contour.ElementCount(); ++i) {
-        GmCurve const& element = *contour.GetElement(i);
-        if (!element.IsStretch() && !element.IsArc()) return false;
+        if (!isSegmentOrArc(*contour.GetElement(i))) return false;
     }
     return true;
 }
@@ -36,7 +41,7 @@ std::vector<CurveBox> reachesOf(GmContour const& contour) {
     return reaches;
 }
 
-void addPassagesBetween(Passages& passages, GmContour const& a, GmContour const& b) {
+void addCrossingsBetween(Crossings& crossings, GmContour const& a, GmContour const& b) {
     const int countA = static_cast<int>(a.ElementCount());
     const std::vector<CurveBox> reachesB = reachesOf(b);
     for (int i = 0; i < countA; ++i) {
@@ -47,7 +52,7 @@ void addPassagesBetween(Passages& passages, GmContour const& a, GmContour const&
             GmCurve const& f = *b.GetElement(j);
             e.Intersection(&f);
             for (GmPoint const& p : e.GetPtSol())
-                passages.AddCrossing(e, i, f, countA + j, p);
+                crossings.AddBothWays(e, i, f, countA + j, p);
         }
     }
 }
@@ -69,15 +74,15 @@ WalkTrack trackAlong(GmContour const& a, GmContour const& b) {
 }
 
 Loops loopsBetween(GmContour const& a, GmContour const& b) {
-    Passages passages;
-    addPassagesBetween(passages, a, b);
+    Crossings crossings;
+    addCrossingsBetween(crossings, a, b);
     WalkTrack track = trackAlong(a, b);
     Loops loops;
-    for (int i = 0; i < passages.Count(); ++i) {
-        if (passages[i].bUsed) continue;
+    for (int i = 0; i < crossings.Count(); ++i) {
+        if (crossings[i].bUsed) continue;
         auto loop = std::make_unique<LoopContour>();
         track.append = [&loop](GmCurve& piece) { loop->AddRealElem(&piece); };
-        loops.cameBack = walkLoop(passages, i, track);
+        loops.cameBack = walkLoop(crossings, i, track);
         if (!loops.cameBack) break;
         loops.contours.push_back(std::move(loop));
     }
@@ -104,6 +109,6 @@ int GmContour::SplitContours(GmContour* other) {
 }
 
 int GmContour::FindNextPoint(GmPoint p, GmCurve* curve, int index,
-                             KxArray<GmContIntPoint*, GmContIntPoint*> const& passages) const {
-    return curve ? gmkernel_detail::nextPassage(p, *curve, index, passages) : -1;
+                             KxArray<GmContIntPoint*, GmContIntPoint*> const& crossings) const {
+    return curve ? gmkernel_detail::nextCrossing(p, *curve, index, crossings) : -1;
 }

@@ -14,7 +14,7 @@ struct PieceRun {
     PieceList pieces;
     CurveBox reach{std::numeric_limits<double>::max(), std::numeric_limits<double>::lowest(),
                    std::numeric_limits<double>::max(), std::numeric_limits<double>::lowest()};
-    /// Every piece keeps its distance, see Piece::keepsDistance.
+    /// Every piece is far enough from the elements of the span, see Piece::clearOfSpan.
     bool settled = false;
 };
 

@@ -12,6 +12,7 @@
 
 #include "gmkernel/GmArc.h"
 #include "gmkernel/GmStretch.h"
+#include "kernel/curves/VerifiedCast.h"
 
 namespace gmkernel_detail {
 
@@ -74,10 +75,10 @@ std::unique_ptr<GmCurve> offsetOf(GmCurve const& element, double d) {
 
 std::vector<GmOffsetElement> bandPieces(GmCurve const& element, int source, int id, double d) {
     std::vector<GmOffsetElement> pieces;
-    if (!element.IsStretch() && !element.IsArc()) return pieces;
+    if (!isSegmentOrArc(element)) return pieces;
 
-    const auto add = [&](std::unique_ptr<GmCurve> curve, bool kept, bool auxiliary) {
-        pieces.emplace_back(std::move(curve), source, id, kept, auxiliary);
+    const auto add = [&](PieceRole role, std::unique_ptr<GmCurve> curve) {
+        pieces.emplace_back(std::move(curve), source, id, role);
     };
     const GmBase::eRotDir rot = d > 0.0 ? GmBase::eRotCCW : GmBase::eRotCW;
     const auto arcOf = [rot](Cap const& cap) {
@@ -85,14 +86,14 @@ std::vector<GmOffsetElement> bandPieces(GmCurve const& element, int source, int 
     };
     Cap start = startCap(element, d);
     Cap end = endCap(element, d);
-    if (element.IsArc()) shortenCaps(static_cast<GmArc const&>(element), d, start, end);
+    if (auto const* arc = curveAs<GmArc>(element)) shortenCaps(*arc, d, start, end);
 
-    add(arcOf(start), false, true);
-    if (auto offset = offsetOf(element, d)) add(std::move(offset), true, false);
-    add(arcOf(end), true, true);
+    add(PieceRole::kStartCap, arcOf(start));
+    if (auto offset = offsetOf(element, d)) add(PieceRole::kChosenSide, std::move(offset));
+    add(PieceRole::kEndCap, arcOf(end));
     if (auto other = offsetOf(element, -d)) {
         other->Invert();
-        add(std::move(other), false, true);
+        add(PieceRole::kOtherSide, std::move(other));
     }
     return pieces;
 }

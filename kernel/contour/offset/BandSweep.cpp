@@ -1,3 +1,10 @@
+/// @file
+/// The sweep along the source that makes, cuts and sorts out the pieces of all bands.
+///
+/// Each element's pieces are cut with all active ones, so that any two pieces which are active
+/// together are cut by each other once. Then those too near to an element of the span are removed.
+/// A piece whose element leaves the span is no longer cut nor tested: with a span shorter than the
+/// contour, results are right only where the contour keeps away from what left the span.
 #include "kernel/contour/offset/BandSweep.h"
 
 #include <cmath>
@@ -5,6 +12,7 @@
 
 #include "kernel/contour/offset/BandPieces.h"
 #include "kernel/contour/offset/Insertion.h"
+#include "kernel/curves/VerifiedCast.h"
 
 namespace gmkernel_detail {
 
@@ -14,8 +22,7 @@ namespace {
 /// that are neither segments nor arcs.
 CurveBox nearbyOf(GmCurve const& element, double d) {
     constexpr double kEverywhere = std::numeric_limits<double>::max();
-    if (!element.IsStretch() && !element.IsArc())
-        return {-kEverywhere, kEverywhere, -kEverywhere, kEverywhere};
+    if (!isSegmentOrArc(element)) return {-kEverywhere, kEverywhere, -kEverywhere, kEverywhere};
     return reachOf(element).grown(std::fabs(d));
 }
 

@@ -1,3 +1,11 @@
+/// @file
+/// From loose pieces to the chain of one result.
+///
+/// Pieces that bound one result start where others end, up to rounding, so a chain grows by the
+/// piece that starts at its end. Where several do, one that leads on is preferred to a dead end;
+/// the choice is never taken back, so that where results touch each other a piece may go to the
+/// wrong one. A chain starts at the smallest identifier, for results in the order of the source.
+/// Cost: the number of pieces left for each piece of the chain.
 #include "kernel/contour/offset/Chaining.h"
 
 #include <algorithm>

@@ -1,3 +1,11 @@
+/// @file
+/// Cutting the pieces of bands at their mutual crossings.
+///
+/// A new piece is intersected with every active one whose box it reaches, and both are split at the
+/// points. As every piece has gone through this when it came, any two have been cut by each other
+/// once, and parts need not be cut again. A part takes everything but the curve from its piece.
+/// Points are sorted along the curve before it is split, since each split leaves only the rest
+/// behind it.
 #include "kernel/contour/offset/Insertion.h"
 
 #include <algorithm>

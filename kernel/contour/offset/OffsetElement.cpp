@@ -1,27 +1,33 @@
 #include "kernel/contour/offset/OffsetElement.h"
 
-#include <wx/string.h>
-
 #include <utility>
 
-GmOffsetElement::GmOffsetElement(std::unique_ptr<GmCurve> curve, int source, int id, bool kept,
-                                 bool auxiliary)
-    : m_curve(std::move(curve)), m_source(source), m_id(id), m_kept(kept), m_auxiliary(auxiliary) {}
+#include "kernel/values/TraceText.h"
+
+using gmkernel_detail::PieceRole;
+
+GmOffsetElement::GmOffsetElement(std::unique_ptr<GmCurve> curve, int source, int id, PieceRole role)
+    : m_curve(std::move(curve)), m_source(source), m_id(id), m_role(role) {}
 
 GmOffsetElement::GmOffsetElement(GmOffsetElement const& other)
     : m_curve(other.m_curve->Clone()),
       m_source(other.m_source),
       m_id(other.m_id),
-      m_kept(other.m_kept),
-      m_auxiliary(other.m_auxiliary) {}
+      m_role(other.m_role) {}
 
 GmOffsetElement& GmOffsetElement::operator=(GmOffsetElement const& other) {
     if (this != &other) *this = GmOffsetElement(other);
     return *this;
 }
 
+bool GmOffsetElement::kept() const {
+    return m_role == PieceRole::kChosenSide || m_role == PieceRole::kEndCap;
+}
+
+bool GmOffsetElement::auxiliary() const {
+    return m_role != PieceRole::kChosenSide;
+}
+
 void GmOffsetElement::Trace() const {
-    const wxString text =
-        wxString::Format("p-path %i %s", m_id, wxString(m_curve->GetTraceString()));
-    static_cast<void>(text);
+    static_cast<void>(gmkernel_detail::offsetPieceText(m_id, m_curve->GetTraceString()));
 }

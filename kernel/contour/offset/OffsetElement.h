@@ -4,6 +4,18 @@
 
 #include "gmkernel/GmCurve.h"
 
+namespace gmkernel_detail {
+
+/// The role of a piece in the boundary of its element's band.
+enum class PieceRole {
+    kStartCap,    ///< around the element's start: only cuts other pieces
+    kChosenSide,  ///< the offset on the side that is asked for: what results are made of
+    kEndCap,      ///< around the element's end: rounds a corner of a result
+    kOtherSide    ///< the offset on the opposite side, reversed: only cuts other pieces
+};
+
+}  // namespace gmkernel_detail
+
 /// One piece of the boundary of an element's band, a stretch or an arc.
 ///
 /// Pieces made by splitting keep everything but the curve from the piece they came from.
@@ -12,10 +24,9 @@ public:
     /// @param curve the piece
     /// @param source index of the source element whose band the piece belongs to
     /// @param id identifier of the source element, carried to the results
-    /// @param kept true for the offset on the chosen side and for the end cap, which may end up
-    ///        in a result; the other pieces only serve to cut
-    /// @param auxiliary false only for the offset on the chosen side
-    GmOffsetElement(std::unique_ptr<GmCurve> curve, int source, int id, bool kept, bool auxiliary);
+    /// @param role what the piece is in the boundary
+    GmOffsetElement(std::unique_ptr<GmCurve> curve, int source, int id,
+                    gmkernel_detail::PieceRole role);
     /// Clones the curve.
     GmOffsetElement(GmOffsetElement const& other);
     /// Clones the other's curve and deletes the own one; nothing when assigned to itself.
@@ -31,13 +42,15 @@ public:
     GmCurve const& curve() const { return *m_curve; }
     int source() const { return m_source; }
     int id() const { return m_id; }
-    bool kept() const { return m_kept; }
-    bool auxiliary() const { return m_auxiliary; }
+    gmkernel_detail::PieceRole role() const { return m_role; }
+    /// May the piece end up in a result?
+    bool kept() const;
+    /// Is it anything but the offset on the chosen side?
+    bool auxiliary() const;
 
 private:
     std::unique_ptr<GmCurve> m_curve;
     int m_source;
     int m_id;
-    bool m_kept;
-    bool m_auxiliary;
+    gmkernel_detail::PieceRole m_role;
 };

@@ -1,5 +1,10 @@
 /// @file
 /// Where a path along the offsets of a contour starts.
+///
+/// An offset begins where the source begins, so the element with the smallest identifier is looked
+/// for, and of several the one whose start is nearest to the start of the source moved sideways by
+/// the distance. The only open offset of an open contour is taken without such a comparison: there
+/// the first of the smallest identifier is the beginning. Linear in the elements of all offsets.
 #include <cmath>
 #include <limits>
 

@@ -16,8 +16,8 @@ struct Piece {
     /// To be called when the curve has changed.
     void measure() {
         reach = reachOf(element.curve());
-        halving = MiddleOf(&element.curve());
-        keepsDistance = false;
+        halving = middleOf(&element.curve());
+        clearOfSpan = false;
     }
 
     GmOffsetElement element;
@@ -25,9 +25,9 @@ struct Piece {
     CurveBox reach{};
     /// The point that stands for the piece when its distance from the source is judged.
     GmPoint halving;
-    /// At its last test the piece kept its distance from every element then in the span. A split
-    /// takes this back, since the halves are judged by other points.
-    bool keepsDistance = false;
+    /// At its last test the piece was far enough from every element then in the span. A split takes
+    /// this back, since the parts are judged by other points.
+    bool clearOfSpan = false;
 };
 
 using PieceList = std::list<Piece>;

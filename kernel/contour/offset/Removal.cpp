@@ -1,3 +1,11 @@
+/// @file
+/// Removing the pieces that come too near to the source.
+///
+/// Pieces end at every crossing with the boundary of a band, so that a piece is wholly inside a
+/// band or wholly not, and one point of it, the halving point, decides for all. Caps and offsets of
+/// neighbours touch at exactly the distance; the calculation tolerance keeps rounding from removing
+/// them. A crossing next to the end of a piece does not cut it: then the point may stand for a
+/// piece of both kinds.
 #include "kernel/contour/offset/Removal.h"
 
 #include <cmath>
@@ -23,11 +31,11 @@ bool isNear(GmPoint const& p, SourceSpan const& span, int count, double threshol
 void removeFromRun(PieceRun& run, SourceSpan const& span, int newest, double threshold) {
     const int all = static_cast<int>(span.nearby.size());
     for (auto piece = run.pieces.begin(); piece != run.pieces.end();) {
-        const int count = piece->keepsDistance ? newest : all;
+        const int count = piece->clearOfSpan ? newest : all;
         if (isNear(piece->halving, span, count, threshold)) {
             piece = run.pieces.erase(piece);
         } else {
-            piece->keepsDistance = true;
+            piece->clearOfSpan = true;
             ++piece;
         }
     }

@@ -1,3 +1,9 @@
+/// @file
+/// From a chain of pieces to a contour.
+///
+/// Ends that are equal as points become a joint as they are; wider gaps, which chaining allows up
+/// to three length tolerances, get a segment of their own, so that the contour stays a chain.
+/// Linear in the pieces.
 #include "kernel/contour/offset/ResultContour.h"
 
 #include <algorithm>
@@ -5,6 +11,7 @@
 #include "gmkernel/GmContElement.h"
 #include "gmkernel/GmStretch.h"
 #include "kernel/contour/ContourElements.h"
+#include "kernel/values/HandedOver.h"
 
 namespace gmkernel_detail {
 
@@ -17,14 +24,13 @@ void append(GmContour& contour, std::unique_ptr<GmCurve> curve, int id, bool ins
     record->lIndex = contour.ElementCount();
     record->bInserted = inserted;
     if (!contour.AddElement(record.get(), false)) return;
-    // The contour owns both now.
-    static_cast<void>(curve.release());
-    static_cast<void>(record.release());
+    handedOver(curve);
+    handedOver(record);
 }
 
 void bridgeGap(GmContour& contour, GmPoint const& to, int id) {
     if (contour.ElementCount() == 0) return;
-    const GmPoint from = ChainEnd(contour);
+    const GmPoint from = chainEnd(contour);
     if (from != to) append(contour, std::make_unique<GmStretch>(from, to), id, true);
 }
 

@@ -1,5 +1,10 @@
 /// @file
 /// Offsetting element by element, with neighbours trimmed to each other and nothing else cut.
+///
+/// Parallels of neighbours that cross do so at the corner of the parallel chain, so each is cut
+/// back to that point. It fails where neighbours do not cross: at corners that open away from the
+/// offset. It does not notice parts that run backwards or come nearer to the source than the
+/// distance, and it does not trim the last element to the first. Linear in the elements.
 #include <cmath>
 #include <memory>
 #include <vector>
@@ -7,6 +12,7 @@
 #include "gmkernel/GmContElement.h"
 #include "gmkernel/GmContour.h"
 #include "kernel/contour/GmContourArray.h"
+#include "kernel/curves/VerifiedCast.h"
 
 namespace {
 
@@ -21,7 +27,7 @@ OffsetCurves offsetElements(GmContour const& contour, double d) {
     OffsetCurves offsets;
     for (int i = 0; i < contour.ElementCount(); ++i) {
         GmContElement const& record = *contour.GetContElement(i);
-        if (!record.pCurve->IsStretch() && !record.pCurve->IsArc()) continue;
+        if (!gmkernel_detail::isSegmentOrArc(*record.pCurve)) continue;
         std::unique_ptr<GmCurve> offset(record.pCurve->GetParallel(d));
         if (offset->CreationOK()) offsets.push_back({std::move(offset), record.lId});
     }

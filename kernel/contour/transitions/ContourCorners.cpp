@@ -1,20 +1,28 @@
 /// @file
 /// Rounding the corners of a contour.
+///
+/// The circle that touches both elements at a corner gives the arc between its two contacts, and
+/// the elements are cut back to them. Only a circle with exactly one contact on each element is
+/// taken, so that the contacts lie on the elements themselves. New arcs are passed over, so that
+/// what was rounded is not rounded again. Cost: linear in the elements, and for each arc the
+/// elements that move in the list.
 #include <memory>
 
 #include "gmkernel/GmArc.h"
 #include "gmkernel/GmContour.h"
 #include "gmkernel/GmStretch.h"
 #include "kernel/contour/transitions/FilletCircle.h"
+#include "kernel/curves/VerifiedCast.h"
+#include "kernel/values/HandedOver.h"
 
 namespace {
 
 GmCircle circleInCorner(GmCurve const& prev, GmCurve const& cur, double radius) {
-    if (!prev.IsStretch() || !cur.IsStretch())
-        return gmkernel_detail::filletCircle(prev, cur, radius);
+    auto const* const first = gmkernel_detail::curveAs<GmStretch>(prev);
+    auto const* const second = gmkernel_detail::curveAs<GmStretch>(cur);
+    if (!first || !second) return gmkernel_detail::filletCircle(prev, cur, radius);
     // Reversed as a line: height and rounding of the corner come from the start of `prev`.
-    return GmCircle(static_cast<GmLine const&>(prev).Inverted(), static_cast<GmLine const&>(cur),
-                    radius);
+    return GmCircle(first->GmLine::Inverted(), *second, radius);
 }
 
 /// The arc that rounds a corner and the points where it meets the elements.
@@ -54,8 +62,8 @@ void GmContour::RoundCorners(double dRadius, int nMode) {
         cur.SetSP(fillet.end);
         std::unique_ptr<GmContElement> record(CreateContElement(fillet.arc.get(), j, j, true));
         m_pElements->InsertAt(j, record.get());
-        static_cast<void>(record.release());
-        static_cast<void>(fillet.arc.release());
+        gmkernel_detail::handedOver(record);
+        gmkernel_detail::handedOver(fillet.arc);
         ++j;
         ++corners;
     }

@@ -1,11 +1,17 @@
 /// @file
 /// Roundings and chamfers at the junctions of a contour.
+///
+/// What comes into a corner is decided from its two elements alone; here it is put between them and
+/// the elements are cut back to its ends. Elements that have become too short are then removed from
+/// the whole contour, which shifts the indices behind them. Nothing is tested against other
+/// elements.
 #include <cmath>
 
 #include "gmkernel/GmArc.h"
 #include "gmkernel/GmStretch.h"
 #include "kernel/contour/ContourElements.h"
 #include "kernel/contour/transitions/Transition.h"
+#include "kernel/curves/VerifiedCast.h"
 
 using gmkernel_detail::Transition;
 
@@ -46,19 +52,9 @@ bool GmContour::AddTransAt(eTransType type, int index, double value, bool bIdOfF
     const long id = GetContElement(bIdOfFirst ? index : next)->lId;
     GmCurve* const first = GetElement(index);
     GmCurve* const second = GetElement(next);
-    if (first->IsStretch() && second->IsStretch())
-        return AddTrans(type, static_cast<GmStretch*>(first), static_cast<GmStretch*>(second),
-                        index, value, id);
-    if (first->IsStretch() && second->IsArc())
-        return AddTrans(type, static_cast<GmStretch*>(first), static_cast<GmArc*>(second), index,
-                        value, id, false);
-    if (first->IsArc() && second->IsStretch())
-        return AddTrans(type, static_cast<GmStretch*>(second), static_cast<GmArc*>(first), index,
-                        value, id, true);
-    if (first->IsArc() && second->IsArc())
-        return AddTrans(type, static_cast<GmArc*>(first), static_cast<GmArc*>(second), index, value,
-                        id);
-    return false;
+    if (!gmkernel_detail::isSegmentOrArc(*first) || !gmkernel_detail::isSegmentOrArc(*second))
+        return false;
+    return AddTransBetween(type, first, second, index, value, id);
 }
 
 bool GmContour::AddTrans(eTransType type, GmStretch* first, GmStretch* second, int index,
@@ -87,7 +83,7 @@ bool GmContour::AddTransBetween(eTransType type, GmCurve* first, GmCurve* second
     first->SetEP(transition.contacts.onFirst);
     second->SetSP(transition.contacts.onSecond);
     // Between the last and the first element the chain was open until now.
-    m_bClosed = gmkernel_detail::ChainEnd(*this) == gmkernel_detail::ChainStart(*this);
+    m_bClosed = gmkernel_detail::chainEnd(*this) == gmkernel_detail::chainStart(*this);
     return true;
 }
 

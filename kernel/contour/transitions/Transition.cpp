@@ -1,3 +1,12 @@
+/// @file
+/// The arc or chamfer that comes into a corner, from its two elements alone.
+///
+/// A rounding is the arc between the contacts of a touching circle. A chamfer joins the points in
+/// which a circle about the corner meets both elements: its radius is the distance, or gives the
+/// length. Between segments leg and length form an isosceles triangle, which is solved; beside an
+/// arc the length grows with the radius, and bisection finds it to within a fixed number, in a
+/// fixed number of steps. Where a circle does not meet both elements there is no transition. Other
+/// elements of the contour are not looked at.
 #include "kernel/contour/transitions/Transition.h"
 
 #include <algorithm>
@@ -6,6 +15,7 @@
 #include "gmkernel/GmArc.h"
 #include "gmkernel/GmStretch.h"
 #include "kernel/contour/transitions/FilletCircle.h"
+#include "kernel/curves/VerifiedCast.h"
 
 namespace gmkernel_detail {
 
@@ -21,7 +31,7 @@ bool areSegments(GmCurve const& first, GmCurve const& second) {
 
 /// A circle has to meet a segment in exactly one point.
 GmPoint contactWith(GmCircle const& circle, GmCurve const& element) {
-    if (element.IsArc()) return contactWithArc(circle, static_cast<GmArc const&>(element));
+    if (auto const* arc = curveAs<GmArc>(element)) return contactWithArc(circle, *arc);
     return circle.Intersection(&element) == 1 ? circle.GetSolution(0) : GmPoint();
 }
 
@@ -76,10 +86,10 @@ Transition chamferBySearch(GmCurve const& first, GmCurve const& second, double l
 }
 
 Transition chamferOfLength(GmCurve const& first, GmCurve const& second, double length) {
-    if (!areSegments(first, second)) return chamferBySearch(first, second, length);
-    auto const& a = static_cast<GmStretch const&>(first);
-    auto const& b = static_cast<GmStretch const&>(second);
-    return chamferAtDistance(first, second, distanceForLength(a, b, length));
+    auto const* const a = curveAs<GmStretch>(first);
+    auto const* const b = curveAs<GmStretch>(second);
+    if (!a || !b) return chamferBySearch(first, second, length);
+    return chamferAtDistance(first, second, distanceForLength(*a, *b, length));
 }
 
 }  // namespace

@@ -1,5 +1,7 @@
 #include "kernel/contour/variable_offset/CurveList.h"
 
+#include "kernel/values/HandedOver.h"
+
 namespace gmkernel_detail {
 
 CurveList::~CurveList() {
@@ -8,13 +10,11 @@ CurveList::~CurveList() {
 }
 
 int CurveList::Count() const {
-    return static_cast<int>(m_entries.GetCount());
+    return m_entries.GetCount();
 }
 
 GmCurve& CurveList::operator[](int index) const {
-    // The base array stores pointers to const; what was added is not.
-    void* const entry = const_cast<void*>(m_entries[static_cast<size_t>(index)]);
-    return *static_cast<GmCurve*>(entry);
+    return *m_entries[index];
 }
 
 void CurveList::Add(std::unique_ptr<GmCurve> curve) {
@@ -22,13 +22,13 @@ void CurveList::Add(std::unique_ptr<GmCurve> curve) {
 }
 
 void CurveList::Insert(std::unique_ptr<GmCurve> curve, int index) {
-    m_entries.Insert(curve.get(), static_cast<size_t>(index));
-    static_cast<void>(curve.release());
+    m_entries.Insert(curve.get(), index);
+    handedOver(curve);
 }
 
 void CurveList::RemoveAt(int index) {
-    const std::unique_ptr<GmCurve> curve(&(*this)[index]);
-    m_entries.RemoveAt(static_cast<size_t>(index));
+    const std::unique_ptr<GmCurve> curve(m_entries[index]);
+    m_entries.RemoveAt(index);
 }
 
 }  // namespace gmkernel_detail

@@ -1,10 +1,9 @@
 #pragma once
 
-#include <wx/dynarray.h>
-
 #include <memory>
 
 #include "gmkernel/GmCurve.h"
+#include "kernel/values/PointerList.h"
 
 namespace gmkernel_detail {
 
@@ -26,7 +25,7 @@ public:
     void RemoveAt(int index);
 
 private:
-    wxBaseArrayPtrVoid m_entries;
+    PointerList<GmCurve> m_entries;
 };
 
 }  // namespace gmkernel_detail

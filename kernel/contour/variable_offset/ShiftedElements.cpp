@@ -1,3 +1,10 @@
+/// @file
+/// Moving elements by a vector each, and closing the gaps that this leaves.
+///
+/// Which signs the vector has follows from the quadrant of an element's direction, so that
+/// neighbours in one quadrant move together and stay joined. Others are trimmed to their crossing,
+/// or bridged by a segment where they do not cross. Shapes do not change: arcs keep their radius.
+/// Linear in the elements.
 #include "kernel/contour/variable_offset/ShiftedElements.h"
 
 #include <array>

@@ -3,12 +3,13 @@
 ///
 /// Every element moves by a vector that the quadrant of its direction chooses. Neighbours are
 /// trimmed or bridged; where the resulting chain crosses itself, walks from crossing to crossing
-/// take it apart into loops, of which those with the sense of the source are kept.
+/// take it apart into loops, of which those with the sense of the source are kept. A loop is not
+/// tested for its distance from the source. Cost: elements times elements.
 #include "gmkernel/GmContour.h"
 #include "kernel/contour/GmContourArray.h"
 #include "kernel/contour/variable_offset/ShiftedElements.h"
+#include "kernel/contour/walk/CrossingWalk.h"
 #include "kernel/contour/walk/LoopContour.h"
-#include "kernel/contour/walk/PassageWalk.h"
 #include "kernel/curves/CurveBox.h"
 
 namespace {
@@ -23,16 +24,16 @@ bool isJoint(GmPoint const& p, CurveList const& curves, int i, int k, bool close
     return closed && i == 0 && k == curves.Count() - 1 && p == curves[i].SP();
 }
 
-void addPassages(Passages& passages, CurveList const& curves, int i, int k, bool closed) {
+void addCrossings(Crossings& crossings, CurveList const& curves, int i, int k, bool closed) {
     GmCurve const& first = curves[i];
     GmCurve const& second = curves[k];
     first.Intersection(&second);
     for (GmPoint const& p : first.GetPtSol()) {
-        if (!isJoint(p, curves, i, k, closed)) passages.AddCrossing(first, i, second, k, p);
+        if (!isJoint(p, curves, i, k, closed)) crossings.AddBothWays(first, i, second, k, p);
     }
 }
 
-void addPassagesAmong(Passages& passages, CurveList const& curves, bool closed) {
+void addCrossingsAmong(Crossings& crossings, CurveList const& curves, bool closed) {
     std::vector<CurveBox> reaches;
     for (int i = 0; i < curves.Count(); ++i)
         reaches.push_back(reachOf(curves[i]));
@@ -40,7 +41,7 @@ void addPassagesAmong(Passages& passages, CurveList const& curves, bool closed) 
         const CurveBox& reach = reaches[static_cast<std::size_t>(i)];
         for (int k = i + 1; k < curves.Count(); ++k) {
             if (!reach.overlaps(reaches[static_cast<std::size_t>(k)])) continue;
-            addPassages(passages, curves, i, k, closed);
+            addCrossings(crossings, curves, i, k, closed);
         }
     }
 }
@@ -69,9 +70,9 @@ Loops wholeChain(CurveList const& curves) {
     return loops;
 }
 
-/// One loop, from the passage `start` on; null when it is no continuous chain or, with `cameBack`
+/// One loop, from the crossing `start` on; null when it is no continuous chain or, with `cameBack`
 /// false, when the walk was given up.
-std::unique_ptr<GmContour> loopFrom(Passages& passages, int start, CurveList const& curves,
+std::unique_ptr<GmContour> loopFrom(Crossings& crossings, int start, CurveList const& curves,
                                     bool closed, bool& cameBack) {
     auto loop = std::make_unique<LoopContour>();
     InsertPosition position;
@@ -90,16 +91,16 @@ std::unique_ptr<GmContour> loopFrom(Passages& passages, int start, CurveList con
             loop->AddRealElem(&piece);
         position.Advance();
     };
-    cameBack = walkLoop(passages, start, track);
+    cameBack = walkLoop(crossings, start, track);
     const bool continuous = !position.InFront() || loop->CheckContour();
     return cameBack && continuous ? std::move(loop) : nullptr;
 }
 
-Loops loopsOf(CurveList const& curves, Passages& passages, bool closed) {
+Loops loopsOf(CurveList const& curves, Crossings& crossings, bool closed) {
     Loops loops;
-    for (int i = 0; i < passages.Count() && loops.cameBack; ++i) {
-        if (passages[i].bUsed) continue;
-        std::unique_ptr<GmContour> loop = loopFrom(passages, i, curves, closed, loops.cameBack);
+    for (int i = 0; i < crossings.Count() && loops.cameBack; ++i) {
+        if (crossings[i].bUsed) continue;
+        std::unique_ptr<GmContour> loop = loopFrom(crossings, i, curves, closed, loops.cameBack);
         if (loop) loops.contours.push_back(std::move(loop));
     }
     return loops;
@@ -117,9 +118,10 @@ int GmContour::VarParallelContours(GmVec const& v) {
     shiftElements(*this, v, curves);
     closeGaps(curves, m_bClosed);
     removeCollapsed(curves);
-    Passages passages;
-    addPassagesAmong(passages, curves, m_bClosed);
-    Loops loops = passages.Count() <= 1 ? wholeChain(curves) : loopsOf(curves, passages, m_bClosed);
+    Crossings crossings;
+    addCrossingsAmong(crossings, curves, m_bClosed);
+    Loops loops =
+        crossings.Count() <= 1 ? wholeChain(curves) : loopsOf(curves, crossings, m_bClosed);
 
     RemoveAllSubConts();
     const GmPoint origin(0.0, 0.0, 0.0);

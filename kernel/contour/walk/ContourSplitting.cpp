@@ -1,10 +1,18 @@
 /// @file
 /// Splitting the elements of a contour.
+///
+/// An element is split by a copy of it: the copy starts at the point, the element ends there, and
+/// the copy follows it in the chain. The point is not projected, so an arc that is split within its
+/// tolerance of 0.01 gets an end off its circle. Splitting at quadrants goes through the four axis
+/// points in the order of travel, beginning with the first one ahead of the start, so that each one
+/// found lies on the rest that is still to be split.
 #include <memory>
 #include <vector>
 
 #include "gmkernel/GmArc.h"
 #include "gmkernel/GmContour.h"
+#include "kernel/curves/VerifiedCast.h"
+#include "kernel/values/HandedOver.h"
 
 namespace {
 
@@ -74,11 +82,11 @@ bool GmContour::SplitBothAtMinDist(GmContour* other) {
 
 bool GmContour::SplitArcs(GmDir const& dir, bool bBoth) {
     for (int i = 0; i < ElementCount(); ++i) {
-        if (!GetElement(i)->IsArc()) continue;
-        auto const& arc = static_cast<GmArc const&>(*GetElement(i));
-        const GmVec toCut = arc.R() * GmVec(dir);
-        int pieces = SplitInside(i, GmPoint(arc.M() + toCut)) ? 1 : 0;
-        if (bBoth && SplitInside(i, GmPoint(arc.M() - toCut))) ++pieces;
+        auto const* const arc = gmkernel_detail::curveAs<GmArc>(*GetElement(i));
+        if (arc == nullptr) continue;
+        const GmVec toCut = arc->R() * GmVec(dir);
+        int pieces = SplitInside(i, GmPoint(arc->M() + toCut)) ? 1 : 0;
+        if (bBoth && SplitInside(i, GmPoint(arc->M() - toCut))) ++pieces;
         i += pieces;
     }
     return true;
@@ -86,10 +94,10 @@ bool GmContour::SplitArcs(GmDir const& dir, bool bBoth) {
 
 bool GmContour::SplitArcsQuadrant() {
     for (int i = 0; i < ElementCount(); ++i) {
-        if (!GetElement(i)->IsArc()) continue;
-        auto const& arc = static_cast<GmArc const&>(*GetElement(i));
-        const GmPoint centre = arc.M();
-        for (GmVec const& toCut : quadrantOffsets(arc)) {
+        auto const* const arc = gmkernel_detail::curveAs<GmArc>(*GetElement(i));
+        if (arc == nullptr) continue;
+        const GmPoint centre = arc->M();
+        for (GmVec const& toCut : quadrantOffsets(*arc)) {
             if (SplitInside(i, GmPoint(centre + toCut))) ++i;
         }
     }
@@ -110,8 +118,8 @@ bool GmContour::SplitElement(int index, GmPoint const& p) {
     std::unique_ptr<GmContElement> record(
         CreateContElement(rest.get(), source.lId, source.lIndex, true));
     m_pElements->InsertAt(index + 1, record.get());
-    static_cast<void>(record.release());
-    static_cast<void>(rest.release());
+    gmkernel_detail::handedOver(record);
+    gmkernel_detail::handedOver(rest);
     source.pCurve->SetEP(p);
     return true;
 }

@@ -2,10 +2,10 @@
 
 #include "gmkernel/GmPoint.h"
 
-/// A passage: the place where a walk along numbered curves may leave one for another.
+/// A crossing from one curve onto another: where a walk along numbered curves may change over.
 struct GmContIntPoint {
     int nFrom;           ///< curve on which the walk arrives
     int nTo;             ///< curve on which it goes on
-    GmPoint Point;       ///< their crossing
+    GmPoint Point;       ///< the point common to both
     bool bUsed = false;  ///< a walk has passed here
 };

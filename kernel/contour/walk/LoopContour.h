@@ -15,7 +15,7 @@ public:
     using GmContour::InsertElem;
 };
 
-/// What the walks over all passages gave.
+/// What the walks over all crossings gave.
 struct Loops {
     std::vector<std::unique_ptr<GmContour>> contours;
     bool cameBack = true;  ///< false when a walk was given up; the loops before it stay

@@ -1,10 +1,16 @@
 /// @file
 /// Which function measures which ordered pair of points, stretches and arcs.
+///
+/// Of two different kinds both orders run the same function, so that they answer the same number. A
+/// pair without a function, and a pair in which an object is not of the class its tag promises,
+/// goes to the general search for the nearest points of two curves, which does not look for
+/// crossings.
 #include "kernel/curves/dispatch/Distance.h"
 
 #include <limits>
 #include <unordered_map>
 
+#include "kernel/curves/VerifiedCast.h"
 #include "kernel/curves/dispatch/DistanceFunctions.h"
 #include "kernel/curves/dispatch/PairKey.h"
 
@@ -14,14 +20,27 @@ using namespace gmkernel_detail;
 using DistanceEntry = double (*)(GmBase const&, GmBase const&);
 using DistanceMap = std::unordered_map<int, DistanceEntry>;
 
+/// The nearest approach of two curves of any kind.
+double measureCurves(GmBase const& a, GmBase const& b) {
+    double d = std::numeric_limits<double>::max();
+    auto const* first = dynamic_cast<GmCurve const*>(&a);
+    auto const* second = dynamic_cast<GmCurve const*>(&b);
+    if (first != nullptr && second != nullptr) first->MinDist(d, second, false);
+    return d;
+}
+
 template <class A, class B>
 double measurePair(GmBase const& first, GmBase const& second) {
-    return distance(static_cast<A const&>(first), static_cast<B const&>(second));
+    auto const* a = verifiedCast<A>(first);
+    auto const* b = verifiedCast<B>(second);
+    return a != nullptr && b != nullptr ? distance(*a, *b) : measureCurves(first, second);
 }
 
 template <class A, class B>
 double measureSwapped(GmBase const& first, GmBase const& second) {
-    return measurePair<A, B>(second, first);
+    auto const* a = verifiedCast<A>(second);
+    auto const* b = verifiedCast<B>(first);
+    return a != nullptr && b != nullptr ? distance(*a, *b) : measureCurves(first, second);
 }
 
 DistanceMap buildMap() {
@@ -49,15 +68,6 @@ DistanceMap const& distanceMap() {
 
 /// Fills the map when the library is loaded.
 [[maybe_unused]] const bool filledAtLoad = !distanceMap().empty();
-
-/// The nearest approach of two curves of any kind.
-double measureCurves(GmBase const& a, GmBase const& b) {
-    double d = std::numeric_limits<double>::max();
-    auto const* first = dynamic_cast<GmCurve const*>(&a);
-    auto const* second = dynamic_cast<GmCurve const*>(&b);
-    if (first != nullptr && second != nullptr) first->MinDist(d, second, false);
-    return d;
-}
 
 }  // namespace
 

@@ -1,3 +1,11 @@
+/// @file
+/// The distances of points, segments and arcs.
+///
+/// Two bounded curves that do not cross are nearest at an end of one of them or at two points that
+/// face each other, with the connection perpendicular to both. Two segments need no facing pair, an
+/// arc has one: towards the foot of its centre on the line, or towards the other centre. Squares
+/// are compared and one root is taken at last. Where one circle lies inside the other, another pair
+/// faces each other, which is not tried: the distance may come out too large. Constant cost.
 #include "kernel/curves/dispatch/DistanceFunctions.h"
 
 #include <algorithm>

@@ -1,9 +1,10 @@
 /// @file
 /// Which kernel intersects which ordered pair of curves.
 ///
-/// A kernel works on the infinite carriers and full circles; its points are kept where every
-/// bounded curve of the pair accepts them. Swapped pairs run the same function with swapped
-/// arguments, so that both give the same points in the same order.
+/// A kernel works on the supporting lines and circles, which have no bounds; its points are kept
+/// where every bounded curve of the pair accepts them. Swapped pairs run the same function with
+/// swapped arguments, so that both give the same points in the same order. A pair without an entry
+/// is refused, and so is one in which an object is not of the class that its tag promises.
 #include <stdexcept>
 #include <unordered_map>
 #include <vector>
@@ -13,6 +14,7 @@
 #include "gmkernel/GmContour.h"
 #include "gmkernel/GmStretch.h"
 #include "kernel/curves/SupportHits.h"
+#include "kernel/curves/VerifiedCast.h"
 #include "kernel/curves/dispatch/PairKey.h"
 
 namespace {
@@ -22,7 +24,7 @@ using Points = std::vector<GmPoint>;
 using IntersectionEntry = void (*)(GmBase const&, GmBase const&, Points&);
 using IntersectionMap = std::unordered_map<int, IntersectionEntry>;
 
-// Does a point that lies on the carrier or the full circle also lie on the curve itself?
+/// Does a point that lies on the supporting line or circle also lie on the curve itself?
 bool holds(GmLine const&, GmPoint const&) {
     return true;
 }
@@ -39,19 +41,32 @@ bool holds(GmArc const& arc, GmPoint const& p) {
     return arc.Element(p);
 }
 
+[[noreturn]] void refusePair() {
+    throw std::runtime_error("Function not found");
+}
+
+/// The object as the class by whose tag the entry was chosen.
+template <class T>
+T const& promised(GmBase const& object) {
+    auto const* const curve = verifiedCast<T>(object);
+    if (curve == nullptr) refusePair();
+    return *curve;
+}
+
 template <class A, class B>
 void intersectPair(GmBase const& first, GmBase const& second, Points& result) {
-    auto const& a = static_cast<A const&>(first);
-    auto const& b = static_cast<B const&>(second);
-    for (GmPoint const& p : carrierHits(a, b)) {
+    auto const& a = promised<A>(first);
+    auto const& b = promised<B>(second);
+    for (GmPoint const& p : supportHits(a, b)) {
         if (holds(a, p) && holds(b, p)) result.push_back(p);
     }
 }
 
 /// The contour collects the points in its own solution list.
+template <class Other>
 void intersectContour(GmBase const& first, GmBase const& second, Points& result) {
-    auto const& contour = static_cast<GmContour const&>(first);
-    contour.IntersectionWithCurve(static_cast<GmCurve const*>(&second));
+    auto const& contour = promised<GmContour>(first);
+    contour.IntersectionWithCurve(&promised<Other>(second));
     if (&contour.GetPtSol() != &result) result = contour.GetPtSol();
 }
 
@@ -93,11 +108,12 @@ void enterRoundPairs(IntersectionMap& map) {
 }
 
 void enterContourPairs(IntersectionMap& map) {
-    map.emplace(pairKey(GmBase::eGmContour, GmBase::eGmContour), intersectContour);
-    for (const GmBase::eGmTypes other : {GmBase::eGmLine, GmBase::eGmBeam, GmBase::eGmStretch,
-                                         GmBase::eGmCircle, GmBase::eGmArc}) {
-        enterBoth<intersectContour>(map, GmBase::eGmContour, other);
-    }
+    map.emplace(pairKey(GmBase::eGmContour, GmBase::eGmContour), intersectContour<GmContour>);
+    enterBoth<intersectContour<GmLine>>(map, GmBase::eGmContour, GmBase::eGmLine);
+    enterBoth<intersectContour<GmBeam>>(map, GmBase::eGmContour, GmBase::eGmBeam);
+    enterBoth<intersectContour<GmStretch>>(map, GmBase::eGmContour, GmBase::eGmStretch);
+    enterBoth<intersectContour<GmCircle>>(map, GmBase::eGmContour, GmBase::eGmCircle);
+    enterBoth<intersectContour<GmArc>>(map, GmBase::eGmContour, GmBase::eGmArc);
 }
 
 IntersectionMap buildMap() {
@@ -123,6 +139,6 @@ IntersectionMap const& intersectionMap() {
 void Intersection(GmBase const& a, GmBase const& b, std::vector<GmPoint>& result) {
     result.clear();
     const auto found = intersectionMap().find(pairKey(a.GetType(), b.GetType()));
-    if (found == intersectionMap().end()) throw std::runtime_error("Function not found");
+    if (found == intersectionMap().end()) refusePair();
     found->second(a, b, result);
 }

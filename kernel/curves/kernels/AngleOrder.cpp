@@ -1,3 +1,10 @@
+/// @file
+/// The sense in which three angles follow each other on the circle.
+///
+/// Of the six orders of three different angles in (-180, 180] three are rotations of one another
+/// and go counter-clockwise, the others clockwise; so comparisons decide, without differences that
+/// would have to be brought back into the range. Angles are compared exactly: there is no
+/// tolerance.
 #include "kernel/curves/kernels/AngleOrder.h"
 
 namespace gmkernel_detail {

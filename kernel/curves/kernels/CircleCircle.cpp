@@ -1,3 +1,11 @@
+/// @file
+/// Circle against circle.
+///
+/// Pythagoras in the triangles of both radii over the line of centres gives the foot of the common
+/// chord and half its length. Circles a little apart or inside each other, by up to the calculation
+/// tolerance, still count as touching, and a half chord below the length tolerance gives one point.
+/// Near contact the root makes errors large: a gap of 1e-9 moves the points by far more. Constant
+/// cost.
 #include "kernel/curves/kernels/CircleCircle.h"
 
 #include <cmath>

@@ -1,7 +1,7 @@
 /// @file
-/// Circle against straight carrier.
+/// Circle against line.
 ///
-/// With the carrier as y = k x + d and u the x offset from the centre, the crossings are the roots
+/// With the line as y = k x + d and u the x offset from the centre, the crossings are the roots
 /// of A u^2 + B u + C = 0. The roots come from q = -(B + sgn(B) sqrt(D)) / 2 as q / A and C / q,
 /// the form without cancellation (Press et al., Numerical Recipes, section 5.6). A line that passes
 /// within the length tolerance of the circle touches it: then the foot on the circle in the
@@ -25,7 +25,7 @@ bool touches(Distance const& distance, GmPoint const& p) {
     return distance(p) < GmBase::m_scdPrec;
 }
 
-/// The carrier x = x0: the upper crossing first.
+/// The line x = x0: the upper crossing first.
 template <class Distance>
 Hits<2> intersectCircleVertical(GmPoint const& m, double r, double x0, Distance const& distance) {
     Hits<2> hits;
@@ -45,10 +45,10 @@ Hits<2> intersectCircleVertical(GmPoint const& m, double r, double x0, Distance 
 /// The two distinct crossings with y = k x + d, none where they merge or are missing.
 Hits<2> crossCircleSlope(GmPoint const& m, double r, double k, double d);
 
-/// The feet of the centre on the circle, above (side +1) and below (-1) a carrier of slope k.
+/// The feet of the centre on the circle, above (side +1) and below (-1) a line of slope k.
 GmPoint footOnCircle(GmPoint const& m, double r, double k, double side);
 
-/// The crossings of the circle about `m` with the carrier through `sp` along `dir`: 0, 1 or 2.
+/// The crossings of the circle about `m` with the line through `sp` along `dir`: 0, 1 or 2.
 /// @param distance callable (GmPoint const&) -> double, the straight curve's distance of a point
 template <class Distance>
 Hits<2> intersectCircleLine(GmPoint const& m, double r, GmPoint const& sp, GmDir const& dir,

@@ -1,3 +1,10 @@
+/// @file
+/// Line against line.
+///
+/// Both as y = k x + d, a line parallel to the y axis by its x, so that one division solves for the
+/// crossing. Directions that are equal or opposite within the tolerance of directions have none.
+/// Steep lines have large k and d, whose difference loses digits: the crossing is less exact there
+/// than along the x axis.
 #include "kernel/curves/kernels/LineLine.h"
 
 #include "kernel/curves/kernels/SlopeForm.h"

@@ -6,9 +6,9 @@
 
 namespace gmkernel_detail {
 
-/// The crossing of two straight carriers, each given by a point and a direction; none for parallel
-/// directions, coincident carriers included. Planar: z comes from the start of `a`, or of `b` where
-/// only `b` is parallel to the y axis.
+/// The crossing of two lines, each given by a point and a direction; none for parallel directions,
+/// coincident lines included. Planar: z comes from the point of `a`, or of `b` where only `b` is
+/// parallel to the y axis.
 Hits<1> intersectLineLine(GmPoint const& spA, GmDir const& dirA, GmPoint const& spB,
                           GmDir const& dirB);
 

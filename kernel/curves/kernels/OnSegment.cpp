@@ -1,3 +1,10 @@
+/// @file
+/// Does a point of a line lie between two ends?
+///
+/// The coordinate in which the segment is longer gives the parameter along it, which avoids the
+/// division by the smaller extent. The range of the parameter is taken exactly, and the ends by the
+/// tolerance of points, so that the tolerance does not depend on the length. The distance of the
+/// point from the line is not tested.
 #include "kernel/curves/kernels/OnSegment.h"
 
 #include <cmath>

@@ -1,3 +1,9 @@
+/// @file
+/// Lines as y = k x + d.
+///
+/// The form makes crossings and distances one formula, at the price of the lines parallel to the y
+/// axis, which stand apart. A direction counts as parallel within the tolerance of directions; a
+/// line beside that limit has a slope of about a million.
 #include "kernel/curves/kernels/SlopeForm.h"
 
 namespace gmkernel_detail {

@@ -8,7 +8,7 @@ namespace gmkernel_detail {
 /// Is the direction (0, 1, 0) or (0, -1, 0) within the tolerance of directions?
 bool parallelToYAxis(GmDir const& dir);
 
-/// A straight carrier as y = k x + d; one parallel to the y axis has k = 0 and its x position in d.
+/// A line as y = k x + d; one parallel to the y axis has k = 0 and its x position in d.
 struct SlopeForm {
     bool parallelToY;
     double k;

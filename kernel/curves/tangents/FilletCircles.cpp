@@ -1,5 +1,11 @@
 /// @file
 /// Fillets between arcs, and between an arc and a segment.
+///
+/// A path that turns at a corner is rounded on the inner side of the turn. The fillet touches an
+/// arc from inside when the path turns the way the arc does, else from outside; with sides and
+/// kinds of contact known, the touching circles of the full figures give it. Where the path
+/// reverses there is no turn, and the side follows from the shape. Contacts may lie beyond the ends
+/// of the arcs: that is for the caller to test. Constant cost.
 #include <cmath>
 
 #include "gmkernel/GmAngle.h"
@@ -35,7 +41,7 @@ struct ArcEntry {
     GmDir alongArc;
     double angle;  // polar angle of the common end, radians
     GmBase::eRotDir sense;
-    GmLine carrier;
+    GmLine supportingLine;
 };
 
 ArcEntry entryOf(GmArc const& a, GmStretch const& s, bool bArcFirst) {
@@ -66,5 +72,5 @@ GmCircle::GmCircle(GmArc const& a, GmStretch const& s, double r, bool bArcFirst,
     if (!a.CreationOK() || !s.CreationOK() || !(r > 0.0)) return;
     const ArcEntry entry = entryOf(a, s, bArcFirst);
     const eRotDir turn = turnInto(entry);
-    CreateTangCircle(a, entry.carrier, r, turn == eRotCW, turn != entry.sense, bOther);
+    CreateTangCircle(a, entry.supportingLine, r, turn == eRotCW, turn != entry.sense, bOther);
 }

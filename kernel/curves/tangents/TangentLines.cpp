@@ -1,5 +1,11 @@
 /// @file
 /// Lines built from their tangency to circles.
+///
+/// From a point: the touching point sees point and centre at a right angle, so it lies on the
+/// circle over them as diameter (Thales). Common to two circles: the difference of the radii, or
+/// their sum for a tangent that crosses between them, over the distance of the centres is the sine
+/// of the angle to the line of centres. Which of the tangents is meant follows from the sides of
+/// the circles. Constant cost.
 #include <algorithm>
 #include <cmath>
 

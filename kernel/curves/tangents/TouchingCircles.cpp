@@ -1,5 +1,11 @@
 /// @file
 /// Circles through points and circles that touch lines and circles.
+///
+/// The centre is equally far from all that is touched, so it is the crossing of two places of such
+/// points: perpendicular bisectors, bisectors of lines, parallels at the radius, and circles with
+/// the radius added or taken off. Two crossings are told apart by the order of the contacts around
+/// the centre. Without a crossing the circle is undefined; contacts are not tested against the
+/// bounds of curves. Constant cost.
 #include <cmath>
 
 #include "gmkernel/GmCircle.h"
@@ -44,7 +50,7 @@ GmCircle::GmCircle(GmLine const& l1, GmLine const& l2, GmLine const& l3) : GmCir
 
 GmCircle::GmCircle(GmLine const& l1, GmLine const& l2, double r) : GmCircle() {
     if (!l1.CreationOK() || !l2.CreationOK()) return;
-    const auto crossing = gmkernel_detail::carrierHits(l1, l2);
+    const auto crossing = gmkernel_detail::supportHits(l1, l2);
     if (crossing.begin() == crossing.end()) return;
     const GmVec bisector(l1.Dir().Sym(l2.Dir()));
     const double angle = l1.Dir().RAngle(l2.Dir());

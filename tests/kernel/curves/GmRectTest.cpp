@@ -45,15 +45,15 @@ TEST(GmRect, OrdersItsCornersAndDropsZ) {
 }
 
 TEST(GmRect, IntersectsUnitesAndIncludes) {
-    GmRect const a(0, 0, 1, 1);
+    GmRect const unit(0, 0, 1, 1);
     EXPECT_EQ(GmRect(0, 0, 2, 2).And(GmRect(1, 1, 3, 3)), GmRect(1, 1, 2, 2));
-    EXPECT_EQ(a.And(GmRect(1, 0, 2, 1)), GmRect(1, 0, 1, 1));
-    EXPECT_TRUE(a.And(GmRect(1 + 5e-7, 0, 2, 1)).CreationOK());
-    EXPECT_FALSE(a.And(GmRect(1 + 2e-6, 0, 2, 1)).CreationOK());
-    EXPECT_FALSE(a.And(GmRect(0, 2, 1, 3)).CreationOK());
-    EXPECT_FALSE(a.And(GmRect()).CreationOK());
-    EXPECT_EQ(GmRect().Or(a), a);
-    EXPECT_EQ(a.Or(GmRect()), a);
+    EXPECT_EQ(unit.And(GmRect(1, 0, 2, 1)), GmRect(1, 0, 1, 1));
+    EXPECT_TRUE(unit.And(GmRect(1 + 5e-7, 0, 2, 1)).CreationOK());
+    EXPECT_FALSE(unit.And(GmRect(1 + 2e-6, 0, 2, 1)).CreationOK());
+    EXPECT_FALSE(unit.And(GmRect(0, 2, 1, 3)).CreationOK());
+    EXPECT_FALSE(unit.And(GmRect()).CreationOK());
+    EXPECT_EQ(GmRect().Or(unit), unit);
+    EXPECT_EQ(unit.Or(GmRect()), unit);
 
     GmRect grown;
     grown.Include(GmPoint());
@@ -68,10 +68,10 @@ TEST(GmRect, IntersectsUnitesAndIncludes) {
         RC_ASSERT(a.Or(b) == b.Or(a));
         RC_ASSERT(a.And(b) == b.And(a));
         RC_ASSERT(a.And(a.Or(b)) == a);
-        GmRect grown = a;
-        grown.Include(b.LTPoint());
-        grown.Include(b.RBPoint());
-        RC_ASSERT(grown == a.Or(b));
+        GmRect both = a;
+        both.Include(b.LTPoint());
+        both.Include(b.RBPoint());
+        RC_ASSERT(both == a.Or(b));
         std::unique_ptr<GmCurve> const wide(a.GetParallel(2));
         RC_ASSERT(a.And(wide->BoundingRect()) == a);
         RC_ASSERT(wide->BoundingRect().Width() == GmRect(a, 2).Width());

@@ -64,7 +64,7 @@ TEST(Joining, TrimCutsBothCurvesToTheirCrossing) {
     EXPECT_THROW(s.Trim(&rect), std::runtime_error);
 }
 
-TEST(Joining, ConcatMeetsOnTheCarriers) {
+TEST(Joining, ConcatMeetsOnTheSupportingCurves) {
     Curve const other = hold(Circle(5, 0, 2));
     auto const left = [] { return hold(Arc(0, 0, 5, 180, 80, CW)); };
     Case const table[] = {

@@ -92,14 +92,14 @@ TEST(GmLine, ParallelsOfStraightCurvesLieOnTheRight) {
     }));
 }
 
-TEST(GmLine, ComparesCarriersAndKeepsItsKind) {
+TEST(GmLine, ComparesSupportingLinesAndKeepsItsKind) {
     GmLine const line(GmPoint(0, 0), GmDir(1, 0));
     EXPECT_EQ(line, GmLine(GmPoint(9, 0), GmDir(-1, 0)));
     EXPECT_NE(line, GmLine(GmPoint(9, 0), GmDir(0, 1)));
     EXPECT_NE(line, GmLine(GmPoint(0, 1), GmDir(1, 0)));
     EXPECT_EQ(line.Dist(GmLine(GmPoint(7, 3), GmDir(-1, 0))), 3);
     EXPECT_EQ(line.Dist(GmLine(GmPoint(7, 3), GmDir(1, 1))), 0);
-    EXPECT_EQ(line.IntersectionWithLine(line.Inverted()), 0) << "coincident carriers";
+    EXPECT_EQ(line.IntersectionWithLine(line.Inverted()), 0) << "coincident lines";
     EXPECT_EQ(line.BoundingRect(), GmRect(0, 0, 0, 0));
     GmBeam beam(GmPoint(1, 2), GmDir(0, 1));
     EXPECT_TRUE(GmLine(beam).IsLine());
@@ -113,7 +113,7 @@ TEST(GmBeam, EndsAtItsOriginOnly) {
     EXPECT_TRUE(beam.Element(GmPoint(-0.00009, 0))) << "as good as the origin";
     EXPECT_FALSE(beam.Element(GmPoint(-0.00011, 0)));
     EXPECT_EQ(Text(beam.MinDist(GmPoint(-3, 2), false)), "0,0");
-    EXPECT_EQ(beam.Dist(GmPoint(-3, 2)), 2) << "of the carrier";
+    EXPECT_EQ(beam.Dist(GmPoint(-3, 2)), 2) << "of the supporting line";
     EXPECT_EQ(beam.PointPos(GmPoint(-3, 0)), -1) << "behind the origin is not on the ray";
     EXPECT_TRUE(beam == ahead && !(ahead == beam)) << "only one origin is on the other ray";
 

@@ -31,7 +31,7 @@ TEST(GmStretch, ClampsNearestPoints) {
     GmStretch const s = Stretch(0, 0, 10, 0);
     EXPECT_EQ(Text(s.MinDist(GmPoint(12, 3), true)), "0,0") << "the start is preferred";
     EXPECT_EQ(Text(s.MinDist(GmPoint(5, -1), true)), "5,0") << "but a foot comes first";
-    EXPECT_EQ(s.GmLine::Dist(GmPoint(-3, 4)), 4) << "of the carrier";
+    EXPECT_EQ(s.GmLine::Dist(GmPoint(-3, 4)), 4) << "of the supporting line";
     EXPECT_EQ(Text(Stretch(3, 1, 3, 1).MinDist(GmPoint(3, 9), false)), "3,1");
     GmStretch const backwards(GmPoint(1, 0), GmDir(1, 0), -2);
     EXPECT_EQ(Text(backwards.MinDist(GmPoint(0, 9), false)), "0,0");

@@ -18,9 +18,9 @@ namespace {
 using namespace gmkernel_detail;
 
 GmOffsetElement Segment(double x0, double y0, double x1, double y1, int id = 1,
-                        bool auxiliary = false) {
+                        PieceRole role = PieceRole::kChosenSide) {
     auto curve = std::make_unique<GmStretch>(GmPoint(x0, y0), GmPoint(x1, y1));
-    return {std::move(curve), 0, id, true, auxiliary};
+    return {std::move(curve), 0, id, role};
 }
 
 PieceList ListOf(std::vector<GmOffsetElement> const& elements) {
@@ -137,8 +137,8 @@ TEST(Chaining, PrefersCandidatesThatLeadOn) {
 }
 
 TEST(ResultContour, BridgesGapsAndTellsWhatIsMade) {
-    const auto contour = resultContour(ListOf(
-        {Segment(0, 0, 4, 0, 1), Segment(4, 0.0002, 4, 3, 2), Segment(4, 3.00005, 0, 0, 3, true)}));
+    const auto contour = resultContour(ListOf({Segment(0, 0, 4, 0, 1), Segment(4, 0.0002, 4, 3, 2),
+                                               Segment(4, 3.00005, 0, 0, 3, PieceRole::kEndCap)}));
     // One gap is bridged, the other within tolerance.
     ASSERT_EQ(shapes::Identifiers(*contour), (std::vector<long>{1, 2, 2, 3}));
     for (int i = 0; i < 4; ++i) {
@@ -146,6 +146,7 @@ TEST(ResultContour, BridgesGapsAndTellsWhatIsMade) {
         EXPECT_EQ(contour->GetContElement(i)->lIndex, i);
     }
     EXPECT_TRUE(contour->IsClosed());
-    EXPECT_TRUE(hasOffset(ListOf({Segment(0, 0, 1, 0, 1, true), Segment(1, 0, 2, 0)})));
-    EXPECT_FALSE(hasOffset(ListOf({Segment(0, 0, 1, 0, 1, true)})));
+    EXPECT_TRUE(
+        hasOffset(ListOf({Segment(0, 0, 1, 0, 1, PieceRole::kEndCap), Segment(1, 0, 2, 0)})));
+    EXPECT_FALSE(hasOffset(ListOf({Segment(0, 0, 1, 0, 1, PieceRole::kEndCap)})));
 }

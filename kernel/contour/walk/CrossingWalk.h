@@ -1,0 +1,55 @@
+#pragma once
+
+#include <functional>
+#include <memory>
+#include <vector>
+
+#include "gmkernel/GmCurve.h"
+#include "gmkernel/KxArray.h"
+#include "kernel/contour/walk/GmContIntPoint.h"
+
+namespace gmkernel_detail {
+
+using CrossingArray = KxArray<GmContIntPoint*, GmContIntPoint*>;
+
+/// The crossings between curves, in the order in which they were found.
+class Crossings {
+public:
+    /// Adds the crossings at a common point of two curves with the numbers `ia` and `ib`: from
+    /// either one onto the other. At a joint of elements only the element that arrives there is
+    /// left, and only the one that starts there is entered.
+    void AddBothWays(GmCurve const& a, int ia, GmCurve const& b, int ib, GmPoint const& p);
+    int Count() const { return m_array.GetSize(); }
+    GmContIntPoint& operator[](int index) { return *m_array[index]; }
+    CrossingArray const& Array() const { return m_array; }
+
+private:
+    void Add(int from, int to, GmPoint const& p);
+
+    std::vector<std::unique_ptr<GmContIntPoint>> m_owned;
+    CrossingArray m_array;
+};
+
+/// Looks along a curve from `p` to its end for the nearest crossing that is not used and leaves the
+/// curve `index`; at one place the last one answers. -1 when there is none, and for curves other
+/// than segments and arcs. "Nearest" is told within 1e-4, in length units on segments and in
+/// degrees on arcs.
+int nextCrossing(GmPoint const& p, GmCurve const& curve, int index, CrossingArray const& crossings);
+
+/// The curves that a walk goes along, and what it does with the pieces.
+struct WalkTrack {
+    std::function<GmCurve const&(int index)> curveAt;
+    /// The curve that the walk goes on with at the end of one.
+    std::function<int(int index)> following;
+    /// Takes up a piece; called after `following`.
+    std::function<void(GmCurve& piece)> append;
+    int curveCount = 0;
+};
+
+/// Walks from a crossing along the curves and over every crossing that comes, until it is back at
+/// the first one. Marks crossings as used. False when it does not come back within as many steps as
+/// there are pairs of curves and crossings, or goes past more curves than there are without a
+/// crossing: it would then go round for ever.
+bool walkLoop(Crossings& crossings, int start, WalkTrack const& track);
+
+}  // namespace gmkernel_detail
