@@ -260,11 +260,14 @@ TEST(BlockExpansion, LeavesOutPathsBeyondTheLargestCoordinate) {
 }
 
 TEST(BlockExpansion, EndsWithAnErrorWhenBlocksMultiply) {
-    const Drawing many = placing(array(refer("Q"), 1000, 900, {2, 2}));
-    EXPECT_EQ(expandBlocks(many, {}).paths.size(), 900000U);
-    for (const char* block : {"Q", "EMPTY"}) {
-        Drawing endless = placing(array(refer(block), 2'000'000'000, 2'000'000'000, {2, 2}));
-        endless.blocks["EMPTY"];
-        EXPECT_THROW(expandBlocks(endless, {}), InputError) << block;
-    }
+    const auto expanded = [](const char* block, int rows) {
+        Drawing drawing = placing(array(refer(block), 1000, rows, {2, 2}));
+        drawing.blocks["THREE"].paths.assign(3, quarter({0, 0}));
+        drawing.blocks["EMPTY"];
+        return expandBlocks(drawing, {}).paths.size();
+    };
+    EXPECT_EQ(expanded("THREE", 450), 1350000U);
+    EXPECT_THROW(expanded("THREE", 700), InputError);
+    EXPECT_EQ(expanded("EMPTY", 1900), 0U);
+    EXPECT_THROW(expanded("EMPTY", 2001), InputError);
 }

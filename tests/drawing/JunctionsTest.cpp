@@ -156,9 +156,9 @@ TEST(Junctions, ArePassedStraightestInAnyOrderAndSense) {
 }
 
 RC_GTEST_PROP(Junctions, WithEquallyStraightPassagesAreDecidedByTheirPlace, ()) {
-    // Spokes at equal angles, turned anyhow: rounding and order must not choose among them.
-    const int spokes = *rc::gen::inRange(3, 9);
-    const double turn = 0.01 * *rc::gen::inRange(0, 629);
+    // Spokes at equal angles, turned anyhow but with none above another one.
+    const int spokes = 3 + 2 * *rc::gen::inRange(0, 4);
+    const double turn = kPi / spokes * (*rc::gen::inRange(0, 40) + 0.01 * *rc::gen::inRange(3, 98));
     const Vec2 at = 0.1 * Vec2{1.0 * *rc::gen::inRange(-99, 99), 1.0 * *rc::gen::inRange(-99, 99)};
     std::vector<Path> paths;
     for (int i = 0; i < spokes; ++i) {
@@ -168,6 +168,16 @@ RC_GTEST_PROP(Junctions, WithEquallyStraightPassagesAreDecidedByTheirPlace, ()) 
     const Numbers pairs = joinedAnyhow(paths);
     RC_ASSERT(pairs.size() == paths.size() / 2);
     RC_ASSERT(pairs == joinedAnyhow(paths));
+    // The first pair is that of the leftmost spoke with the left one of the two across.
+    const auto isLeft = [&](int i, int k) {
+        return paths[i].elements[0].ep < paths[k].elements[0].ep;
+    };
+    int leftmost = 0;
+    for (int i = 1; i < spokes; ++i)
+        leftmost = isLeft(i, leftmost) ? i : leftmost;
+    const int across = (leftmost + spokes / 2) % spokes;
+    const int next = (across + 1) % spokes;
+    RC_ASSERT(pairs.count({leftmost + 1, (isLeft(across, next) ? across : next) + 1}) == 1U);
 }
 
 TEST(Junctions, HoldWhatIsWithinTheTolerance) {
