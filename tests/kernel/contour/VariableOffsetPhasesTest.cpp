@@ -1,4 +1,5 @@
 #include <gtest/gtest.h>
+#include <unistd.h>
 
 #include <memory>
 #include <string>
@@ -29,6 +30,15 @@ void expectCurves(CurveList const& curves, Words const& words) {
         EXPECT_EQ(curves[i].SP(), expected[i].SP()) << i;
         EXPECT_EQ(curves[i].EP(), expected[i].EP()) << i;
     }
+}
+
+/// Ends the process, by a signal when the gaps are not closed in time: behind a bridge that leaves
+/// its gap open there would come another one for ever.
+[[noreturn]] void closeGapsInTime(CurveList& curves, bool closed) {
+    constexpr unsigned kSeconds = 3;
+    alarm(kSeconds);
+    closeGaps(curves, closed);
+    _exit(0);
 }
 
 }  // namespace
@@ -91,6 +101,7 @@ TEST(VariableOffsetPhases, GapsAreTrimmedOrBridged) {
         SCOPED_TRACE(row.name);
         CurveList curves;
         fill(curves, row.curves);
+        ASSERT_EXIT(closeGapsInTime(curves, row.closed), testing::ExitedWithCode(0), "");
         closeGaps(curves, row.closed);
         expectCurves(curves, row.expected);
     }
