@@ -137,6 +137,14 @@ TEST(OffsetCheck, WhatTheKernelLeavesOutIsNoFaultWhileItIsTiny) {
     const double perSide = 2.0 * std::tan(path_shapes::kPi / 12);  // of the inner radius
     EXPECT_EQ(checkOffset(regular(12, 8e-4 + 10.0 * perSide), -10.0, {}), OffsetFault::kNone);
     EXPECT_EQ(checkOffset(regular(12, 2e-3 + 10.0 * perSide), -10.0, {}), OffsetFault::kMissing);
+    // Of forty such sides the loop is still a tiny one, of eighty no more.
+    const auto lost = [&](int corners) {
+        const double apothem = 10.0 + 0.5 * 8e-4 / std::tan(path_shapes::kPi / corners);
+        const double side = 2.0 * apothem * std::tan(path_shapes::kPi / corners);
+        return checkOffset(regular(corners, side), -10.0, {});
+    };
+    EXPECT_EQ(lost(40), OffsetFault::kNone);
+    EXPECT_EQ(lost(80), OffsetFault::kMissing);
     // Many short pieces are no tiny loop.
     EXPECT_EQ(checkOffset(regular(2000, 9e-4), 0.05, {}), OffsetFault::kMissing);
     // Hooks of 8e-4 run round their tip in the other sense; nothing is asked for there.

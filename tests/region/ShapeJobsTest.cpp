@@ -81,6 +81,10 @@ TEST(Corners, TouchNeitherTheirContourNorAnother) {
         polygon({{0, 0}, {30, 0}, {30, 5}, {5, 5}, {5, 15}, {5.8, 5.9}, {8, 15}, {5, 30}, {0, 30}});
     const CornerResult result = broken(spiked, {CornerKind::kRounding, 4, CornerChoice::kConcave});
     EXPECT_EQ(result.done, 0U);
+    // The tip of the notch lies in the corner; its sides are the elements next but one.
+    const Path notched = polygon({{20, 0}, {0, 0}, {0, 20}, {1.5, 1.5}});
+    for (const Path& path : {notched, reversed(notched)})
+        EXPECT_EQ(broken(path, {CornerKind::kRounding, 8, CornerChoice::kConvex}).done, 0U);
     const Path plate = rectangle({0, 0}, {30, 20});
     const std::vector<CornerResult> results = breakCorners(
         {plate, circle({0.6, 0.6}, 0.3), circle({28.5, 18.5}, 0.5)}, {CornerKind::kRounding, 5});
@@ -122,5 +126,9 @@ TEST(Melt, AnswersPairsWithoutLoops) {
     const Path wedge = polygon({{10, 5}, {4, 7}, {4, 3}});
     for (const Path& touching : {diamond, wedge, square})
         EXPECT_NE(meltContours({square}, {touching}).at(0).outcome, MeltOutcome::kLoops);
+    // Sides lie on each other in part: the common part comes twice, as only the areas tell.
+    const Path slanted = polygon({{0, 3}, {1, 1}, {3, 1}, {1, 3}});
+    const Path flush = polygon({{0, 3}, {2, 1}, {3, 1}, {3, 3}});
+    EXPECT_EQ(meltContours({slanted}, {flush}).at(0).outcome, MeltOutcome::kFailed);
     EXPECT_TRUE(meltContours({square}, {polygon({{1, 1}, {5, 5}, {30, 4}}, false)}).empty());
 }

@@ -134,6 +134,27 @@ TEST(OffsetStart, IsTheSmallestIdentifierNearestToTheMovedStart) {
     }
 }
 
+TEST(OffsetStart, OfElementsThatShareTheirIdentifierIsOnTheSideOfTheOffset) {
+    // So low that on the wrong side of the start another side's offset begins nearer.
+    GmContour flat;
+    const GmContour rectangle = Path("0 0  10 0  10 1  0 1  0 0");
+    for (int i = 0; i < rectangle.ElementCount(); ++i)
+        flat.AddElement(*rectangle.GetElement(i), false, 1);
+    for (shapes::Variant const& v : shapes::Variants(flat)) {
+        SCOPED_TRACE(v.name);
+        GmContour contour = v.contour;
+        const double offset = v.MapOffset(2.0);
+        const int count = contour.Offsetting(offset, 1000, false);
+        int sub = 0;
+        int elem = 0;
+        ASSERT_TRUE(FindTPCCont(&contour, count, offset, sub, elem));
+        GmCurve const& first = *contour.GetElement(0);
+        const GmDir right = first.TangSP().Normalized(GmBase::eRotCW);
+        EXPECT_EQ(contour.GetSubContour(sub)->GetElement(elem)->SP(),
+                  GmPoint(first.SP() + offset * GmVec(right)));
+    }
+}
+
 TEST(OffsetStart, TakesTheOnlyOpenOffsetOfAnOpenContour) {
     GmContour open = Path("0 0  20 0  20 10");
     int sub = 0;

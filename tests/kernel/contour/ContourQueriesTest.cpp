@@ -95,6 +95,8 @@ TEST(ContourQueries, NearestAndFarthestVertices) {
     EXPECT_EQ(square.NearPointElem(GmPoint(5.00004, 0)), 0) << "nearer by less than 1e-4";
     EXPECT_EQ(square.NearPointElem(GmPoint(5.0001, 0)), 1);
     EXPECT_EQ(square.FarPoint(GmPoint(5, 5)), GmPoint(0, 0)) << "the first of equally far ones";
+    EXPECT_EQ(square.FarPoint(GmPoint(5, 4.99995)), GmPoint(0, 0)) << "farther by less than 1e-4";
+    EXPECT_EQ(square.FarPoint(GmPoint(5, 4.9999)), GmPoint(10, 10));
     GmContour open = Path("0 0  10 0  10 10");
     EXPECT_EQ(open.NearPoint(GmPoint(10, 11)), GmPoint(10, 0)) << "the last end is no candidate";
     EXPECT_EQ(open.FarPoint(GmPoint(0, 0)), GmPoint(10, 10));

@@ -1,3 +1,4 @@
+#include <algorithm>
 #include <cmath>
 #include <limits>
 #include <stdexcept>
@@ -63,6 +64,33 @@ void assertSwapped(GmCurve const& a, GmCurve const& b) {
     }
 }
 
+/// A curve of a kind through (3, 4), there along `dir` if it is straight.
+std::unique_ptr<GmCurve> curveThroughCrossing(GmBase::eGmTypes kind, GmDir const& dir, bool second,
+                                              double z) {
+    // Circles of radius 5 about two centres, and their quarters about the crossing.
+    GmPoint const m(0, second ? 8 : 0, z);
+    double const start = second ? -M_PI / 2 : 0;
+    if (kind == GmBase::eGmCircle) return std::make_unique<GmCircle>(m, 5, true);
+    if (kind == GmBase::eGmArc) return std::make_unique<GmArc>(m, 5, start, start + M_PI / 2, CCW);
+    GmPoint const sp(GmPoint(3, 4, z) - 2 * GmVec(dir));
+    if (kind == GmBase::eGmLine) return std::make_unique<GmLine>(sp, dir);
+    if (kind == GmBase::eGmBeam) return std::make_unique<GmBeam>(sp, dir);
+    return std::make_unique<GmStretch>(sp, GmPoint(sp + 4 * GmVec(dir)));
+}
+
+/// Does the first of two curves give the z of their crossings? Round ones do before straight ones,
+/// otherwise what has more points; of two alike the first does. An upright line stands back.
+bool zComesFromFirst(GmBase::eGmTypes first, GmDir const& dirFirst, GmBase::eGmTypes second,
+                     GmDir const& dirSecond) {
+    std::vector<GmBase::eGmTypes> const order = {GmBase::eGmCircle, GmBase::eGmArc, GmBase::eGmLine,
+                                                 GmBase::eGmBeam, GmBase::eGmStretch};
+    auto const place = [&](auto kind) { return std::find(order.begin(), order.end(), kind); };
+    bool const firstGoesBefore = place(first) <= place(second);
+    auto const straight = [&](auto kind) { return place(kind) >= place(GmBase::eGmLine); };
+    bool const upright = (firstGoesBefore ? dirSecond : dirFirst) == GmDir(0, 1);
+    return firstGoesBefore != (straight(first) && straight(second) && upright);
+}
+
 /// Curves of every kind and from every constructor with one number in all places.
 std::vector<std::unique_ptr<GmCurve>> curvesOf(double v) {
     GmPoint const p(v, 1), q(2, v);
@@ -122,6 +150,30 @@ TEST(Intersection, FindsTheCrossingsOfEveryPair) {
                 assertSwapped(*a, *b);
             }));
             EXPECT_GT(crossings, 0);
+        }
+    }
+}
+
+TEST(Intersection, TakesZFromOneCurveOfThePair) {
+    // Heights within the tolerance, so that bounded curves accept each other's points.
+    double constexpr zFirst = 2e-5;
+    double constexpr zSecond = 7e-5;
+    struct {
+        GmDir first, second;
+    } const ways[] = {
+        {GmDir(1, 1), GmDir(1, -2)}, {GmDir(0, 1), GmDir(1, -2)}, {GmDir(1, 1), GmDir(0, 1)}};
+    for (GmBase::eGmTypes const first : Kinds()) {
+        for (GmBase::eGmTypes const second : Kinds()) {
+            for (auto const& way : ways) {
+                SCOPED_TRACE(PairName(first, second) + " along " + Text(way.first) + " and " +
+                             Text(way.second));
+                auto const a = curveThroughCrossing(first, way.first, false, zFirst);
+                auto const b = curveThroughCrossing(second, way.second, true, zSecond);
+                ASSERT_GE(a->Intersection(b.get()), 1);
+                bool const fromFirst = zComesFromFirst(first, way.first, second, way.second);
+                for (GmPoint const& p : a->GetPtSol())
+                    EXPECT_EQ(p.Z(), fromFirst ? zFirst : zSecond);
+            }
         }
     }
 }
