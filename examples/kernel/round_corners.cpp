@@ -38,9 +38,10 @@ int main(int argc, char** argv) {
     int outer = 0;
     int inner = 0;
     bool smooth = contour.IsClosed();
-    for (int i = 0; i < contour.ElementCount(); ++i) {
+    const int count = static_cast<int>(contour.ElementCount());
+    for (int i = 0; i < count; ++i) {
         const GmCurve* const element = contour.GetElement(i);
-        const GmCurve* const next = contour.GetElement((i + 1) % contour.ElementCount());
+        const GmCurve* const next = contour.GetElement((i + 1) % count);
         smooth = smooth && element->TangEP() == next->TangSP();
         if (!element->IsArc()) continue;
         const bool turnsWith = static_cast<const GmArc*>(element)->Dir() == GmBase::eRotCCW;

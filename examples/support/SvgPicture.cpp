@@ -75,7 +75,7 @@ public:
     std::string pathData(const GmCurve& curve) const {
         std::vector<SvgStep> steps;
         if (curve.IsLine()) {
-            steps = carrier(static_cast<const GmLine&>(curve));
+            steps = wholeLine(static_cast<const GmLine&>(curve));
         } else if (curve.IsCircle()) {
             const auto& circle = static_cast<const GmCircle&>(curve);
             const GmPoint sp(circle.M() + GmVec(circle.R(), 0.0, 0.0));
@@ -93,7 +93,7 @@ public:
 
 private:
     /// From edge to edge of the page and beyond.
-    std::vector<SvgStep> carrier(const GmLine& line) const {
+    std::vector<SvgStep> wholeLine(const GmLine& line) const {
         const GmVec reach =
             GmVec(line.Dir()) * (line.SP().Dist(m_box.Center()) + 2.0 * kPageWidth / m_scale);
         return {at(GmPoint(line.SP() - reach)), at(GmPoint(line.SP() + reach))};

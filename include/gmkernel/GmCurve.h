@@ -59,8 +59,9 @@ public:
     /// The points replace this curve's solution list; read them with GetSolution(). Points are kept
     /// only where they lie on both bounded curves (within m_scdPrec on beams and stretches, within
     /// 0.01 on arcs). A pair of two kinds and its swapped pair give the same points in the same
-    /// order. Two curves of one kind take z from the first one, and swapping two circles or arcs
-    /// reverses the order of their points. Coincident curves have no intersection.
+    /// order. Two curves of one kind take z from the first one, but straight ones from the second
+    /// where it alone is parallel to the y axis; swapping two circles or arcs reverses the order of
+    /// their points. Coincident curves have no intersection.
     /// @return the number of points found
     /// @throw std::runtime_error "Function not found" for a pair of kinds that cannot be
     ///        intersected (a helix or a rectangle takes part, also as an element of a contour), and

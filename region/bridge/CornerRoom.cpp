@@ -35,7 +35,7 @@ bool meetsOwnContour(const GmContour& contour, int index) {
 
 CornerRoom::CornerRoom(const std::vector<Path>& contours, std::size_t own) {
     for (std::size_t i = 0; i < contours.size(); ++i) {
-        if (i == own) continue;
+        if (i == own || contours[i].elements.empty()) continue;
         m_starts.push_back(contours[i].elements.front().sp);
         for (const Element& e : contours[i].elements)
             m_obstacles.push_back({boundingBox(e), kernelCurve(e)});

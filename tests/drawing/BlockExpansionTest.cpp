@@ -7,7 +7,8 @@
 #include "drawing/InputError.h"
 #include "tests/support/PathShapes.h"
 
-using namespace gmpath;
+using namespace gmdrawing;
+using namespace gmregion;
 
 namespace {
 

@@ -7,7 +7,8 @@
 
 #include "tests/support/PathShapes.h"
 
-using namespace gmpath;
+using namespace gmdrawing;
+using namespace gmregion;
 using path_shapes::circle;
 using path_shapes::polygon;
 using path_shapes::rectangle;

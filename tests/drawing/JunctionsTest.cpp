@@ -11,7 +11,8 @@
 #include "region/model/Placement.h"
 #include "tests/support/PathShapes.h"
 
-using namespace gmpath;
+using namespace gmdrawing;
+using namespace gmregion;
 using path_shapes::polygon;
 
 namespace {

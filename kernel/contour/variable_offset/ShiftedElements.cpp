@@ -20,7 +20,7 @@ GmDir shiftingDirection(GmCurve const& element) {
     return element.IsStretch() ? element.TangEP() : GmDir();
 }
 
-/// Directions along an axis count to the quadrants 1 and 3.
+/// Quadrants count from 0. Directions along an axis go with the second and the fourth.
 int quadrantOf(GmDir const& dir) {
     const int quadrant = dir.Quadrant();
     return quadrant == -1 ? dir.Quadrant24() : quadrant;
