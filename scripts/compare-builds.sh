@@ -146,7 +146,9 @@ compare_kernels() {
     [ "$count" -gt 0 ] || { echo "compare-builds: no hash to compare" >&2; return 1; }
     differing=$(differing_blocks "$results/base.hashes" "$results/other.hashes")
     if [ -n "$differing" ]; then
-        echo "compare-builds: $(wc -l <<<"$differing") of $count blocks differ; the first ones:"
+        echo "compare-builds: $(wc -l <<<"$differing") of $count blocks differ; by family:"
+        cut -d' ' -f1 <<<"$differing" | sort | uniq -c
+        echo "-- the first ones:"
         head -n "$shown" <<<"$differing"
         read -r family operations _ <<<"$differing"
         show_block "$family" "$operations"
