@@ -1,6 +1,6 @@
 #!/usr/bin/env bash
 # Builds two commits on this machine and compares every bit of what they answer: the kernel by the
-# operations of tests/net, the program by all that it writes for drawings.
+# operations of tools/compare, the program by all that it writes for drawings.
 #   scripts/compare-builds.sh BASE [OTHER] [--parts DIR]... [--kernel-only|--program-only]
 # OTHER is HEAD unless given; --parts adds a folder of drawings to examples/parts. What is asked comes
 # from the working tree, for both commits. Exit code: 0 all equal, 1 differences, 2 no comparison.
@@ -91,7 +91,7 @@ compile_net() { # sha
     export_header=$(find_built "$1" -path '*/gmkernel/export.h') || return
     library=$(find_built "$1" -name libgmkernel.so) || return
     rm -rf "$target" && mkdir -p "$target" || return
-    printf '%s\0' tests/net/*.cpp |
+    printf '%s\0' tools/compare/*.cpp |
         xargs -0 -P "$(nproc)" -I{} bash -c 'compile_one "$@"' compile_one "$target" {} \
             -I"$work/$1/source/include" -I"$(dirname "$(dirname "$export_header")")" &&
         g++ "$target"/*.o "$library" -Wl,-rpath,"$(dirname "$library")" -o "$target/net"
@@ -105,7 +105,7 @@ prepare() { # sha
     build "$1" >>"$log" 2>&1 || { tail -n 30 "$log" >&2; fail "${1:0:10} does not build"; }
     if $kernel; then
         compile_net "$1" >>"$log" 2>&1 ||
-            { tail -n 30 "$log" >&2; fail "tests/net does not compile against ${1:0:10}"; }
+            { tail -n 30 "$log" >&2; fail "tools/compare does not compile against ${1:0:10}"; }
     fi
 }
 
