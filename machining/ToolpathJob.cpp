@@ -1,3 +1,10 @@
+/// @file
+/// Cutting contours one after the other.
+///
+/// Runs of all contours are made first. Then, of those that may be cut, the one that starts nearest
+/// to the tool comes next, with all its passes and levels. That is a short way, not the shortest:
+/// no exchange of contours is tried afterwards.
+
 #include "machining/ToolpathJob.h"
 
 #include <algorithm>

@@ -1,3 +1,11 @@
+/// @file
+/// Paths that are drawn twice.
+///
+/// Copies have the same box, so only paths whose boxes have near middles are compared, found by a
+/// grid; then element by element, from every start where they are closed. Paths over the same
+/// course with other joints are no copies, nor are those that overlap in part. Cost: linear in the
+/// elements, but for many closed paths about one middle.
+
 #include "drawing/contours/Duplicates.h"
 
 #include <algorithm>

@@ -1,3 +1,12 @@
+/// @file
+/// Which ends of open paths belong together.
+///
+/// Ends within the tolerance are at one place, and so are those that a row of such ends connects.
+/// At a place the pairs are joined by how straight they go on, the straightest first: a line that
+/// another one touches goes on as one line. Straightness is compared in steps, and equal ones by
+/// position, so that the result depends on the drawing and not on the order in which it is written.
+/// It does not look ahead: a choice here may leave an end free elsewhere.
+
 #include "drawing/contours/Junctions.h"
 
 #include <algorithm>
@@ -91,7 +100,7 @@ std::vector<std::vector<PathEnd>> endsByPlace(const std::vector<Path>& paths,
 struct Pair {
     PathEnd a;
     PathEnd b;
-    double bend;  ///< 0 for a straight passage, 2 for a turn back, in steps
+    double bend;  ///< 0 straight on, 2 for a turn back, in steps
     Vec2 first;   ///< the smaller of the two halving points
     Vec2 second;  ///< the larger one
 };

@@ -1,3 +1,11 @@
+/// @file
+/// Which paths lie in which.
+///
+/// A path that does not cross another one lies in it when any of its points does; so a few dozen
+/// points are looked at, and those on the other's border, within the tolerance, do not count. Paths
+/// that cross have points on both sides and lie in neither. Boxes and areas spare most comparisons.
+/// It answers for pairs: paths that touch themselves are taken as their winding numbers are.
+
 #include "drawing/contours/Nesting.h"
 
 #include <algorithm>

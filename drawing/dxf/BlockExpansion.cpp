@@ -1,3 +1,10 @@
+/// @file
+/// Placing blocks within blocks.
+///
+/// References are followed depth first, each with the placement of all that hold it; a block that
+/// places itself is noticed by the row of open blocks. Since few lines can place a block millions
+/// of times, what is placed is counted, blocks as well as paths, and too much ends the expansion.
+
 #include "drawing/dxf/BlockExpansion.h"
 
 #include <algorithm>

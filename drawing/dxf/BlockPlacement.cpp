@@ -1,3 +1,10 @@
+/// @file
+/// The placement of a block: about its base point, scaled, turned, then moved to the cell of the
+/// reference, and mirrored last where it is drawn on the back of the plane.
+///
+/// Scale factors of one size but different sign mirror, which keeps arcs arcs; factors of different
+/// sizes would make them ellipses, and have no placement.
+
 #include "drawing/dxf/BlockPlacement.h"
 
 #include <cmath>

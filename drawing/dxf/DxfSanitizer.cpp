@@ -1,3 +1,12 @@
+/// @file
+/// Making DXF safe for a reader that trusts it.
+///
+/// The DXF library takes counts, kinds and numbers as they come. So the text is taken apart into
+/// records, and only those are written again that consist of known groups with sound numbers,
+/// vertices under their polyline, with the counts that are true of them. What is left out is
+/// counted with its reason, by block. Nothing is mended: an entity is taken as it is, or not at
+/// all.
+
 #include "drawing/dxf/DxfSanitizer.h"
 
 #include <algorithm>

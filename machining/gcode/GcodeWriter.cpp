@@ -1,3 +1,11 @@
+/// @file
+/// Moves as G-code.
+///
+/// A controller computes the radius of an arc at its start and at its end and refuses arcs whose
+/// radii differ. So every element is computed anew between its rounded ends, with the bulge kept,
+/// and the centre is rounded last: both radii agree within two units of the last decimal. Arcs of
+/// more than a half circle come in halves, since near the full circle the ends hardly fix a centre.
+
 #include "machining/gcode/GcodeWriter.h"
 
 #include <cmath>

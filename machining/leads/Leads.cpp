@@ -1,3 +1,10 @@
+/// @file
+/// Moves onto a cut and off it, as long as the room allows.
+///
+/// The kernel builds the move, on the waste side, to a segment that stands for the end of the cut.
+/// A lead that comes too near to a contour is halved, a few times; it is not turned, nor is another
+/// start of the cut sought.
+
 #include "machining/leads/Leads.h"
 
 #include "gmkernel/GmApprDepData.h"

@@ -1,9 +1,10 @@
-// Clearance is tested by marching along the path. The distance to the contours changes by no more
-// than the way gone, so from a point with room to spare the march may go on by as much as there is
-// to spare. Where there is none, as beside the edge that is being cut, it goes on by a step s so
-// small that what lies between two points is hardly nearer: the distance dips by at most
-// s^2/8 (1/r + 1/c) there, r the radius of the path and c the clearance, which is how far the
-// centre of the distance's own curve, a corner of the obstacle, is away.
+/// @file
+/// Clearance is tested by marching along the path. The distance to the contours changes by no more
+/// than the way gone, so from a point with room to spare the march may go on by as much as there is
+/// to spare. Where there is none, as beside the edge that is being cut, it goes on by a step s so
+/// small that what lies between two points is hardly nearer: the distance dips by at most s^2/8
+/// (1/r + 1/c) there, r the radius of the path and c the clearance, which is how far the centre of
+/// the distance's own curve, a corner of the obstacle, is away.
 
 #include "machining/obstacles/Obstacles.h"
 

@@ -1,3 +1,10 @@
+/// @file
+/// Where a run begins.
+///
+/// Every element of an offset knows the element of the contour that it comes from. The run begins
+/// beside the start of the contour, as drawings are made with a start in mind: on what comes from
+/// its first element, or from the first that has an offset. Linear in the elements.
+
 #include "machining/runs/RunStart.h"
 
 #include <algorithm>

@@ -1,3 +1,13 @@
+/// @file
+/// Melting pairs of contours, with a check of what comes of it.
+///
+/// The loops come from the kernel, which walks from crossing to crossing. What a loop runs round
+/// follows from the side on which it lies of the contour that it does not follow. The check needs
+/// no crossings: samples of an outline lie inside neither contour, those of a common part outside
+/// neither, and by inclusion and exclusion the areas of all loops add up to those of both contours.
+/// It finds loops that are wrong or missing; it mends none. Cost: the kernel's, plus the product of
+/// the numbers of elements.
+
 #include "region/boolean/MeltJob.h"
 
 #include <cmath>

@@ -1,3 +1,11 @@
+/// @file
+/// Room for cutting a corner off.
+///
+/// The new element must meet nothing but its neighbours; then only what lies wholly between it and
+/// the corner can still be cut off, and of a contour that lies there any one point tells. So the
+/// elements are intersected and one point of every other contour is looked up. Boxes spare most
+/// intersections. It does not find room by making the transition smaller.
+
 #include "region/bridge/CornerRoom.h"
 
 #include <algorithm>

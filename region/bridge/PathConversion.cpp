@@ -1,3 +1,11 @@
+/// @file
+/// Paths as contours of the kernel, and back.
+///
+/// The kernel holds arcs by centre and radius and counts ends within its tolerance as one point; a
+/// path holds arcs by their bulge, with exact ends. So on the way in elements too short for the
+/// kernel are left out, and on the way back every arc gets exactly the kernel's ends and the ends
+/// are made to meet. Identifiers of the kernel carry the indices of the source's elements.
+
 #include "region/bridge/PathConversion.h"
 
 #include <cmath>

@@ -1,3 +1,11 @@
+/// @file
+/// Rounding and chamfering the corners of all contours.
+///
+/// A corner is a joint that bends; whether it is convex follows from the sense of the whole
+/// contour. Corners are done from the last to the first, so that new elements do not move the
+/// indices of those still to do. Each is tried on a copy and kept if there is room: a corner done
+/// earlier may take the room of a later one, and no best choice among them is sought.
+
 #include "region/corners/CornerJob.h"
 
 #include <cmath>

@@ -1,3 +1,11 @@
+/// @file
+/// Segments and arcs by their ends and bulge.
+///
+/// The bulge is the tangent of a quarter of the sweep, so that half and full sweep, centre, halving
+/// point and tangents follow from it by rational formulas: the sine and cosine of half the sweep
+/// are 2b/(1+b^2) and (1-b^2)/(1+b^2). Flat arcs keep all digits, since nothing is taken from a
+/// far-off centre but the centre itself. Full circles have no bulge; they come as halves.
+
 #include "region/model/Element.h"
 
 #include <algorithm>

@@ -1,3 +1,10 @@
+/// @file
+/// Where a closed path starts.
+///
+/// The place is the nearest point over all elements; a path is started there by turning the row of
+/// its elements and splitting the one that holds the place. Near a joint nothing is split, so that
+/// no element comes out too short. Linear in the elements.
+
 #include "region/model/PathStart.h"
 
 #include <algorithm>

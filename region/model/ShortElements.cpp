@@ -1,3 +1,10 @@
+/// @file
+/// Dropping short elements without opening the path.
+///
+/// The element behind a dropped one is stretched back to where the dropped one started. So a row of
+/// short elements shrinks towards its start instead of adding up gaps, and each end moves by less
+/// than the limit. It does not look at what the moved elements may cross.
+
 #include "region/model/ShortElements.h"
 
 namespace gmregion {

@@ -1,3 +1,13 @@
+/// @file
+/// Offsets tried in several positions until one stands the check.
+///
+/// Where an offset fails in the kernel, it does so by rounding: a side that is nearly upright, a
+/// short first element, arcs that nearly vanish. The same path turned, begun elsewhere or offset in
+/// two steps meets other roundings, and the check, which shares no code with the kernel, tells when
+/// it comes out right. So the first sound result is taken, and the least faulty one otherwise. It
+/// is a net under single failures: where the method itself has no answer, as beside a path that
+/// crosses itself, no attempt helps. Cost: one offset and one check an attempt, at most eight.
+
 #include "region/offset/CheckedOffset.h"
 
 #include <algorithm>

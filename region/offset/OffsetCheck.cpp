@@ -1,9 +1,11 @@
-// Why the test for missing parts is sound: the offset is where the distance from the source passes
-// |d|. Take a point p of a parallel or corner arc, and n, the unit vector that leads away from the
-// source there. If the source is farther than |d| + tolerance/2 from p + tolerance * n, then the
-// distance passes |d| within the tolerance of p, even where the source was moved by less than
-// tolerance/2 before it was offset. Where parallels coincide, as in a slot exactly two distances
-// wide, or hardly part, the condition fails, and it does not matter whether a result lies there.
+/// @file
+/// Comparing an offset with its source, with geometry of its own. Why the test for missing parts is
+/// sound: the offset is where the distance from the source passes |d|. Take a point p of a parallel
+/// or corner arc, and n, the unit vector that leads away from the source there. If the source is
+/// farther than |d| + tolerance/2 from p + tolerance * n, then the distance passes |d| within the
+/// tolerance of p, even where the source was moved by less than tolerance/2 before it was offset.
+/// Where parallels coincide, as in a slot exactly two distances wide, or hardly part, the condition
+/// fails, and it does not matter whether a result lies there.
 
 #include "region/offset/OffsetCheck.h"
 

@@ -1,3 +1,10 @@
+/// @file
+/// The untrimmed offset: every parallel, and every arc about a corner that opens to the side.
+///
+/// The true offset is a part of it: each of its points has a nearest point on the source, and lies
+/// square to the element there or on the circle about the corner there. What of it comes too near
+/// to other elements is not cut away here.
+
 #include "region/offset/RawOffset.h"
 
 #include <optional>

@@ -1,3 +1,12 @@
+/// @file
+/// Nearest elements by nested boxes.
+///
+/// The boxes halve the row of elements, whose neighbours in the row are neighbours in space; a box
+/// farther away than the best distance so far is passed over with all it holds. Building is linear
+/// in the elements; a question takes the logarithm of their number where few are near, and up to
+/// all of them where all are equally near, as at the centre of a circle. The tree is never
+/// rebalanced: it serves one path that does not change.
+
 #include "region/search/ElementTree.h"
 
 #include <algorithm>
