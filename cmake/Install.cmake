@@ -9,6 +9,7 @@ install(TARGETS gmkernel EXPORT gmkernelTargets
 install(DIRECTORY "${PROJECT_SOURCE_DIR}/include/gmkernel"
                   "${PROJECT_BINARY_DIR}/include/gmkernel"
     DESTINATION "${CMAKE_INSTALL_INCLUDEDIR}" FILES_MATCHING PATTERN "*.h")
+install(FILES "${PROJECT_SOURCE_DIR}/LICENSE" DESTINATION "${CMAKE_INSTALL_DOCDIR}")
 set(package_dir "${CMAKE_INSTALL_LIBDIR}/cmake/gmkernel")
 install(EXPORT gmkernelTargets NAMESPACE gmkernel:: DESTINATION "${package_dir}")
 configure_package_config_file("${CMAKE_CURRENT_LIST_DIR}/gmkernelConfig.cmake.in"

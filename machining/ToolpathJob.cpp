@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 /// @file
 /// Cutting contours one after the other.
 ///
@@ -180,7 +181,7 @@ ToolpathResult makeToolpath(
         runs.push_back(runsOf(contours[i], static_cast<int>(holders[i].size()), request));
         progress(i + 1, contours.size());
     }
-    ToolpathOrder order(holders);
+    CutOrder order(holders);
     ToolpathJob job(contours, request);
     ToolpathResult result{{}, std::vector<ContourCut>(contours.size())};
     for (auto ready = order.ready(); !ready.empty(); ready = order.ready()) {

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 #pragma once
 
 #include <functional>
@@ -45,7 +46,7 @@ struct ToolpathResult {
 };
 
 /// Cuts every contour on its waste side, open ones on both sides. Of the contours that may come
-/// next (`ToolpathOrder`) the one whose start is nearest is cut, in all its passes; a pass is cut
+/// next (`CutOrder`) the one whose start is nearest is cut, in all its passes; a pass is cut
 /// run by run, the nearest first, and a run through all levels at once.
 ToolpathResult makeToolpath(
     const std::vector<gmregion::Path>& contours, const ToolpathRequest& request,

@@ -7,13 +7,14 @@ set -euo pipefail
 packages=(
     g++ cmake ninja-build pkg-config
     libboost-dev libwxgtk3.2-dev          # the library
-    libdxflib-dev libcli11-dev libutfcpp-dev  # gmpath
+    libdxflib-dev libcli11-dev            # gmpath
+    libutfcpp-dev                         # gmpath and the examples
     libgtest-dev librapidcheck-dev        # tests
     libbenchmark-dev                      # benchmarks
 )
 case "${1:-}" in
     "") ;;
-    --ci) packages+=(clang clang-format clang-tidy doxygen libxml2-utils) ;;
+    --ci) packages+=(clang clang-format clang-tidy doxygen libxml2-utils valgrind) ;;
     *) echo "usage: $0 [--ci]" >&2; exit 2 ;;
 esac
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 #include "apps/gmpath/InfoCommand.h"
 
 #include <memory>

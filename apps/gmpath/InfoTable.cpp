@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 #include "apps/gmpath/InfoTable.h"
 
 #include <algorithm>

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 #include "apps/gmpath/InputOptions.h"
 
 #include "apps/gmpath/InfoTable.h"

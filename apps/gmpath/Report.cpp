@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 #include "apps/gmpath/Report.h"
 
 #include "drawing/Text.h"

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 #include "bench/kernel/chains.h"
 
 #include <cmath>

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 /// @file
 /// Closed contours of any size for the benchmarks.
 #pragma once

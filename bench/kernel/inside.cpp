@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Is a point inside a contour of many elements?
 
 #include <benchmark/benchmark.h>

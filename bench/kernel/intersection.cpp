@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // One intersection of each ordered pair of kinds.
 
 #include <benchmark/benchmark.h>

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Offsets of closed contours to both sides.
 
 #include <benchmark/benchmark.h>

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Melting two contours of many elements, and rounding all corners of one.
 
 #include <benchmark/benchmark.h>

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 /// @file
 /// From loose paths to contours.
 ///

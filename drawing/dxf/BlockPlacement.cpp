@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 /// @file
 /// The placement of a block: about its base point, scaled, turned, then moved to the cell of the
 /// reference, and mirrored last where it is drawn on the back of the plane.

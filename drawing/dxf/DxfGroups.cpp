@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 #include "drawing/dxf/DxfGroups.h"
 
 #include <cerrno>

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 /// @file
 /// Making DXF safe for a reader that trusts it.
 ///

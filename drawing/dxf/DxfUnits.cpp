@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 #include "drawing/dxf/DxfUnits.h"
 
 #include <optional>

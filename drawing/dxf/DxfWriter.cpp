@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 #include "drawing/dxf/DxfWriter.h"
 
 #include <dxflib/dl_dxf.h>

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 #include "drawing/files/AtomicFile.h"
 
 #include <fcntl.h>

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 #include "drawing/files/OutputFiles.h"
 
 #include <algorithm>

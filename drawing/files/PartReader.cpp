@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 #include "drawing/files/PartReader.h"
 
 #include <dxflib/dl_dxf.h>

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 #include "drawing/svg/ResultPicture.h"
 
 #include <array>

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 #include "drawing/svg/SvgPage.h"
 
 #include <algorithm>

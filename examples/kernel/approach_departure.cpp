@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 /// @file
 /// Moves onto a path and off it, both on its left: a run and a quarter of an arc that touches the
 /// path, and an arc that leaves it followed by the tangent to a given point.

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 /// @file
 /// Puts a fillet between an arc and the segment that follows it.
 ///

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 /// @file
 /// Intersects curves: a contour with a circle, and a line with that circle.
 ///

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 /// @file
 /// Melts two overlapping contours: their boundaries make the outline of both and of what they have
 /// in common.

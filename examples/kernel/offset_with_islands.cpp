@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 /// @file
 /// Passes in a pocket: the outline is offset inwards and the islands outwards, until paths cross.
 /// All run counter-clockwise, so a positive distance, to the right, leads outwards.

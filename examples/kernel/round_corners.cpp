@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 /// @file
 /// Rounds the corners of a contour: outer ones and inner ones with radii of their own.
 ///

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 #include "SvgPicture.h"
 
 #include <algorithm>

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 #ifndef GMKERNEL_GMANGLE_H
 #define GMKERNEL_GMANGLE_H
 

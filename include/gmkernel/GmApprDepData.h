@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 /// @file
 /// What a caller gives to build an approach or departure move.
 #ifndef GMKERNEL_GMAPPRDEPDATA_H

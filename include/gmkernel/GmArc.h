@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 /// @file
 /// The circular arc.
 #ifndef GMKERNEL_GMARC_H

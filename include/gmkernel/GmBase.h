@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 #ifndef GMKERNEL_GMBASE_H
 #define GMKERNEL_GMBASE_H
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 /// @file
 /// The ray.
 #ifndef GMKERNEL_GMBEAM_H

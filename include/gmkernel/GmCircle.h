@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 /// @file
 /// The full circle.
 #ifndef GMKERNEL_GMCIRCLE_H

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 /// @file
 /// The record of one contour element.
 #ifndef GMKERNEL_GMCONTELEMENT_H

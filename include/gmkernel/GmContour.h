@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 /// @file
 /// The contour: a chain of segments and arcs.
 #ifndef GMKERNEL_GMCONTOUR_H

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 /// @file
 /// The curve interface, the solution list and two function objects over curves.
 #ifndef GMKERNEL_GMCURVE_H

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 #ifndef GMKERNEL_GMDIR_H
 #define GMKERNEL_GMDIR_H
 

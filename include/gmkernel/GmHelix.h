@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 /// @file
 /// The helical piece over an arc.
 #ifndef GMKERNEL_GMHELIX_H

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 /// @file
 /// The infinite straight line.
 #ifndef GMKERNEL_GMLINE_H

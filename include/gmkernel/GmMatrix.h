@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 #ifndef GMKERNEL_GMMATRIX_H
 #define GMKERNEL_GMMATRIX_H
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 #ifndef GMKERNEL_GMPOINT_H
 #define GMKERNEL_GMPOINT_H
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 #ifndef GMKERNEL_GMRECT_H
 #define GMKERNEL_GMRECT_H
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 /// @file
 /// Conversions of coordinates between a plane and a rotary axis.
 #ifndef GMKERNEL_GMROTARY_H

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 /// @file
 /// The straight segment.
 #ifndef GMKERNEL_GMSTRETCH_H

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 #ifndef GMKERNEL_GMVEC_H
 #define GMKERNEL_GMVEC_H
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 /// @file
 /// The growable array of the contour's records.
 #ifndef GMKERNEL_KXARRAY_H

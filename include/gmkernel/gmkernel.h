@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 /// @file
 /// The whole public interface of gmkernel in one include.
 #ifndef GMKERNEL_GMKERNEL_H

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 #include "kernel/contour/ContourElements.h"
 
 #include "gmkernel/GmArc.h"

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 /// @file
 /// Inside and outside by the parity of crossings along a segment from the point.
 ///

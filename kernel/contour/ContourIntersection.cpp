@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 /// @file
 /// Intersections of a contour with a curve and with another contour.
 ///

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 #include "gmkernel/GmArc.h"
 #include "gmkernel/GmContour.h"
 #include "gmkernel/GmLine.h"

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 /// @file
 /// The sub-contours that operations leave in a contour.
 ///

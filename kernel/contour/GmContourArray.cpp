@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 #include "kernel/contour/GmContourArray.h"
 
 #include "kernel/values/HandedOver.h"

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 /// @file
 /// Nearest and touching points of circles and arcs.
 ///

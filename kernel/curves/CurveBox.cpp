@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 /// @file
 /// The box of all points that can come out of an intersection with a curve.
 ///

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 #include "gmkernel/GmBeam.h"
 
 GmBeam::GmBeam() {

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 #include "gmkernel/GmCircle.h"
 
 #include <algorithm>

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 /// @file
 /// What all curves share: the solution list and two general searches for nearest points.
 ///

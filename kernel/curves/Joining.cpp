@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 /// @file
 /// How a curve's end and the next curve's start are brought together.
 ///

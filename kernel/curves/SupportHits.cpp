@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 #include "kernel/curves/SupportHits.h"
 
 #include "kernel/curves/kernels/CircleCircle.h"

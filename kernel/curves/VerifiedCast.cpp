@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 #include "kernel/curves/VerifiedCast.h"
 
 #include "gmkernel/GmArc.h"

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 /// @file
 /// From a base reference to the class that a type tag promises, with the object itself as witness.
 ///

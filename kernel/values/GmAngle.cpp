@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 /// @file
 /// Angles in degrees, kept in (-180, 180].
 ///

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 #include "gmkernel/GmBase.h"
 
 // Literals, so that the values stand before any initialisation code of another file runs.

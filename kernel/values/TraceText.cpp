@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 #include "kernel/values/TraceText.h"
 
 #include <wx/string.h>

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 #include "machining/gcode/MachineUnits.h"
 
 #include <array>

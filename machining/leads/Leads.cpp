@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 /// @file
 /// Moves onto a cut and off it, as long as the room allows.
 ///

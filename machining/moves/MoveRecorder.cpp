@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 #include "machining/moves/MoveRecorder.h"
 
 namespace gmmachining {

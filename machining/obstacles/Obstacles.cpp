@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 /// @file
 /// Clearance is tested by marching along the path. The distance to the contours changes by no more
 /// than the way gone, so from a point with room to spare the march may go on by as much as there is

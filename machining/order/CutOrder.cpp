@@ -1,10 +1,11 @@
+// SPDX-License-Identifier: MIT
 #include "machining/order/CutOrder.h"
 
 #include <utility>
 
 namespace gmmachining {
 
-ToolpathOrder::ToolpathOrder(std::vector<std::vector<std::size_t>> holders)
+CutOrder::CutOrder(std::vector<std::vector<std::size_t>> holders)
     : m_holders(std::move(holders)),
       m_heldUncut(m_holders.size(), 0),
       m_finished(m_holders.size()) {
@@ -14,7 +15,7 @@ ToolpathOrder::ToolpathOrder(std::vector<std::vector<std::size_t>> holders)
     }
 }
 
-std::vector<std::size_t> ToolpathOrder::ready() const {
+std::vector<std::size_t> CutOrder::ready() const {
     std::vector<std::size_t> found;
     for (std::size_t i = 0; i < m_holders.size(); ++i) {
         if (!m_finished[i] && m_heldUncut[i] == 0) found.push_back(i);
@@ -22,7 +23,7 @@ std::vector<std::size_t> ToolpathOrder::ready() const {
     return found;
 }
 
-void ToolpathOrder::finish(std::size_t contour) {
+void CutOrder::finish(std::size_t contour) {
     m_finished[contour] = true;
     for (const std::size_t holder : m_holders[contour])
         --m_heldUncut[holder];

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 #pragma once
 
 #include <vector>
@@ -8,10 +9,10 @@ namespace gmmachining {
 
 /// Which contours may be cut next: those that hold no other one, closed or open, that is still to
 /// be cut. So holes come before the outline that holds them, as long as the part is held fast.
-class ToolpathOrder {
+class CutOrder {
 public:
     /// `holders` has for every contour the indices of the contours round it (`enclosingPaths`).
-    explicit ToolpathOrder(std::vector<std::vector<std::size_t>> holders);
+    explicit CutOrder(std::vector<std::vector<std::size_t>> holders);
 
     /// Indices in increasing order; none when all is cut.
     std::vector<std::size_t> ready() const;

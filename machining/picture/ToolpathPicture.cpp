@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 #include "machining/picture/ToolpathPicture.h"
 
 #include <algorithm>

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 #include "machining/runs/ToolRuns.h"
 
 #include "machining/runs/RunStart.h"

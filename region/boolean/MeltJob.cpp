@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 /// @file
 /// Melting pairs of contours, with a check of what comes of it.
 ///

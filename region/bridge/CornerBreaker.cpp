@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 #include "region/bridge/CornerBreaker.h"
 
 namespace gmregion {

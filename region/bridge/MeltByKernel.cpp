@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 #include "region/bridge/MeltByKernel.h"
 
 #include "gmkernel/GmContour.h"

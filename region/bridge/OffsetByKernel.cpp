@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 #include "region/bridge/OffsetByKernel.h"
 
 #include "gmkernel/GmContour.h"

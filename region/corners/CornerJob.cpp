@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 /// @file
 /// Rounding and chamfering the corners of all contours.
 ///

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 /// @file
 /// Area of closed chains of segments and arcs: the shoelace sum of the polygon of the chords plus
 /// the signed area of the circular segment between every arc and its chord. Exact but for rounding,

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 #include "region/model/Box.h"
 
 #include <algorithm>

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 /// @file
 /// Segments and arcs by their ends and bulge.
 ///

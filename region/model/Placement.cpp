@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 #include "region/model/Placement.h"
 
 #include <cmath>

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 /// @file
 /// Winding number of closed chains of segments and arcs: the crossing count of the polygon of the
 /// chords (half-open in y, after Sunday, "Inclusion of a Point in a Polygon") plus one for every

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 /// @file
 /// Offsets tried in several positions until one stands the check.
 ///

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 /// @file
 /// Comparing an offset with its source, with geometry of its own. Why the test for missing parts is
 /// sound: the offset is where the distance from the source passes |d|. Take a point p of a parallel

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 #include "region/offset/OffsetJob.h"
 
 #include "region/model/Area.h"

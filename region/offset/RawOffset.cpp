@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 /// @file
 /// The untrimmed offset: every parallel, and every arc about a corner that opens to the side.
 ///

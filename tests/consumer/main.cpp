@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Uses each exported class or function once from outside, and fails when an answer is wrong.
 
 #include <cmath>

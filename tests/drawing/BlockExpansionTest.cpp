@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 #include "drawing/dxf/BlockExpansion.h"
 
 #include <gtest/gtest.h>

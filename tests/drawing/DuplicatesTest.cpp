@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 #include "drawing/contours/Duplicates.h"
 
 #include <gtest/gtest.h>

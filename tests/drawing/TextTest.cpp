@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 #include "drawing/Text.h"
 
 #include <gtest/gtest.h>

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 #include "region/model/Area.h"
 #include "region/model/Box.h"
 #include "region/model/Winding.h"

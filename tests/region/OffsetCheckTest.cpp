@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 #include "region/offset/OffsetCheck.h"
 
 #include <gtest/gtest.h>

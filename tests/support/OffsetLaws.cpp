@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 #include "tests/support/OffsetLaws.h"
 
 #include <gtest/gtest.h>

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 #include "Answer.h"
 
 #include <cmath>

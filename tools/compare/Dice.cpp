@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 #include "Dice.h"
 
 #include <cmath>

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 #include "Families.h"
 #include "Shapes.h"
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Hashes what the kernel answers to many seeded operations, so that two builds of it can be
 // compared bit by bit. Only public headers are used: the same sources compile against any of them.
 #include <algorithm>

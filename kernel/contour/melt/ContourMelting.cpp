@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 /// @file
 /// Melting two closed contours: the loops that their boundaries form together.
 ///

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 #include "kernel/contour/offset/ActivePieces.h"
 
 #include <algorithm>

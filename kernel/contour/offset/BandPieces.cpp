@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 /// @file
 /// The band of an element: all points within |d| of it, bounded by both offsets and two caps.
 ///

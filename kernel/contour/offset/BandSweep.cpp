@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 /// @file
 /// The sweep along the source that makes, cuts and sorts out the pieces of all bands.
 ///

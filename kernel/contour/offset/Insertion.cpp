@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 /// @file
 /// Cutting the pieces of bands at their mutual crossings.
 ///

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 #include "kernel/contour/offset/OffsetElement.h"
 
 #include <utility>

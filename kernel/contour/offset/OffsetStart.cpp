@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 /// @file
 /// Where a path along the offsets of a contour starts.
 ///

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 /// @file
 /// From a chain of pieces to a contour.
 ///

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 /// @file
 /// Offsetting element by element, with neighbours trimmed to each other and nothing else cut.
 ///

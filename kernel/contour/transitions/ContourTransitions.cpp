@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 /// @file
 /// Roundings and chamfers at the junctions of a contour.
 ///

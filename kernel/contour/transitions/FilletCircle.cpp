@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 /// @file
 /// Which constructor of a circle rounds which pair of segments and arcs.
 ///

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 /// @file
 /// The arc or chamfer that comes into a corner, from its two elements alone.
 ///

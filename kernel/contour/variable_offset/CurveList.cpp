@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 #include "kernel/contour/variable_offset/CurveList.h"
 
 #include "kernel/values/HandedOver.h"

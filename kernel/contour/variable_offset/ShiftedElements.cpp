@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 /// @file
 /// Moving elements by a vector each, and closing the gaps that this leaves.
 ///

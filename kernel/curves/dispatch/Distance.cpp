@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 /// @file
 /// Which function measures which ordered pair of points, stretches and arcs.
 ///

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 /// @file
 /// Which kernel intersects which ordered pair of curves.
 ///

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 /// @file
 /// The sense in which three angles follow each other on the circle.
 ///

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 #include "kernel/curves/kernels/CircleLine.h"
 
 #include "gmkernel/GmVec.h"

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 /// @file
 /// Fillets between arcs, and between an arc and a segment.
 ///

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 /// @file
 /// Circles through points and circles that touch lines and circles.
 ///

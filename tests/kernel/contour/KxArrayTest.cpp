@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 #include "gmkernel/KxArray.h"
 
 #include <gtest/gtest.h>

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 #include "tests/kernel/curves/CurveCases.h"
 
 #include <algorithm>

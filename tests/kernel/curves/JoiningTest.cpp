@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 #include <stdexcept>
 
 #include "gmkernel/GmRect.h"

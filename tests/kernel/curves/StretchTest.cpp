@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 #include "gmkernel/GmMatrix.h"
 #include "tests/kernel/curves/CurveCases.h"
 

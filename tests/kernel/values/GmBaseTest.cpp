@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 #include "gmkernel/GmBase.h"
 
 #include <gtest/gtest.h>

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 #include "gmkernel/GmMatrix.h"
 
 #include <gtest/gtest.h>

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 #include "gmkernel/GmPoint.h"
 
 #include <gtest/gtest.h>

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 #include "gmkernel/GmVec.h"
 
 #include <gtest/gtest.h>

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 #include "tests/kernel/contour/offset/PlainOffsetting.h"
 
 #include <gtest/gtest.h>
