@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: MIT
 #include <gtest/gtest.h>
+#include <sys/stat.h>
 
 #include <filesystem>
 #include <regex>
@@ -141,4 +142,30 @@ TEST(OutputFiles, AllOrNoneAreWritten) {
         EXPECT_THROW(checkOutputs(names, scratch.file("in.dxf")), InputError) << names[0];
     }
     EXPECT_EQ(scratch.files(), 2U);
+}
+
+TEST(AtomicFile, TakesItsPlaceAsAWholeWithOrdinaryPermissions) {
+    const Scratch scratch;
+    const std::string name = scratch.file("a.txt");
+    scratch.store("a.txt", "old");
+    {
+        AtomicFile dropped(name);
+        dropped.write("never seen");
+        EXPECT_EQ(scratch.files(), 2U);
+    }
+    EXPECT_EQ(scratch.files(), 1U);
+    const mode_t before = umask(027);
+    AtomicFile file(name);
+    AtomicFile other(scratch.file("b.txt"));
+    umask(before);
+    file.write("new");
+    file.synchronise();
+    EXPECT_EQ(scratch.content("a.txt"), "old");
+    file.commit();
+    other.commit();
+    EXPECT_EQ(scratch.content("a.txt"), "new");
+    EXPECT_EQ(scratch.files(), 2U);
+    using std::filesystem::perms;
+    const perms expected = perms::owner_read | perms::owner_write | perms::group_read;
+    EXPECT_EQ(std::filesystem::status(name).permissions(), expected);
 }

@@ -10,7 +10,7 @@
 
 namespace gmkernel_detail {
 
-/// A band piece in a working list, with what spares it needless tests.
+/// A band piece in a working list, with its box and its halving point computed once.
 struct Piece {
     explicit Piece(GmOffsetElement source) : element(std::move(source)) { measure(); }
 
