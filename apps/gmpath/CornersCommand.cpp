@@ -48,13 +48,13 @@ struct CornersOptions {
 void addSizes(CLI::App& corners, CornersOptions& options) {
     CLI::App* sizes = corners.add_option_group("size", "What the corners become");
     sizes->add_option("--radius", options.radius, "round them with this radius")
-        ->check(positiveNumber());
+        ->transform(positiveNumber());
     sizes->add_option("--chamfer", options.chamfer, "chamfer them, this far from the corner")
-        ->check(positiveNumber());
+        ->transform(positiveNumber());
     sizes
         ->add_option("--chamfer-length", options.chamferLength,
                      "chamfer them, with a chamfer of this length")
-        ->check(positiveNumber());
+        ->transform(positiveNumber());
     sizes->require_option(1);
 }
 
@@ -69,7 +69,7 @@ void addOptions(CLI::App& corners, CornersOptions& options) {
             "only corners that turn against it")
         ->excludes(convex);
     corners.add_option("--bend", options.bend, "joints that bend by fewer degrees are no corners")
-        ->check(angleUpTo(kHalfTurn))
+        ->transform(angleUpTo(kHalfTurn))
         ->capture_default_str();
     addOutputs(corners, options.outputs);
     addInputOptions(corners, options.input);
@@ -92,7 +92,7 @@ PassName nameOf(const CornerRequest& request) {
 
 /// What is to be told about a contour, empty when all went well.
 std::string remark(const CornerResult& result) {
-    if (result.refusal != Refusal::kNone) return "left as it is, " + refusalText(result.refusal);
+    if (result.refusal != Refusal::kNone) return "left as it is: " + refusalText(result.refusal);
     if (result.notDone == 0) return {};
     return "no room at " + std::to_string(result.notDone) + " of " +
            counted(result.done + result.notDone, "corner");

@@ -2,6 +2,8 @@
 #include "apps/gmpath/InfoTable.h"
 
 #include <algorithm>
+#include <cmath>
+#include <optional>
 
 #include "drawing/Text.h"
 #include "drawing/contours/Nesting.h"

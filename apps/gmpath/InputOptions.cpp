@@ -17,10 +17,10 @@ void addInputOptions(CLI::App& command, InputOptions& input) {
     command
         .add_option("--join", input.read.joinTolerance,
                     "join ends that lie this far apart, in units of the drawing")
-        ->check(positiveNumber())
+        ->transform(positiveNumber())
         ->capture_default_str();
     command.add_option("--scale", input.read.scale, "multiply all coordinates of the drawing")
-        ->check(positiveNumber())
+        ->transform(positiveNumber())
         ->capture_default_str();
     command.add_flag("--strict", input.strict, "entities that cannot be used are an error");
 }

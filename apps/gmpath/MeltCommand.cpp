@@ -60,7 +60,7 @@ std::string outcomeText(const MeltedPair& pair) {
         case MeltOutcome::kSame:
             return "no loops, they are the same";
         case MeltOutcome::kRefused:
-            return "not melted, of one of them " + refusalText(pair.refusal);
+            return "not melted, in one of them " + refusalText(pair.refusal);
         case MeltOutcome::kFailed:
             return "the loops are not outline and common parts";
         case MeltOutcome::kApart:

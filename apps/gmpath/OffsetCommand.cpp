@@ -3,6 +3,7 @@
 
 #include <algorithm>
 #include <cmath>
+#include <map>
 #include <memory>
 #include <optional>
 
@@ -36,7 +37,6 @@ namespace {
 
 constexpr int kMaxPasses = 10'000;
 
-constexpr int kDistanceDigits = 9;
 constexpr int kLegendDigits = 6;
 
 struct OffsetOptions {
@@ -57,12 +57,16 @@ const std::map<std::string, Side>& sideNames() {
 
 void addOptions(CLI::App& offset, OffsetOptions& options) {
     addInputOptions(offset, options.input);
-    offset.add_option("-d,--distance", options.distance, "distance of the first pass")->required();
+    offset.add_option("-d,--distance", options.distance, "distance of the first pass")
+        ->transform(finiteNumber())
+        ->required();
     offset.add_option("--count", options.count, "number of passes")
-        ->check(CLI::Range(1, kMaxPasses))
+        ->transform(countUpTo(kMaxPasses))
         ->capture_default_str();
-    offset.add_option("--step", options.step,
-                      "distance from one pass to the next [the first distance]");
+    offset
+        .add_option("--step", options.step,
+                    "distance from one pass to the next [the first distance]")
+        ->transform(finiteNumber());
     addNamedOption(offset, "--side", options.side, sideNames(),
                    "waste (outside of outlines, inside of holes; open contours both), right, left, "
                    "inside, outside or both [waste]");
@@ -74,8 +78,8 @@ std::vector<double> distancesOf(const OffsetOptions& options) {
     std::vector<double> distances;
     for (int pass = 0; pass < options.count; ++pass) {
         const double distance = options.distance + pass * step;
-        if (!std::isfinite(distance) || std::abs(distance) > kLargestNumber) {
-            throw InputError("--distance, --step: not a finite number, or beyond 1e9");
+        if (std::abs(distance) > kLargestNumber) {
+            throw InputError("--distance, --step, --count: the last pass lies beyond 1e9");
         }
         distances.push_back(distance);
     }
@@ -100,7 +104,7 @@ ResultDrawing drawingOf(const Part& part, const std::vector<ContourOffsets>& off
 void reportContour(std::size_t contour, const std::vector<double>& distances,
                    const ContourOffsets& offsets, const Report& report) {
     if (offsets.refusal != Refusal::kNone) {
-        report.tell(contour, "no offsets, " + refusalText(offsets.refusal));
+        report.tell(contour, "no offsets: " + refusalText(offsets.refusal));
         return;
     }
     for (const FaultyOffset& faulty : offsets.faults)

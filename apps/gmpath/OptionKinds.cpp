@@ -1,7 +1,9 @@
 // SPDX-License-Identifier: MIT
 #include "apps/gmpath/OptionKinds.h"
 
+#include <cmath>
 #include <functional>
+#include <optional>
 
 #include "drawing/Text.h"
 
@@ -12,21 +14,31 @@ using gmdrawing::parseReal;
 
 namespace {
 
-/// A check that the text is a number that fits, or else is refused with the cause. Comparisons that
-/// are true for the numbers wanted let no NaN pass; the checks that come with the parser would.
+/// Refuses a text that is no number or does not fit, with the cause, and rewrites others plainly,
+/// so that the parser reads the number that was checked. Comparisons that are true for the numbers
+/// wanted let no NaN pass.
 CLI::Validator numberThat(const std::function<bool(double)>& fits, const std::string& cause) {
-    const auto check = [=](const std::string& text) {
-        const auto number = parseReal(text);
-        return number && fits(*number) ? std::string() : cause;
+    const auto check = [=](std::string& text) {
+        constexpr int kAllDigits = 17;
+        const bool hasComma = text.find(',') != std::string::npos;
+        const auto number = hasComma ? std::nullopt : parseReal(text);
+        if (!number || !fits(*number)) return cause;
+        text = formatReal(*number, kAllDigits);
+        return std::string();
     };
     return CLI::Validator(check, "");
 }
 
 }  // namespace
 
+CLI::Validator finiteNumber() {
+    return numberThat([](double value) { return std::abs(value) <= kLargestNumber; },
+                      "not a finite number up to " + formatReal(kLargestNumber));
+}
+
 CLI::Validator positiveNumber() {
     return numberThat([](double value) { return value > 0.0 && value <= kLargestNumber; },
-                      "not a positive finite number");
+                      "not a number above 0 and up to " + formatReal(kLargestNumber));
 }
 
 CLI::Validator numberFrom(double low) {
@@ -37,6 +49,13 @@ CLI::Validator numberFrom(double low) {
 CLI::Validator angleUpTo(double largest) {
     return numberThat([=](double value) { return value > 0.0 && value <= largest; },
                       "not a number above 0 and up to " + formatReal(largest));
+}
+
+CLI::Validator countUpTo(int largest) {
+    const auto fits = [=](double value) {
+        return value >= 1.0 && value <= largest && value == std::floor(value);
+    };
+    return numberThat(fits, "not a whole number from 1 to " + std::to_string(largest));
 }
 
 void addOutputs(CLI::App& command, std::vector<std::string>& outputs,

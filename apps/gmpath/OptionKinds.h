@@ -11,14 +11,23 @@ namespace gmpath {
 /// Numbers beyond this leave the plane in which the kernel can tell points apart.
 constexpr double kLargestNumber = 1e9;
 
-/// Check for an option: a positive finite number up to 1e9. It does not show in the help.
+/// Numbers as options take them, to be given to `transform`: decimal, with a point, refused with
+/// the range in words where they lie outside. They do not show in the help.
+
+/// A number from -1e9 to 1e9.
+CLI::Validator finiteNumber();
+
+/// A number above 0 and up to 1e9.
 CLI::Validator positiveNumber();
 
-/// The same for a number from `low` to 1e9.
+/// A number from `low` to 1e9.
 CLI::Validator numberFrom(double low);
 
-/// The same for an angle in degrees above 0, up to `largest`.
+/// An angle in degrees above 0, up to `largest`.
 CLI::Validator angleUpTo(double largest);
+
+/// A whole number from 1 to `largest`.
+CLI::Validator countUpTo(int largest);
 
 /// Adds an option whose values have names; anything but the names is refused. `value` and `names`
 /// are used when the command line is parsed.

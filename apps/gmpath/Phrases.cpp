@@ -12,12 +12,6 @@ using gmregion::FaultyOffset;
 using gmregion::kKernelTolerance;
 using gmregion::Refusal;
 
-namespace {
-
-constexpr int kDistanceDigits = 9;
-
-}  // namespace
-
 std::string faultText(const FaultyOffset& faulty) {
     const std::string side = faulty.distance > 0.0 ? "right" : "left";
     return "the offset by " + formatReal(std::abs(faulty.distance), kDistanceDigits) + " to the " +
@@ -32,9 +26,12 @@ std::string refusalText(Refusal refusal) {
         case Refusal::kJoint:
             return "an arc, very flat or far from the origin, misses its neighbour by " +
                    tolerance + " or more: draw a line in its place, or move the part to the origin";
-        case Refusal::kTouchesStart:
-            return "it is open, but comes within " + tolerance +
+        case Refusal::kEndsAtStart:
+            return "it is open, but its end comes within " + tolerance +
                    " of its start: close it (--join), or draw its ends farther apart";
+        case Refusal::kPassesStart:
+            return "it is open, but passes within " + tolerance +
+                   " of its start: begin it elsewhere, or split it there";
         case Refusal::kNone:
             break;
     }

@@ -7,6 +7,9 @@
 
 namespace gmpath {
 
+/// Digits of distances in remarks.
+constexpr int kDistanceDigits = 9;
+
 /// What is wrong with an offset.
 std::string faultText(const gmregion::FaultyOffset& faulty);
 

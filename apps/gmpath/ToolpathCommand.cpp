@@ -62,7 +62,7 @@ std::string droppedText(const LeadTally& leads) {
 
 /// What is to be told about a contour, empty when all went well.
 std::string remark(const ContourCut& cut) {
-    if (cut.refusal != Refusal::kNone) return "not cut, " + refusalText(cut.refusal);
+    if (cut.refusal != Refusal::kNone) return "not cut: " + refusalText(cut.refusal);
     if (!cut.fits) return "the tool does not fit";
     std::string text;
     const auto add = [&](bool applies, const std::string& what) {
@@ -77,8 +77,9 @@ std::string remark(const ContourCut& cut) {
 }
 
 void reportContours(const Report& report, const std::vector<ContourCut>& cuts) {
-    const auto twoSided = std::count_if(cuts.begin(), cuts.end(),
-                                        [](const ContourCut& cut) { return cut.bothSides; });
+    const auto twoSided = std::count_if(cuts.begin(), cuts.end(), [](const ContourCut& cut) {
+        return cut.bothSides && cut.refusal == Refusal::kNone;
+    });
     if (twoSided > 0) {
         report.tell(counted(static_cast<std::size_t>(twoSided), "open contour") +
                     " cut on both sides");

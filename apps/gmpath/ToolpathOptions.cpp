@@ -38,18 +38,18 @@ const std::map<std::string, Units>& unitNames() {
 
 void addPassOptions(CLI::App& command, ToolpathOptions& options) {
     command.add_option("-t,--tool", options.tool, "diameter of the tool")
-        ->check(numberFrom(kThinnestTool))
+        ->transform(numberFrom(kThinnestTool))
         ->required();
     command.add_option("--stock", options.stock, "material left on the part")
-        ->check(numberFrom(0.0))
+        ->transform(numberFrom(0.0))
         ->capture_default_str();
     command.add_option("--count", options.count, "number of passes, the last along the part")
-        ->check(CLI::Range(1, kMaxPasses))
+        ->transform(countUpTo(kMaxPasses))
         ->capture_default_str();
     command
         .add_option("--step", options.step,
                     "distance from one pass to the next [radius of the tool]")
-        ->check(positiveNumber());
+        ->transform(positiveNumber());
     CLI::Option* climb =
         command.add_flag("--climb", "the part lies right of the tool (the default)");
     command.add_flag("--conventional", options.conventional, "the part lies left of the tool")
@@ -62,18 +62,18 @@ void addLeadOptions(CLI::App& command, ToolpathOptions& options) {
     command
         .add_option("--lead-length", options.leadLength,
                     "length of straight leads [radius of the tool]")
-        ->check(positiveNumber());
+        ->transform(positiveNumber());
     command
         .add_option("--lead-radius", options.leadRadius, "radius of arc leads [radius of the tool]")
-        ->check(positiveNumber());
+        ->transform(positiveNumber());
     command.add_option("--lead-angle", options.leadAngle, "sweep of arc leads in degrees")
-        ->check(angleUpTo(kLargestLeadAngle))
+        ->transform(angleUpTo(kLargestLeadAngle))
         ->capture_default_str();
 }
 
 void addMachineOptions(CLI::App& command, ToolpathOptions& options) {
     const auto add = [&](const char* name, std::optional<double>& value, const char* description) {
-        command.add_option(name, value, description)->check(numberFrom(kSmallestProgramValue));
+        command.add_option(name, value, description)->transform(numberFrom(kSmallestProgramValue));
     };
     add("--depth", options.depth, "depth of the cut [1 mm, 0.04 in]");
     add("--step-down", options.stepDown, "depth from one level to the next [the whole depth]");

@@ -11,6 +11,7 @@
 #include "drawing/contours/ChainBuilder.h"
 
 #include <algorithm>
+#include <optional>
 
 #include "drawing/contours/Duplicates.h"
 #include "drawing/contours/Junctions.h"

@@ -10,6 +10,7 @@
 #include "drawing/contours/Duplicates.h"
 
 #include <algorithm>
+#include <cmath>
 
 #include "region/model/Box.h"
 #include "region/search/PointGrid.h"

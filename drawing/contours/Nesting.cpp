@@ -9,7 +9,7 @@
 
 #include "drawing/contours/Nesting.h"
 
-#include <algorithm>
+#include <cmath>
 
 #include "region/model/Area.h"
 #include "region/model/Box.h"

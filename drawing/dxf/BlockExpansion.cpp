@@ -113,7 +113,8 @@ private:
 
     void countPlaced() {
         if (++m_placed <= kMaxPlaced) return;
-        throw InputError("the blocks of the drawing multiply beyond all measure");
+        throw InputError("the blocks of the drawing place more than " + std::to_string(kMaxPlaced) +
+                         " parts");
     }
 
     const Drawing& m_drawing;

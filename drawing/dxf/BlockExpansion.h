@@ -1,7 +1,6 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include <string>
 #include <vector>
 
 #include "drawing/SkipReport.h"
@@ -21,7 +20,8 @@ struct ExpandedDrawing {
 ///
 /// References to unknown blocks, to a block from within itself, and with a scale that is not
 /// uniform are counted as unusable; so are paths that come to lie beyond 1e9 units. Throws
-/// InputError when the blocks multiply beyond two million paths.
+/// InputError when the blocks multiply beyond two million paths and placed blocks, and counts
+/// blocks nested deeper than 64 as unusable.
 ExpandedDrawing expandBlocks(const Drawing& drawing, const gmregion::Placement& placement);
 
 }  // namespace gmdrawing

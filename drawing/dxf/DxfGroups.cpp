@@ -1,4 +1,11 @@
 // SPDX-License-Identifier: MIT
+/// @file
+/// DXF text as groups.
+///
+/// A group is two lines, a code and its value. Anything else ends the reading with the number of
+/// the line: a file that is damaged in one place is not guessed at in the next. Values point into
+/// the text.
+
 #include "drawing/dxf/DxfGroups.h"
 
 #include <cerrno>

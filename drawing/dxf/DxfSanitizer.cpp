@@ -15,6 +15,7 @@
 #include <cstdlib>
 #include <initializer_list>
 #include <optional>
+#include <string_view>
 
 #include "drawing/Text.h"
 

@@ -2,6 +2,7 @@
 #include "drawing/dxf/DxfUnits.h"
 
 #include <optional>
+#include <string_view>
 
 #include "drawing/Text.h"
 

@@ -9,7 +9,6 @@
 #include <map>
 #include <memory>
 
-#include "drawing/Text.h"
 #include "drawing/dxf/NumberLocale.h"
 
 namespace gmdrawing {

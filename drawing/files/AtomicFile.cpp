@@ -1,4 +1,12 @@
 // SPDX-License-Identifier: MIT
+/// @file
+/// A file that is there as a whole or not at all.
+///
+/// What is written under another name in the same directory can be renamed in one step, so that
+/// readers see the old content or the new one, also after a crash. That holds for one file: of
+/// several, the first may have its name when the second one fails. What is left by a process that
+/// was killed is not cleared away.
+
 #include "drawing/files/AtomicFile.h"
 
 #include <fcntl.h>
@@ -50,8 +58,7 @@ AtomicFile::AtomicFile(std::string name) : m_name(std::move(name)) {
     constexpr int kAttempts = 100;
     int descriptor = -1;
     for (int attempt = 0; attempt < kAttempts && descriptor < 0; ++attempt) {
-        const std::string beside = "." + path.filename().string() + "." + uniqueSuffix();
-        m_besideName = (path.parent_path() / beside).string();
+        m_besideName = (path.parent_path() / (".unfinished-" + uniqueSuffix())).string();
         descriptor = createNew(m_besideName);
         if (descriptor < 0 && errno != EEXIST) break;
     }

@@ -27,7 +27,7 @@ void checkOutputs(const std::vector<std::string>& names, const std::string& inpu
 /// cannot be written.
 void writeOutputs(const std::vector<OutputFormat>& formats, const std::vector<std::string>& names);
 
-/// The same for a part and its offsets, as .svg or .dxf.
+/// The same for a part and what came of it, as .svg or .dxf.
 void writeOutputs(const ResultDrawing& drawing, const std::vector<std::string>& names);
 
 }  // namespace gmdrawing

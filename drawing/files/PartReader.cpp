@@ -6,7 +6,6 @@
 #include <sstream>
 
 #include "drawing/InputError.h"
-#include "drawing/Text.h"
 #include "drawing/contours/ChainBuilder.h"
 #include "drawing/dxf/BlockExpansion.h"
 #include "drawing/dxf/DxfGroups.h"
@@ -31,10 +30,10 @@ void add(SkipReport& report, const SkipReport& other) {
 Drawing readSanitized(const SanitizedDrawing& sanitized) {
     requirePlainNumbers();
     std::istringstream stream(sanitized.text);
-    DxfReader adapter;
+    DxfReader collector;
     DL_Dxf reader;
-    reader.in(stream, &adapter);
-    Drawing drawing = adapter.takeDrawing();
+    reader.in(stream, &collector);
+    Drawing drawing = collector.takeDrawing();
     for (const auto& [block, report] : sanitized.skipped) {
         add(block.empty() ? drawing.model.skipped : drawing.blocks[block].skipped, report);
     }

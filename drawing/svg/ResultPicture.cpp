@@ -2,6 +2,7 @@
 #include "drawing/svg/ResultPicture.h"
 
 #include <array>
+#include <optional>
 
 #include "drawing/contours/Nesting.h"
 #include "drawing/svg/SvgPage.h"

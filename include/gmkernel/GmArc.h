@@ -67,7 +67,9 @@ protected:
 public:
     /// Ends this arc, and starts `next`, at their crossing; with two crossings at the one farther
     /// from this arc's start (a tie takes the first). True without change when they meet already.
-    /// @throw std::runtime_error for a `next` that cannot be intersected with an arc
+    /// @throw std::runtime_error for a `next` that cannot be intersected with an arc, and when the
+    /// tag of
+    ///        either is that of another class
     bool Trim(GmCurve* next) override;
     /// A new connection from this end to the start of `next`, owned by the caller. Mode 0: a
     /// stretch. Mode 1: the arc that leaves this one tangentially, under the conditions of

@@ -41,10 +41,10 @@ struct GmContIntPoint;
 /// index outside answers null or changes nothing.
 ///
 /// A contour has no move: returning one by value, where the compiler does not elide it, and
-/// assigning a temporary clone the elements. Assigning through a reference to GmCurve or GmBase
-/// copies creation flag and type tag and leaves the elements. A contour with the tag of another
-/// class is refused by intersections like a pair that cannot be intersected, and distances from it
-/// are still those from its elements.
+/// assigning a temporary clone the elements. Assigning through a reference to GmBase copies
+/// creation flag and type tag, through one to GmCurve the solution list as well, and leaves the
+/// elements. A contour with the tag of another class is refused by intersections like a pair that
+/// cannot be intersected, and distances from it are still those from its elements.
 ///
 /// Elements that cannot be intersected (a helix, a rectangle) make every operation throw that
 /// intersects the elements: Intersection(), IntersectionWithCurve(), In() and Out(), SplitAt() with

@@ -46,7 +46,9 @@ public:
     /// Ends this segment, and starts `next`, at their crossing; with two crossings at the one
     /// farther from this segment's start (a tie takes the first). True without change when they
     /// meet already.
-    /// @throw std::runtime_error for a `next` that cannot be intersected with a segment
+    /// @throw std::runtime_error for a `next` that cannot be intersected with a segment, and when
+    /// the tag
+    ///        of either is that of another class
     bool Trim(GmCurve* next) override;
     /// A new connection from this end to the start of `next`, owned by the caller. Mode 0: a
     /// stretch, undefined where `next` has no start. Mode 1: the arc that leaves this segment

@@ -10,6 +10,7 @@
 #include "machining/obstacles/Obstacles.h"
 
 #include <algorithm>
+#include <cmath>
 
 namespace gmmachining {
 

@@ -1,4 +1,11 @@
 // SPDX-License-Identifier: MIT
+/// @file
+/// Cutting from the inside out.
+///
+/// Every contour counts those inside it that are still to be cut, and is ready when there are none.
+/// It does not choose among those that are ready. Cost: linear in the pairs that lie in one
+/// another.
+
 #include "machining/order/CutOrder.h"
 
 #include <utility>

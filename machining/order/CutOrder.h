@@ -3,8 +3,6 @@
 
 #include <vector>
 
-#include "region/model/Path.h"
-
 namespace gmmachining {
 
 /// Which contours may be cut next: those that hold no other one, closed or open, that is still to

@@ -1,5 +1,15 @@
 // SPDX-License-Identifier: MIT
+/// @file
+/// Offsets as a tool runs along them.
+///
+/// On which side of a run the contour lies is measured, since an offset may run either way: a small
+/// step off its longest element comes nearer to the contour on one side. So the sense holds also
+/// for paths that cross themselves or have no inside.
+
 #include "machining/runs/ToolRuns.h"
+
+#include <cmath>
+#include <optional>
 
 #include "machining/runs/RunStart.h"
 #include "region/model/PathStart.h"

@@ -1,4 +1,10 @@
 // SPDX-License-Identifier: MIT
+/// @file
+/// Corners by the kernel's transitions.
+///
+/// Each is made on a copy, which takes the place of the contour when there is room. Linear in the
+/// elements for each corner.
+
 #include "region/bridge/CornerBreaker.h"
 
 namespace gmregion {

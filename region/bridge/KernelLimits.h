@@ -13,7 +13,8 @@ enum class Refusal {
     kNone,         ///< it has
     kTooSmall,     ///< an element is shorter than the kernel's tolerance, or no number
     kJoint,        ///< an arc too flat, or too far from the origin, misses its neighbour
-    kTouchesStart  ///< an open path comes back to its start, within the tolerance
+    kEndsAtStart,  ///< an open path ends where it starts, within the tolerance
+    kPassesStart   ///< an open path comes by its start again, within the tolerance
 };
 
 }  // namespace gmregion

@@ -75,7 +75,8 @@ Refusal fillContour(GmContour& contour, const SimplifiedPath& source) {
         if (!contour.AddElement(curve.get(), false, id)) return Refusal::kJoint;
     }
     if (contour.IsClosed() == source.path.closed) return Refusal::kNone;
-    return source.path.closed ? Refusal::kJoint : Refusal::kTouchesStart;
+    if (source.path.closed) return Refusal::kJoint;
+    return contour.EP() == contour.SP() ? Refusal::kEndsAtStart : Refusal::kPassesStart;
 }
 
 IdentifiedPath pathFromKernel(const GmContour& contour, const std::string& layer) {

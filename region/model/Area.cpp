@@ -7,6 +7,8 @@
 
 #include "region/model/Area.h"
 
+#include <cmath>
+
 namespace gmregion {
 
 namespace {

@@ -10,6 +10,7 @@
 #include "region/model/Element.h"
 
 #include <algorithm>
+#include <cmath>
 #include <limits>
 
 namespace gmregion {

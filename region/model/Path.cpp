@@ -2,6 +2,7 @@
 #include "region/model/Path.h"
 
 #include <algorithm>
+#include <cmath>
 #include <limits>
 
 namespace gmregion {

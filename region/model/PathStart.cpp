@@ -9,6 +9,7 @@
 #include "region/model/PathStart.h"
 
 #include <algorithm>
+#include <cmath>
 
 namespace gmregion {
 

@@ -11,6 +11,7 @@
 #include "region/offset/OffsetCheck.h"
 
 #include <algorithm>
+#include <cmath>
 
 #include "region/model/Area.h"
 #include "region/model/Box.h"
@@ -85,7 +86,7 @@ public:
           m_outwards(d > 0.0 ? 1.0 : -1.0),
           m_tolerance(checkTolerance(source)) {}
 
-    bool keepDistance(const std::vector<Path>& results) const {
+    bool allKeepDistance(const std::vector<Path>& results) const {
         return forSamples(allElements(results), [&](const Element& e, double t, double /*share*/) {
             const Vec2 p = pointAt(e, t);
             return !m_source.comesNearer(p, m_distance - m_tolerance) &&
@@ -169,7 +170,7 @@ OffsetFault checkOffset(const Path& source, double d, const std::vector<Path>& r
         return OffsetFault::kOpen;
     }
     const OffsetCheck check(source, d);
-    if (!check.keepDistance(results)) return OffsetFault::kDistance;
+    if (!check.allKeepDistance(results)) return OffsetFault::kDistance;
     return check.isComplete(results) ? OffsetFault::kNone : OffsetFault::kMissing;
 }
 

@@ -1,4 +1,11 @@
 // SPDX-License-Identifier: MIT
+/// @file
+/// Offsetting all contours of a drawing, in passes.
+///
+/// The side that is asked for becomes the sign of the distance by the sense of the contour, and for
+/// the waste side by its nesting depth: outlines are left on the outside, holes on the inside.
+/// Contours are offset one by one: offsets of neighbours that cross are not joined.
+
 #include "region/offset/OffsetJob.h"
 
 #include "region/model/Area.h"

@@ -3,7 +3,6 @@
 
 #include <functional>
 #include <optional>
-#include <string_view>
 #include <vector>
 
 #include "region/bridge/KernelLimits.h"

@@ -8,6 +8,7 @@
 
 #include "region/offset/RawOffset.h"
 
+#include <cmath>
 #include <optional>
 
 namespace gmregion {

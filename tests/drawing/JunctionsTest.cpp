@@ -157,7 +157,7 @@ TEST(Junctions, ArePassedStraightestInAnyOrderAndSense) {
     }
 }
 
-RC_GTEST_PROP(Junctions, WithEquallyStraightPassagesAreDecidedByTheirPlace, ()) {
+RC_GTEST_PROP(Junctions, WithEquallyStraightPairsAreDecidedByTheirPlace, ()) {
     // Spokes at equal angles, turned anyhow but with none above another one.
     const int spokes = 3 + 2 * *rc::gen::inRange(0, 4);
     const double turn = kPi / spokes * (*rc::gen::inRange(0, 40) + 0.01 * *rc::gen::inRange(3, 98));

@@ -163,10 +163,10 @@ TEST(PartReader, BlocksThatMultiplyEndWithAnError) {
         blocks += block("B" + std::to_string(i), {0, 0}, reference + reference);
     }
     const std::string top = entity("INSERT", {{2, "B29"}, {10, "0"}, {20, "0"}});
-    EXPECT_NE(causeOf(drawing(top, blocks)).find("multiply"), std::string::npos);
+    EXPECT_NE(causeOf(drawing(top, blocks)).find("place more than"), std::string::npos);
     const std::string array =
         entity("INSERT", {{2, "B0"}, {10, "0"}, {20, "0"}, {70, "2000000000"}, {71, "2000000000"}});
-    EXPECT_NE(causeOf(drawing(array, blocks)).find("multiply"), std::string::npos);
+    EXPECT_NE(causeOf(drawing(array, blocks)).find("place more than"), std::string::npos);
 }
 
 TEST(PartReader, UnusableEntitiesAreCountedByKindLayerAndReason) {

@@ -77,7 +77,7 @@ TEST(DxfWriter, GeometryIsReadBack) {
     }
 }
 
-TEST(SvgPicture, PathDataEndsWhereTheElementsEnd) {
+TEST(ResultPicture, PathDataEndsWhereTheElementsEnd) {
     for (const Path& path : someContours()) {
         const std::string data = svgPathData(path);
         const std::vector<Vec2> ends = commandEnds(data);
@@ -94,7 +94,7 @@ TEST(SvgPicture, PathDataEndsWhereTheElementsEnd) {
               "M 1 0 A 1 1 0 1 1 0 -1");
 }
 
-TEST(SvgPicture, PictureIsWellFormedAndFits) {
+TEST(ResultPicture, PictureIsWellFormedAndFits) {
     const Sample sample;
     const std::string svg = svgOf(sample.drawing());
     // Every tag is closed in order, and the layer's name did not open one.

@@ -3,10 +3,8 @@
 #include <rapidcheck.h>
 
 #include <filesystem>
-#include <set>
 
 #include "drawing/InputError.h"
-#include "drawing/contours/Nesting.h"
 #include "drawing/dxf/DxfUnits.h"
 #include "drawing/files/PartReader.h"
 #include "machining/ToolpathJob.h"

@@ -3,8 +3,6 @@
 
 #include <gtest/gtest.h>
 
-#include <algorithm>
-
 #include "region/offset/OffsetJob.h"
 #include "tests/support/PathShapes.h"
 

@@ -49,7 +49,7 @@ TEST(OffsetJob, SideByDepthAndSense) {
     EXPECT_EQ(signedDistances(open, 0, Side::kWaste, 0).size(), 1U);
 }
 
-TEST(KernelBridge, OffsetsKeepTheirDistance) {
+TEST(OffsetByKernel, OffsetsKeepTheirDistance) {
     Path slot{{{{0, 0}, {20, 0}},
                {{20, 0}, {20, 8}, 1.0},
                {{20, 8}, {12, 8}},
@@ -71,7 +71,7 @@ TEST(KernelBridge, OffsetsKeepTheirDistance) {
     EXPECT_GE(checked, 9U);
 }
 
-TEST(KernelBridge, TinyElementsDoNotTearTheResult) {
+TEST(OffsetByKernel, TinyElementsDoNotTearTheResult) {
     // A hook of 4e-4 against the direction of travel, as rounding in a drawing leaves it.
     const Path hooked = polygon({{0, 0}, {10, 0}, {10, 10}, {5, 11}, {5.0004, 11}, {0, 10}});
     const KernelOffset offset = offsetChecked(hooked, 1.0).offset;

@@ -1,5 +1,4 @@
 // SPDX-License-Identifier: MIT
-#include <functional>
 
 #include "Families.h"
 

@@ -10,6 +10,7 @@
 
 #include <algorithm>
 #include <cmath>
+#include <memory>
 
 #include "gmkernel/GmArc.h"
 #include "gmkernel/GmStretch.h"

@@ -11,6 +11,7 @@
 /// distance test must not be strict: it leaves the calculation tolerance. Cost: quadratic in the
 /// number of elements, with box tests only for pieces that are apart.
 #include <cmath>
+#include <memory>
 
 #include "gmkernel/GmContour.h"
 #include "kernel/contour/GmContourArray.h"

@@ -6,7 +6,6 @@
 /// the elements are cut back to its ends. Elements that have become too short are then removed from
 /// the whole contour, which shifts the indices behind them. Nothing is tested against other
 /// elements.
-#include <cmath>
 
 #include "gmkernel/GmArc.h"
 #include "gmkernel/GmStretch.h"

@@ -9,6 +9,7 @@
 #include "kernel/contour/variable_offset/ShiftedElements.h"
 
 #include <array>
+#include <memory>
 
 namespace gmkernel_detail {
 

@@ -7,6 +7,9 @@
 /// take it apart into loops, of which those with the sense of the source are kept. A loop is not
 /// tested for its distance from the source. Cost: elements times elements.
 #include "gmkernel/GmContour.h"
+
+#include <memory>
+
 #include "kernel/contour/GmContourArray.h"
 #include "kernel/contour/variable_offset/ShiftedElements.h"
 #include "kernel/contour/walk/CrossingWalk.h"
