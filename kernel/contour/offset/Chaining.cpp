@@ -6,91 +6,111 @@
 /// piece that starts at its end. Where several do, one that leads on is preferred to a dead end;
 /// the choice is never taken back, so that where results touch each other a piece may go to the
 /// wrong one. A chain starts at the smallest identifier, for results in the order of the source.
-/// Cost: the number of pieces left for each piece of the chain.
+///
+/// Pieces are found by two indexes made once, by identifier and by the cell of the start point;
+/// what has been taken is passed over. Where many pieces start at one point, each joint there looks
+/// at all of them.
 #include "kernel/contour/offset/Chaining.h"
 
 #include <algorithm>
+#include <numeric>
+#include <utility>
 
 namespace gmkernel_detail {
 
 namespace {
 
-/// How far apart the end of a chain and the start of the next piece may lie, in length tolerances.
-constexpr double kJointGap = 3.0;
+/// The end of a chain and the start of the next piece lie nearer than this, in length units.
+double jointGap() {
+    constexpr double kTolerances = 3.0;
+    return kTolerances * GmBase::m_scdPrec;
+}
+
 /// Pieces below this length are left out of the results, in length units.
 constexpr double kShortestPiece = 0.001;
 
-/// Tells the pieces that start at a point, most of the others by their boxes.
-class StartsAt {
-public:
-    explicit StartsAt(GmPoint const& p) : m_point(p), m_box(boxOf(p)) {}
+}  // namespace
 
-    bool operator()(Piece const& piece) const {
-        return m_box.overlaps(piece.reach) &&
-               piece.element.curve().SP().Dist(m_point) < kJointGap * GmBase::m_scdPrec;
+Chaining::Chaining(PieceList pieces)
+    : m_pieces(std::move(pieces)), m_taken(m_pieces.size(), false), m_starts(jointGap()) {
+    for (auto place = m_pieces.begin(); place != m_pieces.end(); ++place) {
+        m_starts.add(place->element.curve().SP(), m_places.size());
+        m_places.push_back(place);
+        m_ids.push_back(place->element.id());
     }
-
-private:
-    GmPoint m_point;
-    CurveBox m_box;
-};
-
-bool anyStartsAt(PieceList const& pieces, GmPoint const& p) {
-    return std::any_of(pieces.begin(), pieces.end(), StartsAt(p));
+    m_starts.order();
+    m_byId.resize(m_places.size());
+    std::iota(m_byId.begin(), m_byId.end(), std::size_t{0});
+    std::stable_sort(m_byId.begin(), m_byId.end(),
+                     [this](std::size_t a, std::size_t b) { return m_ids[a] < m_ids[b]; });
 }
 
-/// The piece with the smallest identifier, the first of equals, alone in a new chain.
-PieceList beginChain(PieceList& pieces) {
-    const auto first = std::min_element(
-        pieces.begin(), pieces.end(),
-        [](Piece const& a, Piece const& b) { return a.element.id() < b.element.id(); });
+PieceList Chaining::takeChain() {
     PieceList chain;
-    chain.splice(chain.end(), pieces, first);
+    begin(chain);
+    growBackward(chain);
+    growForward(chain);
+    chain.remove_if(
+        [](Piece const& piece) { return piece.element.curve().Length() < kShortestPiece; });
     return chain;
 }
 
-void growBackward(PieceList& chain, PieceList& pieces) {
+void Chaining::take(PieceList& chain, PieceList::iterator before, std::size_t number) {
+    chain.splice(before, m_pieces, m_places[number]);
+    m_taken[number] = true;
+}
+
+/// The piece with the smallest identifier, the first of equals, alone in a new chain.
+void Chaining::begin(PieceList& chain) {
+    while (m_taken[m_byId[m_first]])
+        ++m_first;
+    take(chain, chain.end(), m_byId[m_first]);
+}
+
+/// One walk through the pieces with the identifier of the first one.
+void Chaining::growBackward(PieceList& chain) {
     const int id = chain.front().element.id();
-    for (auto piece = pieces.begin(); piece != pieces.end();) {
-        const auto current = piece++;
-        if (current->element.id() != id) continue;
-        if (current->element.curve().EP() == chain.front().element.curve().SP()) {
-            chain.splice(chain.begin(), pieces, current);
+    for (std::size_t i = m_first; i < m_byId.size() && m_ids[m_byId[i]] == id; ++i) {
+        const std::size_t number = m_byId[i];
+        if (m_taken[number]) continue;
+        if (piece(number).element.curve().EP() == chain.front().element.curve().SP()) {
+            take(chain, chain.begin(), number);
         }
     }
 }
 
-/// The piece that goes on at a point: the only one that starts there, or of several the first that
-/// leads on to another piece, else the first. The end of the list when there is none.
-PieceList::iterator nextPiece(PieceList& pieces, GmPoint const& end) {
-    const StartsAt starts(end);
-    const auto first = std::find_if(pieces.begin(), pieces.end(), starts);
-    if (first == pieces.end()) return first;
-    if (std::find_if(std::next(first), pieces.end(), starts) == pieces.end()) return first;
-
-    const auto leadsOn = std::find_if(first, pieces.end(), [&](Piece const& piece) {
-        return starts(piece) && anyStartsAt(pieces, piece.element.curve().EP());
-    });
-    return leadsOn != pieces.end() ? leadsOn : first;
-}
-
-void growForward(PieceList& chain, PieceList& pieces) {
+/// Goes on by the only piece that starts at the end, or of several by the first that leads on to
+/// another piece, else by the first.
+void Chaining::growForward(PieceList& chain) {
     while (true) {
-        const auto next = nextPiece(pieces, chain.back().element.curve().EP());
-        if (next == pieces.end()) return;
-        chain.splice(chain.end(), pieces, next);
+        collectStartsAt(chain.back().element.curve().EP(), m_next);
+        if (m_next.empty()) return;
+        std::size_t next = m_next.front();
+        if (m_next.size() > 1) {
+            const auto found = std::find_if(m_next.begin(), m_next.end(),
+                                            [this](std::size_t number) { return leadsOn(number); });
+            if (found != m_next.end()) next = *found;
+        }
+        take(chain, chain.end(), next);
     }
 }
 
-}  // namespace
+bool Chaining::startsAt(std::size_t number, GmPoint const& p, CurveBox const& box) const {
+    return !m_taken[number] && box.overlaps(piece(number).reach) &&
+           piece(number).element.curve().SP().Dist(p) < jointGap();
+}
 
-PieceList takeChain(PieceList& pieces) {
-    PieceList chain = beginChain(pieces);
-    growBackward(chain, pieces);
-    growForward(chain, pieces);
-    chain.remove_if(
-        [](Piece const& piece) { return piece.element.curve().Length() < kShortestPiece; });
-    return chain;
+/// The pieces left that start at a point, in the order of the list.
+void Chaining::collectStartsAt(GmPoint const& p, Numbers& numbers) const {
+    m_starts.collectNear(p, numbers);
+    const CurveBox box = boxOf(p);
+    const auto isElsewhere = [&](std::size_t number) { return !startsAt(number, p, box); };
+    numbers.erase(std::remove_if(numbers.begin(), numbers.end(), isElsewhere), numbers.end());
+}
+
+bool Chaining::leadsOn(std::size_t number) {
+    collectStartsAt(piece(number).element.curve().EP(), m_further);
+    return !m_further.empty();
 }
 
 }  // namespace gmkernel_detail

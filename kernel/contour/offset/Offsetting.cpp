@@ -47,11 +47,11 @@ int GmContour::Offsetting(double d, int nSpan, bool bKeepOpen) {
     for (int i = 0; i < ElementCount(); ++i) {
         sweep.add(*GetContElement(i));
     }
-    PieceList pieces = sweep.finish();
+    Chaining chaining(sweep.finish());
 
     RemoveAllSubConts();
-    while (!pieces.empty()) {
-        const PieceList chain = takeChain(pieces);
+    while (!chaining.done()) {
+        const PieceList chain = chaining.takeChain();
         std::unique_ptr<GmContour> result = resultContour(chain);
         if (!hasOffset(chain) || (insideOnly && !result->IsClosed())) continue;
         m_pSubConts->Take(std::move(result));

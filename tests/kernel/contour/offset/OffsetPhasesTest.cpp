@@ -121,20 +121,40 @@ TEST(Insertion, BoxesCoverEveryPointThatAMembershipTestAccepts) {
 }
 
 TEST(Chaining, GoesOnOverGapsBelowThreeTolerancesAndLeavesShortPiecesOut) {
-    PieceList pieces =
-        ListOf({Segment(0, 0, 1, 0), Segment(1.00029, 0, 2, 0, 9), Segment(2.00031, 0, 3, 0, 9)});
-    EXPECT_EQ(Starts(takeChain(pieces)), (std::vector<double>{0, 1.00029}));
-    pieces = ListOf({Segment(0, 0, 0.0009, 0, 1), Segment(0.0009, 0, 0.002, 0, 2)});
-    EXPECT_EQ(Starts(takeChain(pieces)), (std::vector<double>{0.0009}));
+    Chaining gaps(
+        ListOf({Segment(0, 0, 1, 0), Segment(1.00029, 0, 2, 0, 9), Segment(2.00031, 0, 3, 0, 9)}));
+    EXPECT_EQ(Starts(gaps.takeChain()), (std::vector<double>{0, 1.00029}));
+    EXPECT_EQ(Starts(gaps.takeChain()), (std::vector<double>{2.00031}));
+    EXPECT_TRUE(gaps.done());
+    Chaining tiny(ListOf({Segment(0, 0, 0.0009, 0, 1), Segment(0.0009, 0, 0.002, 0, 2)}));
+    EXPECT_EQ(Starts(tiny.takeChain()), (std::vector<double>{0.0009}));
 }
 
 TEST(Chaining, PrefersCandidatesThatLeadOn) {
-    PieceList pieces =
+    Chaining leading(
         ListOf({Segment(0, 0, 1, 0, 1), Segment(1, 0, 1, 5, 2), Segment(1, 0, 2, 0, 3),
-                Segment(1, 0, 2, 1, 4), Segment(2, 0, 3, 0, 5), Segment(2, 1, 3, 1, 6)});
-    EXPECT_EQ(takeChain(pieces).back().element.id(), 5) << "the first that leads on";
-    pieces = ListOf({Segment(0, 0, 1, 0, 1), Segment(1, 0, 1, 5, 2), Segment(1, 0, 2, 0, 3)});
-    EXPECT_EQ(takeChain(pieces).back().element.id(), 2) << "the first where none leads on";
+                Segment(1, 0, 2, 1, 4), Segment(2, 0, 3, 0, 5), Segment(2, 1, 3, 1, 6)}));
+    EXPECT_EQ(leading.takeChain().back().element.id(), 5) << "the first that leads on";
+    Chaining dead(ListOf({Segment(0, 0, 1, 0, 1), Segment(1, 0, 1, 5, 2), Segment(1, 0, 2, 0, 3)}));
+    EXPECT_EQ(dead.takeChain().back().element.id(), 2) << "the first where none leads on";
+}
+
+TEST(Chaining, FindsEveryStartWithinReachOnEitherSideOfACell) {
+    std::mt19937 engine(11);
+    const auto unit = [&engine] { return double(engine() % 2001) / 1000.0 - 1.0; };
+    for (const double far : {0.0, 3e-4, -6e-4, 1234.5678, -1e6, 1e12}) {
+        for (int i = 0; i < 300; ++i) {
+            const GmPoint start(far + 2e-3 * unit(), far - 2e-3 * unit());
+            const GmPoint p(start.X() + 2.9e-4 * unit(), start.Y());
+            StartCells cells(3e-4);
+            cells.add(start, 5);
+            cells.add(GmPoint(far + 1, far), 4);
+            cells.order();
+            std::vector<std::size_t> found;
+            cells.collectNear(p, found);
+            ASSERT_EQ(found, (std::vector<std::size_t>{5})) << start.GetTraceString();
+        }
+    }
 }
 
 TEST(ResultContour, BridgesGapsAndTellsWhatIsMade) {
