@@ -2,6 +2,7 @@
 #pragma once
 
 #include <algorithm>
+#include <limits>
 
 #include "gmkernel/GmCurve.h"
 
@@ -25,6 +26,11 @@ struct CurveBox {
         right = std::max(right, other.right);
         bottom = std::min(bottom, other.bottom);
         top = std::max(top, other.top);
+    }
+    /// Holds nothing, and becomes any box that it includes.
+    static CurveBox empty() {
+        constexpr double kMost = std::numeric_limits<double>::max();
+        return {kMost, -kMost, kMost, -kMost};
     }
     CurveBox grown(double margin) const {
         return {left - margin, right + margin, bottom - margin, top + margin};

@@ -43,31 +43,22 @@ void BandSweep::add(GmContElement const& record) {
 /// Appends an element to the span, if it joins, and lets the oldest one leave.
 void BandSweep::advanceSpan(GmCurve const& element) {
     const bool appended = m_span.elements.AddElement(&element, false, 0);
-    if (appended) m_span.nearby.push_back(nearbyOf(element, m_d));
-    if (m_index >= m_spanSize && !m_span.nearby.empty()) {
+    if (appended) m_span.nearby.append(nearbyOf(element, m_d));
+    if (m_index >= m_spanSize && !m_span.isEmpty()) {
         m_span.elements.RemoveElement(0);
-        m_span.nearby.erase(m_span.nearby.begin());
+        ++m_span.oldest;
     }
-    m_span.grew = appended && !m_span.nearby.empty();
+    m_span.grew = appended && !m_span.isEmpty();
 }
 
 /// Moves the pieces of elements that are leaving the span to the finished ones.
 void BandSweep::retire() {
     const long long oldestKept = static_cast<long long>(m_index) - m_spanSize + 1;
-    if (oldestKept < 0) return;
-    for (PieceRun& run : m_active.runs()) {
-        for (auto piece = run.pieces.begin(); piece != run.pieces.end();) {
-            const auto current = piece++;
-            if (current->element.source() > oldestKept) continue;
-            m_finished.splice(m_finished.end(), run.pieces, current);
-        }
-    }
-    m_active.dropEmptyRuns();
+    if (oldestKept >= 0) m_active.retire(oldestKept, m_finished);
 }
 
 PieceList BandSweep::finish() {
-    for (PieceRun& run : m_active.runs())
-        m_finished.splice(m_finished.end(), run.pieces);
+    m_active.retireAll(m_finished);
     m_finished.remove_if([](Piece const& piece) { return !piece.element.kept(); });
     return std::move(m_finished);
 }

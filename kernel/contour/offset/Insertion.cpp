@@ -21,7 +21,9 @@ using Points = std::vector<GmPoint>;
 
 /// Splits a piece at points of its curve, taken in order along the curve. Points equal to an end
 /// split nothing. The parts before each point are inserted before the piece, which keeps the rest.
-void splitPiece(PieceRun& run, PieceList::iterator piece, Points& points) {
+void splitPiece(ActivePieces& active, std::size_t index, PieceList::iterator piece,
+                Points& points) {
+    PieceRun& run = active.run(index);
     GmCurve& curve = piece->element.curve();
     std::stable_sort(points.begin(), points.end(), less_than_curve(&curve));
 
@@ -30,24 +32,24 @@ void splitPiece(PieceRun& run, PieceList::iterator piece, Points& points) {
         if (p == curve.SP() || p == curve.EP()) continue;
         GmOffsetElement part(piece->element);
         part.curve().SetEP(p);
-        run.reach.include(run.pieces.insert(piece, Piece(std::move(part)))->reach);
+        active.changed(index, *run.pieces.insert(piece, Piece(std::move(part))));
         curve.SetSP(p);
         split = true;
     }
     if (!split) return;
     piece->measure();
-    run.reach.include(piece->reach);
-    run.settled = false;
+    active.changed(index, *piece);
 }
 
 /// Cuts the pieces of a run where they cross the added one, and collects the points.
-void cutRun(PieceRun& run, Piece const& added, Points& ofAdded) {
+void cutRun(ActivePieces& active, std::size_t index, Piece const& added, Points& ofAdded) {
+    PieceRun& run = active.run(index);
     Points ofOld;
     for (auto old = run.pieces.begin(); old != run.pieces.end(); ++old) {
         if (!added.reach.overlaps(old->reach)) continue;
         ::Intersection(added.element.curve(), old->element.curve(), ofOld);
         ofAdded.insert(ofAdded.end(), ofOld.begin(), ofOld.end());
-        splitPiece(run, old, ofOld);
+        splitPiece(active, index, old, ofOld);
     }
 }
 
@@ -56,14 +58,9 @@ void cutRun(PieceRun& run, Piece const& added, Points& ofAdded) {
 void insertPiece(ActivePieces& active, GmOffsetElement element) {
     Piece added(std::move(element));
     Points ofAdded;
-    for (PieceRun& run : active.runs()) {
-        if (added.reach.overlaps(run.reach)) cutRun(run, added, ofAdded);
-    }
-    PieceRun& last = active.lastRun();
-    last.reach.include(added.reach);
-    last.settled = false;
-    last.pieces.push_back(std::move(added));
-    splitPiece(last, std::prev(last.pieces.end()), ofAdded);
+    active.visitReached(added.reach, [&](std::size_t run) { cutRun(active, run, added, ofAdded); });
+    const std::size_t last = active.append(std::move(added));
+    splitPiece(active, last, std::prev(active.run(last).pieces.end()), ofAdded);
 }
 
 }  // namespace gmkernel_detail

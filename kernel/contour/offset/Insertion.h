@@ -6,8 +6,8 @@
 namespace gmkernel_detail {
 
 /// Appends a piece to the active list and cuts it and the pieces there at all their mutual
-/// crossings. Cost: one box test for each run of active pieces, one for each piece of a near run,
-/// one intersection for each near piece.
+/// crossings. Cost: the logarithm of the number of active pieces, one box test for each piece of a
+/// near run, one intersection for each near piece.
 void insertPiece(ActivePieces& active, GmOffsetElement element);
 
 }  // namespace gmkernel_detail

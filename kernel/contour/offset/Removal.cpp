@@ -10,6 +10,7 @@
 #include "kernel/contour/offset/Removal.h"
 
 #include <cmath>
+#include <vector>
 
 #include "kernel/curves/dispatch/Distance.h"
 
@@ -17,41 +18,42 @@ namespace gmkernel_detail {
 
 namespace {
 
-/// Is a point nearer to one of the last `count` elements of the span than `threshold`? The newest
-/// elements, which are the most likely ones, come first.
-bool isNear(GmPoint const& p, SourceSpan const& span, int count, double threshold) {
-    const CurveBox place = boxOf(p);
-    const int size = static_cast<int>(span.nearby.size());
-    for (int i = size - 1; i >= size - count; --i) {
-        if (!place.overlaps(span.nearby[static_cast<std::size_t>(i)])) continue;
-        if (Distance(p, *span.elements.GetElement(i)) < threshold) return true;
-    }
-    return false;
+/// Is a point nearer than `threshold` to an element of the span, from the one with the number
+/// `first` on? Which of them it is does not matter, so boxes may choose the order.
+bool isNear(GmPoint const& p, SourceSpan const& span, std::size_t first, double threshold) {
+    return span.nearby.visitUntil(boxOf(p), first, [&](std::size_t number) {
+        const int index = static_cast<int>(number - span.oldest);
+        return Distance(p, *span.elements.GetElement(index)) < threshold;
+    });
 }
 
-void removeFromRun(PieceRun& run, SourceSpan const& span, int newest, double threshold) {
-    const int all = static_cast<int>(span.nearby.size());
-    for (auto piece = run.pieces.begin(); piece != run.pieces.end();) {
-        const int count = piece->clearOfSpan ? newest : all;
-        if (isNear(piece->halving, span, count, threshold)) {
-            piece = run.pieces.erase(piece);
-        } else {
-            piece->clearOfSpan = true;
-            ++piece;
-        }
-    }
+void removeFromRun(ActivePieces& active, std::size_t index, SourceSpan const& span,
+                   double threshold) {
+    PieceRun& run = active.run(index);
+    const std::size_t before = run.pieces.size();
+    const std::size_t newest = span.nearby.size() - (span.grew ? 1 : 0);
+    run.pieces.remove_if([&](Piece& piece) {
+        const std::size_t first = piece.clearOfSpan ? newest : span.oldest;
+        if (isNear(piece.halving, span, first, threshold)) return true;
+        piece.clearOfSpan = true;
+        return false;
+    });
     run.settled = true;
+    if (run.pieces.size() < before) active.shrink(index);
 }
 
 }  // namespace
 
 void removeNearPieces(ActivePieces& active, SourceSpan const& span, double d) {
     const double threshold = std::fabs(std::fabs(d) - GmBase::m_scdPrecCalc);
-    const int newest = span.grew && !span.nearby.empty() ? 1 : 0;
-    for (PieceRun& run : active.runs()) {
-        const bool reached = newest > 0 && span.nearby.back().overlaps(run.reach);
-        if (!run.settled || reached) removeFromRun(run, span, newest, threshold);
+    const std::vector<std::size_t> unsettled = active.takeUnsettled();
+    if (span.grew && !span.isEmpty()) {
+        active.visitReached(span.newestNearby(), [&](std::size_t index) {
+            if (active.run(index).settled) removeFromRun(active, index, span, threshold);
+        });
     }
+    for (const std::size_t index : unsettled)
+        removeFromRun(active, index, span, threshold);
 }
 
 }  // namespace gmkernel_detail

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include <vector>
+#include <cstddef>
 
 #include "gmkernel/GmContour.h"
 #include "kernel/contour/offset/ActivePieces.h"
@@ -12,9 +12,13 @@ namespace gmkernel_detail {
 /// than the distance.
 struct SourceSpan {
     GmContour elements;
-    std::vector<CurveBox> nearby;
+    BoxLevels nearby;
+    std::size_t oldest = 0;  ///< the box of the first element; those before have left
     /// The last element is new since the last removal.
     bool grew = false;
+
+    bool isEmpty() const { return oldest == nearby.size(); }
+    CurveBox const& newestNearby() const { return nearby[nearby.size() - 1]; }
 };
 
 /// Removes every piece whose halving point lies nearer to an element of the span than |d| less the
