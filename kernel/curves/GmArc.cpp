@@ -117,9 +117,8 @@ bool GmArc::Element(GmPoint const& p) const {
 
 double GmArc::DistSP(GmPoint const& p) const {
     if (p == m_SP) return 0.0;
-    GmArc upTo(*this);
-    upTo.SetEP(p);
-    return upTo.Ang() * m_dR;
+    const GmAngle upTo = GmDir(m_M, p).Angle();
+    return std::fabs(GmDir(m_SAng).RAngle(GmDir(upTo), m_eDir)) * m_dR;
 }
 
 GmPoint GmArc::MinDist(GmPoint const& p, bool bPreferSP) const {

@@ -19,13 +19,30 @@ namespace {
 
 using Points = std::vector<GmPoint>;
 
+/// Brings points of a curve into their order along it.
+void sortAlong(GmCurve const& curve, Points& points) {
+    if (points.size() < 2) return;
+    struct Place {
+        double fromStart;
+        GmPoint point;
+    };
+    std::vector<Place> places;
+    places.reserve(points.size());
+    for (GmPoint const& p : points)
+        places.push_back({curve.DistSP(p), p});
+    std::stable_sort(places.begin(), places.end(),
+                     [](Place const& a, Place const& b) { return a.fromStart < b.fromStart; });
+    std::transform(places.begin(), places.end(), points.begin(),
+                   [](Place const& place) { return place.point; });
+}
+
 /// Splits a piece at points of its curve, taken in order along the curve. Points equal to an end
 /// split nothing. The parts before each point are inserted before the piece, which keeps the rest.
 void splitPiece(ActivePieces& active, std::size_t index, PieceList::iterator piece,
                 Points& points) {
     PieceRun& run = active.run(index);
     GmCurve& curve = piece->element.curve();
-    std::stable_sort(points.begin(), points.end(), less_than_curve(&curve));
+    sortAlong(curve, points);
 
     bool split = false;
     for (GmPoint const& p : points) {

@@ -9,17 +9,16 @@
 #include "kernel/curves/dispatch/Distance.h"
 
 #include <limits>
-#include <unordered_map>
 
 #include "kernel/curves/VerifiedCast.h"
 #include "kernel/curves/dispatch/DistanceFunctions.h"
-#include "kernel/curves/dispatch/PairKey.h"
+#include "kernel/curves/dispatch/PairTable.h"
 
 namespace {
 
 using namespace gmkernel_detail;
 using DistanceEntry = double (*)(GmBase const&, GmBase const&);
-using DistanceMap = std::unordered_map<int, DistanceEntry>;
+using DistanceMap = PairTable<DistanceEntry>;
 
 /// The nearest approach of two curves of any kind.
 double measureCurves(GmBase const& a, GmBase const& b) {
@@ -48,17 +47,17 @@ DistanceMap buildMap() {
     constexpr auto kPoint = GmBase::eGmPoint;
     constexpr auto kArc = GmBase::eGmArc;
     constexpr auto kStretch = GmBase::eGmStretch;
-    return {
-        {pairKey(kPoint, kPoint), measurePair<GmPoint, GmPoint>},
-        {pairKey(kPoint, kArc), measurePair<GmPoint, GmArc>},
-        {pairKey(kArc, kPoint), measureSwapped<GmPoint, GmArc>},
-        {pairKey(kPoint, kStretch), measurePair<GmPoint, GmStretch>},
-        {pairKey(kStretch, kPoint), measureSwapped<GmPoint, GmStretch>},
-        {pairKey(kArc, kArc), measurePair<GmArc, GmArc>},
-        {pairKey(kArc, kStretch), measurePair<GmArc, GmStretch>},
-        {pairKey(kStretch, kArc), measureSwapped<GmArc, GmStretch>},
-        {pairKey(kStretch, kStretch), measurePair<GmStretch, GmStretch>},
-    };
+    DistanceMap map;
+    map.enter(kPoint, kPoint, measurePair<GmPoint, GmPoint>);
+    map.enter(kPoint, kArc, measurePair<GmPoint, GmArc>);
+    map.enter(kArc, kPoint, measureSwapped<GmPoint, GmArc>);
+    map.enter(kPoint, kStretch, measurePair<GmPoint, GmStretch>);
+    map.enter(kStretch, kPoint, measureSwapped<GmPoint, GmStretch>);
+    map.enter(kArc, kArc, measurePair<GmArc, GmArc>);
+    map.enter(kArc, kStretch, measurePair<GmArc, GmStretch>);
+    map.enter(kStretch, kArc, measureSwapped<GmArc, GmStretch>);
+    map.enter(kStretch, kStretch, measurePair<GmStretch, GmStretch>);
+    return map;
 }
 
 /// Built on first use, so that calls from static initialisers elsewhere find it complete.
@@ -68,11 +67,11 @@ DistanceMap const& distanceMap() {
 }
 
 /// Fills the map when the library is loaded.
-[[maybe_unused]] const bool filledAtLoad = !distanceMap().empty();
+[[maybe_unused]] DistanceMap const& filledAtLoad = distanceMap();
 
 }  // namespace
 
 double Distance(GmBase const& a, GmBase const& b) {
-    const auto found = distanceMap().find(pairKey(a.GetType(), b.GetType()));
-    return found != distanceMap().end() ? found->second(a, b) : measureCurves(a, b);
+    const DistanceEntry measure = distanceMap().find(a.GetType(), b.GetType());
+    return measure != nullptr ? measure(a, b) : measureCurves(a, b);
 }

@@ -7,7 +7,6 @@
 /// swapped arguments, so that both give the same points in the same order. A pair without an entry
 /// is refused, and so is one in which an object is not of the class that its tag promises.
 #include <stdexcept>
-#include <unordered_map>
 #include <vector>
 
 #include "gmkernel/GmArc.h"
@@ -16,14 +15,14 @@
 #include "gmkernel/GmStretch.h"
 #include "kernel/curves/SupportHits.h"
 #include "kernel/curves/VerifiedCast.h"
-#include "kernel/curves/dispatch/PairKey.h"
+#include "kernel/curves/dispatch/PairTable.h"
 
 namespace {
 
 using namespace gmkernel_detail;
 using Points = std::vector<GmPoint>;
 using IntersectionEntry = void (*)(GmBase const&, GmBase const&, Points&);
-using IntersectionMap = std::unordered_map<int, IntersectionEntry>;
+using IntersectionMap = PairTable<IntersectionEntry>;
 
 /// Does a point that lies on the supporting line or circle also lie on the curve itself?
 bool holds(GmLine const&, GmPoint const&) {
@@ -79,15 +78,14 @@ void swapped(GmBase const& first, GmBase const& second, Points& result) {
 /// Enters a pair of different kinds in both orders.
 template <IntersectionEntry entry>
 void enterBoth(IntersectionMap& map, GmBase::eGmTypes a, GmBase::eGmTypes b) {
-    map.emplace(pairKey(a, b), entry);
-    map.emplace(pairKey(b, a), swapped<entry>);
+    map.enter(a, b, entry);
+    map.enter(b, a, swapped<entry>);
 }
 
 void enterStraightPairs(IntersectionMap& map) {
-    map.emplace(pairKey(GmBase::eGmLine, GmBase::eGmLine), intersectPair<GmLine, GmLine>);
-    map.emplace(pairKey(GmBase::eGmBeam, GmBase::eGmBeam), intersectPair<GmBeam, GmBeam>);
-    map.emplace(pairKey(GmBase::eGmStretch, GmBase::eGmStretch),
-                intersectPair<GmStretch, GmStretch>);
+    map.enter(GmBase::eGmLine, GmBase::eGmLine, intersectPair<GmLine, GmLine>);
+    map.enter(GmBase::eGmBeam, GmBase::eGmBeam, intersectPair<GmBeam, GmBeam>);
+    map.enter(GmBase::eGmStretch, GmBase::eGmStretch, intersectPair<GmStretch, GmStretch>);
     enterBoth<intersectPair<GmLine, GmBeam>>(map, GmBase::eGmLine, GmBase::eGmBeam);
     enterBoth<intersectPair<GmLine, GmStretch>>(map, GmBase::eGmLine, GmBase::eGmStretch);
     enterBoth<intersectPair<GmBeam, GmStretch>>(map, GmBase::eGmBeam, GmBase::eGmStretch);
@@ -103,13 +101,13 @@ void enterMixedPairs(IntersectionMap& map) {
 }
 
 void enterRoundPairs(IntersectionMap& map) {
-    map.emplace(pairKey(GmBase::eGmCircle, GmBase::eGmCircle), intersectPair<GmCircle, GmCircle>);
-    map.emplace(pairKey(GmBase::eGmArc, GmBase::eGmArc), intersectPair<GmArc, GmArc>);
+    map.enter(GmBase::eGmCircle, GmBase::eGmCircle, intersectPair<GmCircle, GmCircle>);
+    map.enter(GmBase::eGmArc, GmBase::eGmArc, intersectPair<GmArc, GmArc>);
     enterBoth<intersectPair<GmCircle, GmArc>>(map, GmBase::eGmCircle, GmBase::eGmArc);
 }
 
 void enterContourPairs(IntersectionMap& map) {
-    map.emplace(pairKey(GmBase::eGmContour, GmBase::eGmContour), intersectContour<GmContour>);
+    map.enter(GmBase::eGmContour, GmBase::eGmContour, intersectContour<GmContour>);
     enterBoth<intersectContour<GmLine>>(map, GmBase::eGmContour, GmBase::eGmLine);
     enterBoth<intersectContour<GmBeam>>(map, GmBase::eGmContour, GmBase::eGmBeam);
     enterBoth<intersectContour<GmStretch>>(map, GmBase::eGmContour, GmBase::eGmStretch);
@@ -133,13 +131,13 @@ IntersectionMap const& intersectionMap() {
 }
 
 /// Fills the map when the library is loaded.
-[[maybe_unused]] const bool filledAtLoad = !intersectionMap().empty();
+[[maybe_unused]] IntersectionMap const& filledAtLoad = intersectionMap();
 
 }  // namespace
 
 void Intersection(GmBase const& a, GmBase const& b, std::vector<GmPoint>& result) {
     result.clear();
-    const auto found = intersectionMap().find(pairKey(a.GetType(), b.GetType()));
-    if (found == intersectionMap().end()) refusePair();
-    found->second(a, b, result);
+    const IntersectionEntry intersect = intersectionMap().find(a.GetType(), b.GetType());
+    if (intersect == nullptr) refusePair();
+    intersect(a, b, result);
 }
