@@ -43,7 +43,10 @@ void BandSweep::add(GmContElement const& record) {
 /// Appends an element to the span, if it joins, and lets the oldest one leave.
 void BandSweep::advanceSpan(GmCurve const& element) {
     const bool appended = m_span.elements.AddElement(&element, false, 0);
-    if (appended) m_span.nearby.append(nearbyOf(element, m_d));
+    if (appended) {
+        m_span.nearby.append(nearbyOf(element, m_d));
+        m_span.quick.emplace_back(element);
+    }
     if (m_index >= m_spanSize && !m_span.isEmpty()) {
         m_span.elements.RemoveElement(0);
         ++m_span.oldest;

@@ -18,12 +18,18 @@ namespace gmkernel_detail {
 
 namespace {
 
-/// Is a point nearer than `threshold` to an element of the span, from the one with the number
-/// `first` on? Which of them it is does not matter, so boxes may choose the order.
-bool isNear(GmPoint const& p, SourceSpan const& span, std::size_t first, double threshold) {
-    return span.nearby.visitUntil(boxOf(p), first, [&](std::size_t number) {
+/// Is the halving point of a piece nearer than `threshold` to an element of the span, from the one
+/// with the number `first` on? Which of them it is does not matter, so boxes may choose the order.
+bool isNear(Piece& piece, SourceSpan const& span, std::size_t first, double threshold) {
+    const PlanePoint p = piece.quickHalving();
+    const double z = piece.height;
+    return span.nearby.visitUntil({p.x, p.x, p.y, p.y}, first, [&](std::size_t number) {
+        QuickDistance const& quick = span.quick[number];
+        if (quick.z() == z) {
+            if (const auto nearer = quick.isNearer(p, threshold)) return *nearer;
+        }
         const int index = static_cast<int>(number - span.oldest);
-        return Distance(p, *span.elements.GetElement(index)) < threshold;
+        return Distance(piece.halving(), *span.elements.GetElement(index)) < threshold;
     });
 }
 
@@ -34,7 +40,7 @@ void removeFromRun(ActivePieces& active, std::size_t index, SourceSpan const& sp
     const std::size_t newest = span.nearby.size() - (span.grew ? 1 : 0);
     run.pieces.remove_if([&](Piece& piece) {
         const std::size_t first = piece.clearOfSpan ? newest : span.oldest;
-        if (isNear(piece.halving, span, first, threshold)) return true;
+        if (isNear(piece, span, first, threshold)) return true;
         piece.clearOfSpan = true;
         return false;
     });

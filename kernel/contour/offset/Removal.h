@@ -2,6 +2,7 @@
 #pragma once
 
 #include <cstddef>
+#include <vector>
 
 #include "gmkernel/GmContour.h"
 #include "kernel/contour/offset/ActivePieces.h"
@@ -13,7 +14,8 @@ namespace gmkernel_detail {
 struct SourceSpan {
     GmContour elements;
     BoxLevels nearby;
-    std::size_t oldest = 0;  ///< the box of the first element; those before have left
+    std::vector<QuickDistance> quick;  ///< numbered like the boxes
+    std::size_t oldest = 0;            ///< the box of the first element; those before have left
     /// The last element is new since the last removal.
     bool grew = false;
 
