@@ -356,8 +356,8 @@ public:
     /// are carried as int, so that one outside -2147483648..2147483647 comes out as another number.
     /// The result of an open contour goes on with the half circle around its end. A distance below
     /// m_scdPrec in magnitude stores a copy, one that is not finite nothing. The elements of this
-    /// contour are not changed. Cost: for each element the runs of pieces in the span, and the
-    /// pieces near it.
+    /// contour are not changed. Cost: a logarithm for each element, and the pieces near it; the
+    /// square of the number of elements where all come near to each other.
     ///
     /// Known limits: results can be lost or stay open beside sides that are tilted from the
     /// vertical by about 1e-6 or less, beside a first element shorter than 0.001, where an arc

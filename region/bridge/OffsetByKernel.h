@@ -24,8 +24,8 @@ struct KernelOffset {
 /// the kernel does it. Distances below the kernel's tolerance give the path itself.
 ///
 /// Elements below the length `shortest` are passed over, and the offsets keep their distance
-/// within that length only. Cost: up to the square of the number of elements, and more where many
-/// offsets cross.
+/// within that length only. Cost: nearly linear in the number of elements, and up to its square
+/// where many lie within the distance of each other.
 KernelOffset offsetByKernel(const Path& path, double d, double shortest = kShortestForKernel);
 
 }  // namespace gmregion

@@ -8,8 +8,9 @@
 /// What keeps its distance on the chosen side is chained into the results.
 ///
 /// The bands of single elements are exact, but caps touch the offsets of their neighbours, so the
-/// distance test must not be strict: it leaves the calculation tolerance. Cost: quadratic in the
-/// number of elements, with box tests only for pieces that are apart.
+/// distance test must not be strict: it leaves the calculation tolerance. Cost: a
+/// logarithm for each element, and the pieces near it; quadratic where everything lies near
+/// everything.
 #include <cmath>
 #include <memory>
 

@@ -37,6 +37,11 @@ constexpr double kDirectionMargin = 2e-3;
 
 /// Shorter segments and radii are not looked at.
 constexpr double kShortest = 1e-2;
+
+/// The exact halving point takes the sweep from an arc cosine, which loses digits beside half and
+/// full circles; beyond this cosine of the sweep the quick point would be better than it.
+constexpr double kLargestCosine = 0.999;
+
 constexpr double kLargestRadius = 1e6;
 
 double dot(PlanePoint a, PlanePoint b) {
@@ -181,10 +186,11 @@ std::optional<PlanePoint> quickHalvingPoint(GmCurve const& curve) {
     // Ends of a sweep are symmetric to the direction of its middle, so their difference is square
     // to it, and the turn from the middle to the difference has the sense of the arc.
     const double sense = arc->Dir() == GmBase::eRotCW ? -1.0 : 1.0;
-    const PlanePoint across = directionAt(arc->SAng()) - directionAt(arc->EAng());
-    const double width = length(across);
-    if (!(width > kEndMargin)) return std::nullopt;
-    const double scale = sense * arc->R() / width;
+    const PlanePoint start = directionAt(arc->SAng());
+    const PlanePoint end = directionAt(arc->EAng());
+    if (!(std::fabs(dot(start, end)) < kLargestCosine)) return std::nullopt;
+    const PlanePoint across = start - end;
+    const double scale = sense * arc->R() / length(across);
     return PlanePoint{arc->M().X() - scale * across.y, arc->M().Y() + scale * across.x};
 }
 

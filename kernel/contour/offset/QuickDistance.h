@@ -54,8 +54,8 @@ private:
 /// The z coordinate of a stretch or an arc; not a number where it is not the same all along.
 double heightOf(GmCurve const& curve);
 
-/// The halving point of an arc, up to rounding; nothing for other curves, and for arcs whose ends
-/// are next to each other.
+/// The halving point of an arc, up to rounding; nothing for other curves, and for sweeps next to
+/// half and full circles.
 std::optional<PlanePoint> quickHalvingPoint(GmCurve const& curve);
 
 }  // namespace gmkernel_detail
