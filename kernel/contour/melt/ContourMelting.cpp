@@ -8,15 +8,17 @@
 /// started. As every crossing is used once, the walks together give every loop once.
 ///
 /// What overlaps instead of crossing gives no crossings: contours that touch along a side may yield
-/// one loop, parts or none. Cost: elements times elements box tests, then the number of crossings
-/// for each step of a walk.
+/// one loop, parts or none.
+///
+/// Elements that lie apart are passed over by boxes in levels, made for each call. Cost: elements
+/// times the logarithm of their number where few boxes overlap, then that of the walks.
 #include <memory>
-#include <vector>
 
 #include "gmkernel/GmContour.h"
 #include "kernel/contour/GmContourArray.h"
 #include "kernel/contour/walk/CrossingWalk.h"
 #include "kernel/contour/walk/LoopContour.h"
+#include "kernel/curves/BoxLevels.h"
 #include "kernel/curves/CurveBox.h"
 #include "kernel/curves/VerifiedCast.h"
 
@@ -35,26 +37,26 @@ bool isClosedChain(GmContour const& contour) {
     return true;
 }
 
-std::vector<CurveBox> reachesOf(GmContour const& contour) {
-    std::vector<CurveBox> reaches;
+BoxLevels reachesOf(GmContour const& contour) {
+    BoxLevels reaches;
     for (int i = 0; i < contour.ElementCount(); ++i)
-        reaches.push_back(reachOf(*contour.GetElement(i)));
+        reaches.append(reachOf(*contour.GetElement(i)));
     return reaches;
 }
 
 void addCrossingsBetween(Crossings& crossings, GmContour const& a, GmContour const& b) {
     const int countA = static_cast<int>(a.ElementCount());
-    const std::vector<CurveBox> reachesB = reachesOf(b);
+    const BoxLevels reachesB = reachesOf(b);
     for (int i = 0; i < countA; ++i) {
         GmCurve const& e = *a.GetElement(i);
-        const CurveBox reach = reachOf(e);
-        for (int j = 0; j < b.ElementCount(); ++j) {
-            if (!reach.overlaps(reachesB[static_cast<std::size_t>(j)])) continue;
+        reachesB.visitUntil(reachOf(e), 0, [&](std::size_t number) {
+            const int j = static_cast<int>(number);
             GmCurve const& f = *b.GetElement(j);
             e.Intersection(&f);
             for (GmPoint const& p : e.GetPtSol())
                 crossings.AddBothWays(e, i, f, countA + j, p);
-        }
+            return false;
+        });
     }
 }
 

@@ -14,6 +14,7 @@
 #include "kernel/contour/variable_offset/ShiftedElements.h"
 #include "kernel/contour/walk/CrossingWalk.h"
 #include "kernel/contour/walk/LoopContour.h"
+#include "kernel/curves/BoxLevels.h"
 #include "kernel/curves/CurveBox.h"
 
 namespace {
@@ -38,15 +39,14 @@ void addCrossings(Crossings& crossings, CurveList const& curves, int i, int k, b
 }
 
 void addCrossingsAmong(Crossings& crossings, CurveList const& curves, bool closed) {
-    std::vector<CurveBox> reaches;
+    BoxLevels reaches;
     for (int i = 0; i < curves.Count(); ++i)
-        reaches.push_back(reachOf(curves[i]));
-    for (int i = 0; i < curves.Count(); ++i) {
-        const CurveBox& reach = reaches[static_cast<std::size_t>(i)];
-        for (int k = i + 1; k < curves.Count(); ++k) {
-            if (!reach.overlaps(reaches[static_cast<std::size_t>(k)])) continue;
-            addCrossings(crossings, curves, i, k, closed);
-        }
+        reaches.append(reachOf(curves[i]));
+    for (std::size_t i = 0; i < reaches.size(); ++i) {
+        reaches.visitUntil(reaches[i], i + 1, [&](std::size_t k) {
+            addCrossings(crossings, curves, static_cast<int>(i), static_cast<int>(k), closed);
+            return false;
+        });
     }
 }
 

@@ -7,11 +7,14 @@
 /// the other curve. Each crossing is used once, so that different walks cannot share a piece; the
 /// walk ends where it began. Rounding can lose a crossing: then a walk may never come back, and is
 /// given up by the number of its steps. Which loop is wanted is for the caller to judge.
-/// Cost: the number of crossings for each step.
+///
+/// Crossings are linked by the curve that they leave, so a step looks at those of its own curve
+/// only, the used ones among them. Cost: for each step the number of crossings that leave its
+/// curve, which is quadratic in the crossings where one curve has most of them.
 #include "kernel/contour/walk/CrossingWalk.h"
 
 #include <cmath>
-#include <utility>
+#include <memory>
 
 #include "gmkernel/GmArc.h"
 #include "gmkernel/GmStretch.h"
@@ -44,6 +47,35 @@ private:
     GmArc const* m_arc;
 };
 
+/// The nearest of the crossings that are offered one after another, up to the end of the curve.
+class NearestAhead {
+public:
+    NearestAhead(GmCurve const& curve, GmPoint const& p)
+        : m_from(p),
+          m_ahead(curve, p),
+          m_nearest(m_ahead.isMeasurable() ? m_ahead(curve.EP()) : 0.0) {}
+
+    /// Is there any way from the point to the end of the curve?
+    bool hasWay() const { return m_nearest >= kAheadPrec; }
+    void offer(int number, GmContIntPoint const& crossing) {
+        if (crossing.bUsed || crossing.Point == m_from) return;
+        const double dist = m_ahead(crossing.Point);
+        if (dist <= -kAheadPrec) return;
+        if (dist < m_nearest || std::fabs(dist - m_nearest) < kAheadPrec) {
+            m_nearest = dist;
+            m_found = number;
+        }
+    }
+    /// The number of the nearest one, -1 when there is none.
+    int found() const { return m_found; }
+
+private:
+    GmPoint const& m_from;
+    Ahead m_ahead;
+    double m_nearest;
+    int m_found = -1;
+};
+
 }  // namespace
 
 void Crossings::AddBothWays(GmCurve const& a, int ia, GmCurve const& b, int ib, GmPoint const& p) {
@@ -52,28 +84,32 @@ void Crossings::AddBothWays(GmCurve const& a, int ia, GmCurve const& b, int ib, 
 }
 
 void Crossings::Add(int from, int to, GmPoint const& p) {
-    m_owned.push_back(std::make_unique<GmContIntPoint>(GmContIntPoint{from, to, p}));
-    m_array.SetAtGrow(m_array.GetSize(), m_owned.back().get());
+    const int number = Count();
+    m_entries.push_back({{from, to, p}});
+    const std::size_t curve = static_cast<std::size_t>(from);
+    if (curve >= m_rows.size()) m_rows.resize(curve + 1);
+    Row& row = m_rows[curve];
+    (row.first == kNone ? row.first : entry(row.last).next) = number;
+    row.last = number;
+}
+
+int nextCrossing(GmPoint const& p, GmCurve const& curve, int index, Crossings const& crossings) {
+    NearestAhead nearest(curve, p);
+    if (!nearest.hasWay()) return -1;
+    crossings.VisitFrom(index, [&](int number, GmContIntPoint const& crossing) {
+        nearest.offer(number, crossing);
+    });
+    return nearest.found();
 }
 
 int nextCrossing(GmPoint const& p, GmCurve const& curve, int index,
                  CrossingArray const& crossings) {
-    const Ahead ahead(curve, p);
-    if (!ahead.isMeasurable()) return -1;
-    double nearest = ahead(curve.EP());
-    if (nearest < kAheadPrec) return -1;
-    int found = -1;
+    NearestAhead nearest(curve, p);
+    if (!nearest.hasWay()) return -1;
     for (int i = 0; i < crossings.GetSize(); ++i) {
-        GmContIntPoint const& crossing = *crossings[i];
-        if (crossing.bUsed || crossing.nFrom != index || crossing.Point == p) continue;
-        const double dist = ahead(crossing.Point);
-        if (dist <= -kAheadPrec) continue;
-        if (dist < nearest || std::fabs(dist - nearest) < kAheadPrec) {
-            nearest = dist;
-            found = i;
-        }
+        if (crossings[i]->nFrom == index) nearest.offer(i, *crossings[i]);
     }
-    return found;
+    return nearest.found();
 }
 
 bool walkLoop(Crossings& crossings, int start, WalkTrack const& track) {
@@ -86,7 +122,7 @@ bool walkLoop(Crossings& crossings, int start, WalkTrack const& track) {
     do {
         const std::unique_ptr<GmCurve> piece(track.curveAt(index).Clone());
         if (found >= 0) piece->SetSP(at);
-        found = nextCrossing(piece->SP(), *piece, index, crossings.Array());
+        found = nextCrossing(piece->SP(), *piece, index, crossings);
         if (found < 0) {
             at = piece->EP();
             index = track.following(index);
