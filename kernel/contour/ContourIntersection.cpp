@@ -8,8 +8,10 @@
 /// over at the end: intersecting a contour with itself comes back to this list through the
 /// elements, and an exception must leave it empty.
 ///
-/// Of two contours only elements with overlapping boxes are intersected. Cost: linear in the
+/// Only elements with overlapping boxes are intersected. Against a curve that is one pass over the
+/// elements with boxes made on the way; of two contours, one is measured first. Cost: linear in the
 /// elements; for two contours elements times the logarithm of their number where few boxes overlap.
+#include <cmath>
 #include <cstddef>
 #include <limits>
 #include <vector>
@@ -74,10 +76,17 @@ bool intersectElement(GmCurve const& a, GmContour const& other, BoxLevels const&
 void GmContour::IntersectionWithCurve(GmCurve const* c) const {
     m_ptSol.clear();
     if (!c) return;
+    const CurveBox reach = roughReachOfElement(*c);
+    const bool bounded = std::isfinite(reach.left);
     std::vector<GmPoint> points;
     bool afterHit = m_bClosed;
     for (int i = 0; i < ElementCount(); ++i) {
         GmCurve const& element = *GetElement(i);
+        if (bounded && !reach.overlaps(roughReachOfElement(element))) {
+            forgetPoints(element);
+            afterHit = false;
+            continue;
+        }
         const int hits = element.Intersection(c);
         const bool skipStart = afterHit && !isFullCircle(element);
         for (GmPoint const& p : element.GetPtSol()) {

@@ -10,6 +10,7 @@
 /// it has to be. Boxes are not kept between calls. Constant cost for each element.
 #include "kernel/contour/ElementReach.h"
 
+#include <algorithm>
 #include <cmath>
 #include <limits>
 #include <typeinfo>
@@ -27,6 +28,9 @@ constexpr double kModerate = 1e8;
 
 /// By how much the end of a segment may miss the line through its start, in length units.
 constexpr double kSkew = 0.005;
+
+/// By how much the boxes here exceed an element, more than any membership tolerance (length units).
+constexpr double kMargin = 0.02;
 
 CurveBox boundless() {
     constexpr double kInfinity = std::numeric_limits<double>::infinity();
@@ -50,28 +54,54 @@ T const* exactly(GmCurve const& curve) {
     return same ? static_cast<T const*>(&curve) : nullptr;
 }
 
+CurveBox boxAbout(GmPoint const& p, GmPoint const& q) {
+    return {std::min(p.X(), q.X()), std::max(p.X(), q.X()), std::min(p.Y(), q.Y()),
+            std::max(p.Y(), q.Y())};
+}
+
 /// Does the line of a segment run from its start to its end?
-bool isStraight(GmStretch const& segment) {
-    const GmPoint sp = segment.SP();
-    const GmPoint ep = segment.EP();
-    GmDir const& d = segment.Dir();
+bool isStraight(GmPoint const& sp, GmPoint const& ep, GmDir const& d) {
     return sp.CreationOK() && ep.CreationOK() &&
            std::fabs((ep.X() - sp.X()) * d.Y() - (ep.Y() - sp.Y()) * d.X()) < kSkew;
 }
 
-/// May the box be believed?
-bool keepsToItsBox(GmCurve const& element) {
-    if (auto const* const segment = exactly<GmStretch>(element)) return isStraight(*segment);
-    auto const* const arc = exactly<GmArc>(element);
-    return arc != nullptr && isModerate(arc->R()) && arc->M().CreationOK();
+CurveBox segmentReach(GmStretch const& segment) {
+    const GmPoint sp = segment.SP();
+    const GmPoint ep = segment.EP();
+    return isStraight(sp, ep, segment.Dir()) ? boxAbout(sp, ep).grown(kMargin) : boundless();
+}
+
+/// The box about the ends and the whole circle: angles take time.
+CurveBox roughArcReach(GmArc const& arc) {
+    const GmPoint m = arc.M();
+    const double r = arc.R();
+    if (!m.CreationOK() || !isModerate(r)) return boundless();
+    CurveBox box = boxAbout(arc.SP(), arc.EP());
+    box.include({m.X() - r, m.X() + r, m.Y() - r, m.Y() + r});
+    return box.grown(kMargin);
+}
+
+CurveBox believed(CurveBox const& box) {
+    return isModerate(box) ? box : boundless();
 }
 
 }  // namespace
 
 CurveBox reachOfElement(GmCurve const& element) {
-    if (!keepsToItsBox(element)) return boundless();
-    const CurveBox box = reachOf(element);
-    return isModerate(box) ? box : boundless();
+    if (auto const* const segment = exactly<GmStretch>(element)) {
+        return believed(segmentReach(*segment));
+    }
+    auto const* const arc = exactly<GmArc>(element);
+    const bool bounded = arc != nullptr && arc->M().CreationOK() && isModerate(arc->R());
+    return bounded ? believed(reachOf(*arc)) : boundless();
+}
+
+CurveBox roughReachOfElement(GmCurve const& element) {
+    if (auto const* const segment = exactly<GmStretch>(element)) {
+        return believed(segmentReach(*segment));
+    }
+    auto const* const arc = exactly<GmArc>(element);
+    return arc != nullptr ? believed(roughArcReach(*arc)) : boundless();
 }
 
 BoxLevels reachOfElements(GmContour const& contour) {

@@ -12,6 +12,9 @@ namespace gmkernel_detail {
 /// have no point in common.
 CurveBox reachOfElement(GmCurve const& element);
 
+/// A box about that one, wider about arcs but quickly made: for a single look at an element.
+CurveBox roughReachOfElement(GmCurve const& element);
+
 /// The boxes of all elements of a contour.
 BoxLevels reachOfElements(GmContour const& contour);
 
