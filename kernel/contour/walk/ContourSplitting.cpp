@@ -6,7 +6,10 @@
 /// the copy follows it in the chain. The point is not projected, so an arc that is split within its
 /// tolerance of 0.01 gets an end off its circle. Splitting at quadrants goes through the four axis
 /// points in the order of travel, beginning with the first one ahead of the start, so that each one
-/// found lies on the rest that is still to be split.
+/// found lies on the rest that is still to be split. The rests are inserted all at once, as moving
+/// the chain for each of them would take time with the square of its length.
+#include <algorithm>
+#include <array>
 #include <memory>
 #include <vector>
 
@@ -17,22 +20,85 @@
 
 namespace {
 
-using Offsets = std::vector<GmVec>;
+using Elements = KxArray<GmContElement*, GmContElement*>;
+using Offsets = std::array<GmVec, 4>;
 
 /// The points of a circle on the axes through its centre, in the order of travel, beginning with
-/// the first one ahead of the direction `from`.
+/// the first one ahead of the start of the arc.
 Offsets quadrantOffsets(GmArc const& arc) {
     const double r = arc.R();
     const bool ccw = arc.Dir() == GmBase::eRotCCW;
     const double side = ccw ? 1.0 : -1.0;
-    const Offsets inTravel = {GmVec(r, 0.0, 0.0), GmVec(0.0, side * r, 0.0), GmVec(-r, 0.0, 0.0),
-                              GmVec(0.0, -side * r, 0.0)};
+    Offsets offsets = {GmVec(r, 0.0, 0.0), GmVec(0.0, side * r, 0.0), GmVec(-r, 0.0, 0.0),
+                       GmVec(0.0, -side * r, 0.0)};
     const int quadrant = GmDir(arc.M(), arc.SP()).Quadrant13();
     const int first = (ccw ? quadrant + 1 : 4 - quadrant) % 4;
-    Offsets offsets;
-    for (int i = 0; i < 4; ++i)
-        offsets.push_back(inTravel[static_cast<std::size_t>((first + i) % 4)]);
+    std::rotate(offsets.begin(), offsets.begin() + first, offsets.end());
     return offsets;
+}
+
+bool isInside(GmCurve const& element, GmPoint const& p) {
+    return !(p == element.SP()) && !(p == element.EP()) && element.Element(p);
+}
+
+/// The rest of an element that is to be split, not yet in the chain.
+struct Rest {
+    int index = 0;  ///< of the element
+    std::unique_ptr<GmCurve> curve;
+    std::unique_ptr<GmContElement> record;
+};
+
+/// The part of a curve from a point on, as the rest of an element.
+Rest restFrom(GmPoint const& p, GmArc const& arc, int index, GmContElement const& source) {
+    Rest rest;
+    rest.index = index;
+    rest.curve = std::make_unique<GmArc>(arc);
+    rest.curve->SetSP(p);
+    rest.record = std::make_unique<GmContElement>(
+        GmContElement{rest.curve.get(), source.lId, source.lIndex, true});
+    return rest;
+}
+
+/// Appends what splitting an element at its quadrants leaves behind each point. The element itself
+/// stays as it is.
+void splitOffQuadrants(GmContElement const& source, int index, std::vector<Rest>& rests) {
+    auto const* arc = gmkernel_detail::curveAs<GmArc>(*source.pCurve);
+    if (arc == nullptr) return;
+    const GmPoint centre = arc->M();
+    for (GmVec const& toCut : quadrantOffsets(*arc)) {
+        const GmPoint cut(centre + toCut);
+        if (!isInside(*arc, cut)) continue;
+        rests.push_back(restFrom(cut, *arc, index, source));
+        arc = gmkernel_detail::curveAs<GmArc>(*rests.back().curve);
+    }
+}
+
+/// Ends every curve that is split where its rest begins.
+void endAtRests(Elements const& elements, std::vector<Rest> const& rests) {
+    GmCurve* curve = nullptr;
+    int index = -1;
+    for (Rest const& rest : rests) {
+        if (rest.index != index) curve = elements[rest.index]->pCurve;
+        curve->SetEP(rest.curve->SP());
+        curve = rest.curve.get();
+        index = rest.index;
+    }
+}
+
+/// Hands the rests over to a chain, behind their elements: from the end on, so that every element
+/// moves once.
+void insertRests(Elements& elements, std::vector<Rest>& rests) {
+    int from = elements.GetSize() - 1;
+    int to = from + static_cast<int>(rests.size());
+    elements.SetSize(to + 1);
+    endAtRests(elements, rests);
+    for (auto rest = rests.rbegin(); rest != rests.rend(); ++rest) {
+        while (from > rest->index)
+            elements[to--] = elements[from--];
+        elements[to--] = rest->record.get();
+        gmkernel_detail::handedOver(rest->record);
+        gmkernel_detail::handedOver(rest->curve);
+    }
 }
 
 }  // namespace
@@ -94,21 +160,16 @@ bool GmContour::SplitArcs(GmDir const& dir, bool bBoth) {
 }
 
 bool GmContour::SplitArcsQuadrant() {
-    for (int i = 0; i < ElementCount(); ++i) {
-        auto const* const arc = gmkernel_detail::curveAs<GmArc>(*GetElement(i));
-        if (arc == nullptr) continue;
-        const GmPoint centre = arc->M();
-        for (GmVec const& toCut : quadrantOffsets(*arc)) {
-            if (SplitInside(i, GmPoint(centre + toCut))) ++i;
-        }
-    }
+    std::vector<Rest> rests;
+    for (int i = 0; i < ElementCount(); ++i)
+        splitOffQuadrants(*GetContElement(i), i, rests);
+    if (!rests.empty()) insertRests(*m_pElements, rests);
     return true;
 }
 
 bool GmContour::SplitInside(int index, GmPoint const& p) {
     GmCurve const& element = *GetElement(index);
-    if (p == element.SP() || p == element.EP() || !element.Element(p)) return false;
-    return SplitElement(index, p);
+    return isInside(element, p) && SplitElement(index, p);
 }
 
 bool GmContour::SplitElement(int index, GmPoint const& p) {
