@@ -3,6 +3,7 @@
 #include <rapidcheck.h>
 
 #include <cmath>
+#include <memory>
 #include <stdexcept>
 #include <vector>
 
@@ -20,6 +21,33 @@ std::vector<GmPoint> Hits(GmContour const& contour, GmPoint const& sp, GmPoint c
     const GmStretch probe(sp, ep);
     contour.IntersectionWithCurve(&probe);
     return contour.GetPtSol();
+}
+
+/// A ring of teeth: segments and arcs in turn, with their joints at two radii in turn.
+GmContour Ring(int count, double x, double y) {
+    std::vector<shapes::StarCorner> corners;
+    for (int i = 0; i < count; ++i)
+        corners.push_back({i % 2 ? 9.6 : 10.3, i % 3 ? 0.0 : 0.4});
+    return shapes::Moved(shapes::Star(corners), x, y);
+}
+
+bool IsEnd(GmPoint const& p, GmCurve const& curve) {
+    return p == curve.SP() || p == curve.EP();
+}
+
+/// The points of all pairs of elements, but those at ends.
+std::vector<GmPoint> PointsOfAllPairs(GmContour const& a, GmContour const& b) {
+    std::vector<GmPoint> points;
+    for (int i = 0; i < a.ElementCount(); ++i) {
+        const std::unique_ptr<GmCurve> element(a.GetElement(i)->Clone());
+        for (int j = 0; j < b.ElementCount(); ++j) {
+            element->Intersection(b.GetElement(j));
+            for (GmPoint const& p : element->GetPtSol()) {
+                if (!IsEnd(p, *element) && !IsEnd(p, *b.GetElement(j))) points.push_back(p);
+            }
+        }
+    }
+    return points;
 }
 
 }  // namespace
@@ -101,4 +129,52 @@ TEST(ContourIntersection, ACurveThatCannotBeIntersectedThrowsAndLeavesNoPoints) 
     Hits(square, GmPoint(5, -5), GmPoint(5, 15));
     square.IntersectionWithCurve(nullptr);
     EXPECT_TRUE(square.GetPtSol().empty());
+}
+
+TEST(ContourIntersection, OfLongContoursMissesNoPairOfElements) {
+    struct {
+        double x, y;
+        std::size_t least;
+    } const rows[] = {{0.21, 0.13, 100}, {7.3, 2.1, 2}, {19.7, 0.2, 1}, {1.0, 0.0, 20}};
+    for (auto const& row : rows) {
+        const GmContour a = Ring(600, 0, 0);
+        const GmContour b = Ring(421, row.x, row.y);
+        a.Intersection(&b, false);
+        EXPECT_EQ(a.GetPtSol(), PointsOfAllPairs(a, b)) << row.x;
+        EXPECT_GE(a.GetPtSol().size(), row.least) << row.x;
+        for (int i = 0; i < a.ElementCount(); ++i) {
+            const std::unique_ptr<GmCurve> element(a.GetElement(i)->Clone());
+            element->Intersection(b.GetElement(420));
+            EXPECT_EQ(a.GetElement(i)->GetPtSol(), element->GetPtSol()) << "that of the last pair";
+        }
+        std::vector<GmPoint> inTurn;
+        for (int j = 0; j < b.ElementCount(); ++j) {
+            GmCurve const& element = *b.GetElement(j);
+            element.Intersection(&a);
+            for (GmPoint const& p : element.GetPtSol()) {
+                if (!IsEnd(p, element)) inTurn.push_back(p);
+            }
+        }
+        EXPECT_EQ(inTurn.size(), PointsOfAllPairs(b, a).size()) << row.x;
+    }
+}
+
+TEST(ContourIntersection, BoxesHideNothingUnusual) {
+    GmContour ring = Ring(50, 0, 0);
+    const GmStretch farAway(GmPoint(90, 0), GmPoint(91, 7));
+    const GmContour farRing = Ring(50, 90, 0);
+    EXPECT_EQ(ring.Intersection(&farRing, true), 0);
+    // A segment that is given another line, and no longer runs from its start to its end.
+    auto* const skew = dynamic_cast<GmStretch*>(ring.GetElement(1));
+    ASSERT_NE(skew, nullptr);
+    skew->SetEP(GmPoint(120, 0));
+    static_cast<GmLine&>(*skew) = GmLine(GmPoint(0, 0), GmDir(1, 0.04));
+    EXPECT_EQ(Hits(ring, farAway.SP(), farAway.EP()).size(), 1u);
+    EXPECT_EQ(ring.Intersection(&farRing, true), 2);
+    // An element that cannot be intersected is refused wherever it lies.
+    static_cast<GmCurve&>(*ring.GetElement(30)) = GmRect(GmPoint(1, 1), GmPoint(2, 2));
+    EXPECT_THROW(ring.IntersectionWithCurve(&farAway), std::runtime_error);
+    EXPECT_THROW(ring.Intersection(&farRing, true), std::runtime_error);
+    EXPECT_THROW(farRing.Intersection(&ring, false), std::runtime_error);
+    EXPECT_TRUE(farRing.GetPtSol().empty());
 }

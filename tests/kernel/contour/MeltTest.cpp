@@ -3,6 +3,7 @@
 #include <rapidcheck.h>
 
 #include <cmath>
+#include <string>
 
 #include "gmkernel/GmArc.h"
 #include "gmkernel/GmContour.h"
@@ -47,6 +48,18 @@ GmContour ConvexAt(double x, double y, double r, int sides, double turn) {
     return contour;
 }
 
+/// A comb with teeth 4 wide and 10 high, 2 apart, upwards from a spine 3 high.
+GmContour Comb(int teeth) {
+    const std::string width = std::to_string(6 * teeth - 2);
+    std::string words = "0 -3  " + width + " -3";
+    for (int i = teeth - 1; i >= 0; --i) {
+        const std::string left = std::to_string(6 * i);
+        const std::string right = std::to_string(6 * i + 4);
+        words += "  " + right + " 0  " + right + " 10  " + left + " 10  " + left + " 0";
+    }
+    return Path(words + "  0 -3");
+}
+
 /// Does a crossing come so near to a joint that it may be taken for it?
 bool CrossNearJoints(GmContour const& a, GmContour const& b) {
     a.Intersection(&b, true);
@@ -88,6 +101,29 @@ TEST(Melting, OutlineAndCommonPartHaveTheAreasOfBothContours) {
         RC_ASSERT(count > positive);
         RC_ASSERT(a.MeltContours(&reversed, true) == positive);
     }));
+}
+
+TEST(Melting, ABarAcrossALongCombHasALoopForEveryToothAndEverySlot) {
+    constexpr int kTeeth = 150;
+    GmContour comb = Comb(kTeeth);
+    GmContour bar = Path("-5 4  1000 4  1000 6  -5 6  -5 4");
+    const double both = Area(comb) + Area(bar);
+    for (GmContour* const first : {&comb, &bar}) {
+        GmContour* const second = first == &comb ? &bar : &comb;
+        EXPECT_EQ(first->SplitContours(second), 2 * kTeeth);
+        int teeth = 0;
+        int slots = 0;  // 2 wide, between the bar and the spine 4 high
+        double sum = 0.0;
+        for (const double area : SubAreas(*first)) {
+            sum += area;
+            teeth += std::fabs(area - 8.0) < 1e-9 ? 1 : 0;
+            slots += std::fabs(area + 8.0) < 1e-9 ? 1 : 0;
+        }
+        EXPECT_EQ(teeth, kTeeth);
+        EXPECT_EQ(slots, kTeeth - 1);
+        EXPECT_NEAR(sum, both, 1e-6);
+        EXPECT_EQ(first->MeltContours(second, true), kTeeth + 1);
+    }
 }
 
 TEST(Melting, AnswersContoursThatDoNotMelt) {

@@ -3,6 +3,7 @@
 #include <rapidcheck.h>
 
 #include <cmath>
+#include <string>
 
 #include "gmkernel/GmArc.h"
 #include "gmkernel/GmContour.h"
@@ -144,6 +145,24 @@ TEST(VarParallels, TakeApartWhatCrosses) {
         EXPECT_TRUE(loop.IsClosed());
         EXPECT_GT(offset_laws::Area(loop), 1.0);
     }
+    // The same at many waists, so that most elements are far from each other.
+    constexpr int kWaists = 60;
+    std::string words = "0 0";
+    for (int i = 1; i <= 2 * kWaists; ++i)
+        words += "  " + std::to_string(9 * i) + (i % 2 ? " 4" : " 0");
+    for (int i = 2 * kWaists; i >= 0; --i)
+        words += "  " + std::to_string(9 * i) + (i % 2 ? " 6" : " 10");
+    GmContour beads = Path(words + "  0 0");
+    ASSERT_EQ(beads.VarParallelContours(GmVec(-1.25, -1.25, 0)), kWaists + 1);
+    double inner = 0.0;
+    for (int i = 0; GmContour const* const bead = beads.GetSubContour(i); ++i) {
+        EXPECT_TRUE(bead->IsClosed());
+        inner += offset_laws::Area(*bead);
+    }
+    const double ends =
+        offset_laws::Area(*waist.GetSubContour(0)) + offset_laws::Area(*waist.GetSubContour(1));
+    const double bead = (inner - ends) / (kWaists - 1);
+    EXPECT_NEAR(bead, offset_laws::Area(*beads.GetSubContour(kWaists / 2)), 1e-6);
     GmContour open = Path("0 0  10 0  10 10  4 10  4 -5");
     EXPECT_GE(open.VarParallelContours(GmVec(0.5, 0.5, 0)), 0);
     EXPECT_EQ(GmContour().VarParallelContours(GmVec(std::nan(""), 1, 0)), 1);
