@@ -10,6 +10,7 @@
 /// the chain for each of them would take time with the square of its length.
 #include <algorithm>
 #include <array>
+#include <cstddef>
 #include <memory>
 #include <vector>
 
@@ -73,31 +74,39 @@ void splitOffQuadrants(GmContElement const& source, int index, std::vector<Rest>
     }
 }
 
+/// The records of a chain, each with those of its rests behind it.
+std::vector<GmContElement*> withRests(Elements const& elements, std::vector<Rest> const& rests) {
+    std::vector<GmContElement*> records;
+    auto rest = rests.begin();
+    for (int i = 0; i < elements.GetSize(); ++i) {
+        records.push_back(elements[i]);
+        for (; rest != rests.end() && rest->index == i; ++rest)
+            records.push_back(rest->record.get());
+    }
+    return records;
+}
+
 /// Ends every curve that is split where its rest begins.
-void endAtRests(Elements const& elements, std::vector<Rest> const& rests) {
-    GmCurve* curve = nullptr;
-    int index = -1;
-    for (Rest const& rest : rests) {
-        if (rest.index != index) curve = elements[rest.index]->pCurve;
-        curve->SetEP(rest.curve->SP());
-        curve = rest.curve.get();
-        index = rest.index;
+void endAtRests(std::vector<Rest> const& rests, std::vector<GmContElement*> const& records) {
+    for (std::size_t i = 0; i < rests.size(); ++i) {
+        // Every rest before it has moved the place by one.
+        const std::size_t place = static_cast<std::size_t>(rests[i].index) + i;
+        records[place]->pCurve->SetEP(rests[i].curve->SP());
     }
 }
 
-/// Hands the rests over to a chain, behind their elements: from the end on, so that every element
-/// moves once.
+/// Hands the rests over to a chain, behind their elements.
 void insertRests(Elements& elements, std::vector<Rest>& rests) {
-    int from = elements.GetSize() - 1;
-    int to = from + static_cast<int>(rests.size());
-    elements.SetSize(to + 1);
-    endAtRests(elements, rests);
-    for (auto rest = rests.rbegin(); rest != rests.rend(); ++rest) {
-        while (from > rest->index)
-            elements[to--] = elements[from--];
-        elements[to--] = rest->record.get();
-        gmkernel_detail::handedOver(rest->record);
-        gmkernel_detail::handedOver(rest->curve);
+    const std::vector<GmContElement*> records = withRests(elements, rests);
+    // The only step that can fail: the chain is changed as a whole or not at all.
+    elements.SetSize(static_cast<int>(records.size()));
+    endAtRests(rests, records);
+    int place = 0;
+    for (GmContElement* const record : records)
+        elements.SetAtGrow(place++, record);
+    for (Rest& rest : rests) {
+        gmkernel_detail::handedOver(rest.record);
+        gmkernel_detail::handedOver(rest.curve);
     }
 }
 
