@@ -148,7 +148,8 @@ public:
 
     using GmCurve::Intersection;
     /// Intersects this contour with another one; the points replace this contour's solution list.
-    /// Cost: elements times elements. A null contour gives no points.
+    /// Cost: a logarithm for each element where few come near each other, up to elements times
+    /// elements. A null contour gives no points.
     /// @param other the other contour, may be this one
     /// @param bAtEnds false: only points that are no end of either element involved count;
     ///        true: points at ends count too, each joint once
@@ -330,8 +331,9 @@ public:
     /// stores them as sub-contours in place of earlier ones: a loop follows one boundary to the
     /// next crossing, changes over to the other one, and so on. For two overlapping contours of the
     /// same sense these are the outline of both and of their common part, running in that sense.
-    /// Neither contour changes; all identifiers are 0. Cost: elements times elements, then the
-    /// number of crossings for each step along the loops.
+    /// Neither contour changes; all identifiers are 0. Cost: a logarithm for each element where few
+    /// come near each other, up to elements times elements, then for each step along the loops the
+    /// crossings on its element.
     ///
     /// Known limits: where sides lie flush on each other there are no crossings; only the joints at
     /// their ends count. Contours that touch along a side may yield one loop, parts or none. A
@@ -385,7 +387,8 @@ public:
     /// directions along +y and -x count to the second, along +x and -y to the fourth. Neighbours
     /// that no longer meet are trimmed or bridged by segments, and the chain is taken apart at its
     /// crossings into loops; those with the sense of this contour are kept. A vector shorter than
-    /// m_scdPrec gives a copy. Cost: elements times elements.
+    /// m_scdPrec gives a copy. Cost: a logarithm for each element where few cross, up to elements
+    /// times elements.
     ///
     /// Known limits: nothing is tested for distance, so a loop may come near the contour or be a
     /// second loop beside the one that is wanted, and arcs keep their radius. Directions within
