@@ -2,11 +2,8 @@
 /// @file
 /// The arc: its sweep over a circle.
 ///
-/// Whether a point lies in the sweep is told by the cyclic order of the angles of start, point and
-/// end, and not by ranges, so that the seam of the angles at 180 degrees is no special case. The
-/// ends are accepted first and by their own tolerance, since the order of angles next to them is a
-/// matter of rounding. Ends, angles and radius are stored side by side; moving an end does not
-/// project it onto the circle.
+/// Which points lie in the sweep, and where along it, is told in plain numbers. Ends, angles and
+/// radius are stored side by side; moving an end does not project it onto the circle.
 #include "gmkernel/GmArc.h"
 
 #include <cmath>
@@ -16,17 +13,17 @@
 #include "gmkernel/GmMatrix.h"
 #include "gmkernel/GmStretch.h"
 #include "kernel/curves/Joining.h"
+#include "kernel/curves/PlainCurve.h"
 #include "kernel/curves/VerifiedCast.h"
 #include "kernel/curves/kernels/AngleOrder.h"
 #include "kernel/values/Constants.h"
 #include "kernel/values/TraceText.h"
 
 using gmkernel_detail::curveAs;
+using gmkernel_detail::plain;
+using gmkernel_detail::plainOf;
 
 namespace {
-
-/// The membership tolerance of arcs, in length units.
-constexpr double kArcElementPrec = 0.01;
 
 /// Does a transform turn the x-y plane over?
 bool mirrors(GmMatrix const& m) {
@@ -105,20 +102,16 @@ void GmArc::Invert() {
 }
 
 bool GmArc::Element(GmPoint const& p, double eps) const {
-    if (p == m_SP || p == m_EP) return true;
-    const bool full = m_SP == m_EP;
-    if (!full && Rotation(m_SAng, (p - m_M).Angle(), m_EAng) != m_eDir) return false;
-    return GmCircle::Element(p, eps);
+    return gmkernel_detail::isOn(plainOf(*this), plain(p), eps);
 }
 
 bool GmArc::Element(GmPoint const& p) const {
-    return Element(p, kArcElementPrec);
+    return Element(p, gmkernel_detail::kArcElementPrec);
 }
 
 double GmArc::DistSP(GmPoint const& p) const {
-    if (p == m_SP) return 0.0;
-    const GmAngle upTo = GmDir(m_M, p).Angle();
-    return std::fabs(GmDir(m_SAng).RAngle(GmDir(upTo), m_eDir)) * m_dR;
+    if (p == m_SP || !m_SAng.CreationOK()) return 0.0;
+    return gmkernel_detail::lengthUpTo(plainOf(*this), GmDir(m_M, p).Angle().Degree());
 }
 
 GmPoint GmArc::MinDist(GmPoint const& p, bool bPreferSP) const {
@@ -223,7 +216,8 @@ double GmArc::EAngDeg() const {
 }
 
 double GmArc::Ang() const {
-    return std::fabs(GmDir(m_SAng).RAngle(GmDir(m_EAng), m_eDir));
+    const bool hasAngles = m_SAng.CreationOK() && m_EAng.CreationOK();
+    return hasAngles ? gmkernel_detail::sweepOf(plainOf(*this)) : 0.0;
 }
 
 double GmArc::Ang2Pi() const {
@@ -231,15 +225,13 @@ double GmArc::Ang2Pi() const {
 }
 
 bool GmArc::IsFullCircle() const {
-    const double dx = m_EP.X() - m_SP.X();
-    const double dy = m_EP.Y() - m_SP.Y();
-    return std::sqrt(dx * dx + dy * dy) < m_scdPrecCalc;
+    return gmkernel_detail::isFullCircle(plainOf(*this));
 }
 
 GmPoint GmArc::SectionPoint(int i, int n) const {
     const double sweep = m_eDir == eRotCW ? -Ang() : Ang();
-    const GmVec radius = m_dR * GmVec(GmDir(m_SAng));
-    return GmPoint(m_M + radius.Rotated(GmAngle(sweep / n * i, true)));
+    if (!m_SAng.CreationOK()) return m_M;
+    return pointOf(gmkernel_detail::pointAfter(plainOf(*this), sweep / n * i));
 }
 
 GmPoint GmArc::HP() const {
@@ -258,5 +250,5 @@ bool GmArc::operator==(GmArc const& arc) const {
 }
 
 GmBase::eRotDir GmArc::Rotation(GmAngle const& a0, GmAngle const& a1, GmAngle const& a2) const {
-    return gmkernel_detail::angleOrder(a0, a1, a2);
+    return gmkernel_detail::angleOrder(a0.Degree(), a1.Degree(), a2.Degree());
 }

@@ -143,15 +143,11 @@ double GmCircle::Dist(GmCircle const& circle) const {
 }
 
 int GmCircle::IntersectionWithLine(GmLine const& line) const {
-    const auto hits = gmkernel_detail::supportHits(*this, line);
-    m_ptSol.assign(hits.begin(), hits.end());
-    return static_cast<int>(m_ptSol.size());
+    return gmkernel_detail::storeHits(gmkernel_detail::supportHits(*this, line), m_ptSol);
 }
 
 int GmCircle::IntersectionWithCircle(GmCircle const& circle) const {
-    const auto hits = gmkernel_detail::supportHits(*this, circle);
-    m_ptSol.assign(hits.begin(), hits.end());
-    return static_cast<int>(m_ptSol.size());
+    return gmkernel_detail::storeHits(gmkernel_detail::supportHits(*this, circle), m_ptSol);
 }
 
 bool GmCircle::operator==(GmCircle const& circle) const {

@@ -14,6 +14,8 @@
 #include "kernel/curves/SupportHits.h"
 #include "kernel/curves/kernels/SlopeForm.h"
 
+using gmkernel_detail::plain;
+
 GmLine::GmLine() {
     m_eType = eGmLine;
     GmLine::Undefine();
@@ -124,7 +126,7 @@ bool GmLine::Element(GmPoint const& p) const {
 }
 
 double GmLine::Dist(GmPoint const& p) const {
-    const gmkernel_detail::SlopeForm form = gmkernel_detail::slopeForm(m_SP, m_Dir);
+    const gmkernel_detail::SlopeForm form = gmkernel_detail::slopeForm(plain(m_SP), plain(m_Dir));
     if (form.parallelToY) return std::fabs(p.X() - m_SP.X());
     return std::fabs(p.Y() - form.k * p.X() - form.d) / std::sqrt(form.k * form.k + 1.0);
 }
@@ -170,11 +172,11 @@ GmDir const& GmLine::Dir() const {
 }
 
 double GmLine::k() const {
-    return gmkernel_detail::slopeForm(m_SP, m_Dir).k;
+    return gmkernel_detail::slopeForm(plain(m_SP), plain(m_Dir)).k;
 }
 
 double GmLine::d() const {
-    return gmkernel_detail::slopeForm(m_SP, m_Dir).d;
+    return gmkernel_detail::slopeForm(plain(m_SP), plain(m_Dir)).d;
 }
 
 GmDir GmLine::Normal() const {
@@ -192,9 +194,7 @@ int GmLine::PointPos(GmPoint const& p) const {
 }
 
 int GmLine::IntersectionWithLine(GmLine const& line) const {
-    const auto hits = gmkernel_detail::supportHits(*this, line);
-    m_ptSol.assign(hits.begin(), hits.end());
-    return static_cast<int>(m_ptSol.size());
+    return gmkernel_detail::storeHits(gmkernel_detail::supportHits(*this, line), m_ptSol);
 }
 
 GmLine GmLine::Inverted() const {

@@ -14,8 +14,8 @@
 #include "gmkernel/GmArc.h"
 #include "gmkernel/GmRect.h"
 #include "kernel/curves/Joining.h"
+#include "kernel/curves/PlainCurve.h"
 #include "kernel/curves/VerifiedCast.h"
-#include "kernel/curves/kernels/OnSegment.h"
 #include "kernel/values/TraceText.h"
 
 using gmkernel_detail::curveAs;
@@ -109,12 +109,11 @@ void GmStretch::Invert() {
 }
 
 bool GmStretch::Element(GmPoint const& p, double eps) const {
-    const GmPoint foot = GmLine::MinDist(p, false);
-    return gmkernel_detail::onSegment(foot, m_SP, m_EP, m_Dir) && foot.Dist(p) < eps;
+    return gmkernel_detail::isOn(gmkernel_detail::plainOf(*this), gmkernel_detail::plain(p), eps);
 }
 
 double GmStretch::Dist(GmPoint const& p) const {
-    return p.Dist(MinDist(p, false));
+    return gmkernel_detail::distanceTo(gmkernel_detail::plainOf(*this), gmkernel_detail::plain(p));
 }
 
 GmPoint GmStretch::MinDist(GmPoint const& p, bool bPreferSP) const {

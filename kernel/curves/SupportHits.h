@@ -1,6 +1,9 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include <cstddef>
+#include <vector>
+
 #include "gmkernel/GmCircle.h"
 #include "gmkernel/GmLine.h"
 #include "kernel/curves/kernels/Hits.h"
@@ -12,5 +15,14 @@ namespace gmkernel_detail {
 Hits<1> supportHits(GmLine const& a, GmLine const& b);
 Hits<2> supportHits(GmCircle const& a, GmLine const& b);
 Hits<2> supportHits(GmCircle const& a, GmCircle const& b);
+
+/// Writes points into a solution list; answers their number.
+template <std::size_t N>
+int storeHits(Hits<N> const& hits, std::vector<GmPoint>& solutions) {
+    solutions.clear();
+    for (Vec3 const& hit : hits)
+        solutions.push_back(pointOf(hit));
+    return static_cast<int>(solutions.size());
+}
 
 }  // namespace gmkernel_detail

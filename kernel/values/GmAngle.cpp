@@ -11,7 +11,7 @@
 
 #include "gmkernel/GmDir.h"
 #include "gmkernel/GmRect.h"
-#include "kernel/values/Constants.h"
+#include "kernel/values/Angles.h"
 
 GmAngle::GmAngle() : m_dAngle(0.0) {
     m_eType = eGmAngle;
@@ -108,22 +108,15 @@ GmBase::eQuadrant GmAngle::Quadrant() const {
 }
 
 double GmAngle::ToRadiant(double degrees) const {
-    return degrees * gmkernel_detail::kPi / 180.0;
+    return gmkernel_detail::radiansOf(degrees);
 }
 
 double GmAngle::ToDegree(double radians) const {
-    return radians / gmkernel_detail::kPi * 180.0;
+    return gmkernel_detail::degreesOf(radians);
 }
 
 void GmAngle::Standardize() {
-    // Stepping by 360 would take for ever on huge values and not end on infinite ones.
-    constexpr double fullTurn = 360.0;
-    constexpr double fewTurns = 10 * fullTurn;
-    if (std::fabs(m_dAngle) > fewTurns) m_dAngle = std::fmod(m_dAngle, fullTurn);
-    while (m_dAngle > 180.0)
-        m_dAngle -= fullTurn;
-    while (m_dAngle <= -180.0)
-        m_dAngle += fullTurn;
+    m_dAngle = gmkernel_detail::standardizedDegrees(m_dAngle);
 }
 
 double GmAngle::Degree() const {

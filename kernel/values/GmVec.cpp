@@ -1,11 +1,6 @@
 // SPDX-License-Identifier: MIT
 /// @file
 /// Vectors, their angles and quadrants.
-///
-/// The angle between vectors is the arc cosine of their scalar product with the sign of the cross
-/// product, which loses digits next to 0 and 180 degrees. The polar angle instead snaps to the
-/// axes: a component below the length tolerance counts as zero, so that vectors meant to be
-/// axis-parallel are. As this is a length, short vectors snap from far off the axes.
 #include "gmkernel/GmVec.h"
 
 #include <cmath>
@@ -15,27 +10,15 @@
 #include "gmkernel/GmMatrix.h"
 #include "gmkernel/GmPoint.h"
 #include "gmkernel/GmRect.h"
-#include "kernel/values/Constants.h"
+#include "kernel/values/Angles.h"
 #include "kernel/values/TraceText.h"
+
+using gmkernel_detail::plain;
 
 namespace {
 
 bool nearZero(double component) {
     return std::fabs(component) < GmBase::m_scdPrec;
-}
-
-/// Polar angle of (x, y) in the unit in which half a turn is `halfTurn` and an arc tangent in
-/// radians becomes `atan * factor / divisor`. Components below the tolerance snap to the axes.
-double polarAngle(double x, double y, double halfTurn, double factor, double divisor) {
-    if (nearZero(x)) {
-        if (y < 0) return -halfTurn / 2;
-        return nearZero(y) ? 0.0 : halfTurn / 2;
-    }
-    if (nearZero(y)) return x > 0 ? 0.0 : halfTurn;
-
-    const double principal = std::atan(y / x) * factor / divisor;
-    if (x > 0) return principal;
-    return y < 0 ? principal - halfTurn : principal + halfTurn;
 }
 
 }  // namespace
@@ -117,18 +100,7 @@ double GmVec::Norm() const {
 }
 
 GmAngle GmVec::Angle(GmVec const& w) const {
-    const double a = Length();
-    const double b = w.Length();
-    if (a == 0.0 || b == 0.0) return GmAngle(0.0, true);
-
-    const double cosine = *this * w / a / b;
-    const double sine = (m_dX * w.m_dY - m_dY * w.m_dX) / a / b;
-    if (std::fabs(cosine) - 1.0 < 0.0) {
-        const double angle = std::acos(cosine);
-        return GmAngle(sine < 0.0 ? -angle : angle, true);
-    }
-    // Parallel or opposite; rounding may have taken the cosine beyond the domain of acos.
-    return GmAngle(cosine > 0.0 ? 0.0 : gmkernel_detail::kPi, true);
+    return GmAngle(gmkernel_detail::degreesBetween(plain(*this), plain(w)), false);
 }
 
 GmAngle GmVec::Angle() const {
@@ -136,9 +108,7 @@ GmAngle GmVec::Angle() const {
 }
 
 double GmVec::DAngle(GmVec const& w, GmBase::eRotDir rot) const {
-    const double d = DAngle(w);
-    if (rot == eRotCW) return d > 0.0 ? d - 360.0 : d;
-    return d < 0.0 ? d + 360.0 : d;
+    return gmkernel_detail::degreesBetween(plain(*this), plain(w), rot);
 }
 
 double GmVec::DAngle(GmVec const& w) const {
@@ -146,11 +116,11 @@ double GmVec::DAngle(GmVec const& w) const {
 }
 
 double GmVec::DAngle() const {
-    return polarAngle(m_dX, m_dY, 180.0, 180.0, gmkernel_detail::kPi);
+    return gmkernel_detail::polarDegreesOfTangent(plain(*this));
 }
 
 double GmVec::RAngle(GmVec const& w, GmBase::eRotDir rot) const {
-    return DAngle(w, rot) * gmkernel_detail::kPi / 180.0;
+    return gmkernel_detail::radiansOf(DAngle(w, rot));
 }
 
 double GmVec::RAngle(GmVec const& w) const {
@@ -158,7 +128,7 @@ double GmVec::RAngle(GmVec const& w) const {
 }
 
 double GmVec::RAngle() const {
-    return polarAngle(m_dX, m_dY, gmkernel_detail::kPi, 1.0, 1.0);
+    return gmkernel_detail::polarRadians(plain(*this));
 }
 
 void GmVec::Rotate(GmAngle const& a) {
@@ -361,5 +331,5 @@ double GmVec::Z() const {
 }
 
 double GmVec::operator*(GmVec const& w) const {
-    return (m_dY * w.m_dY + m_dX * w.m_dX) + m_dZ * w.m_dZ;
+    return dot(plain(*this), plain(w));
 }

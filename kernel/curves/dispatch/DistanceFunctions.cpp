@@ -14,7 +14,7 @@
 #include <limits>
 #include <vector>
 
-#include "kernel/curves/kernels/OnSegment.h"
+#include "kernel/curves/PlainCurve.h"
 
 namespace gmkernel_detail {
 
@@ -37,7 +37,7 @@ double squaredToEnds(GmPoint const& p, GmCurve const& curve) {
 
 double squared(GmPoint const& p, GmStretch const& stretch) {
     const GmPoint foot = stretch.GmLine::MinDist(p, false);
-    const bool inside = onSegment(foot, stretch.SP(), stretch.EP(), stretch.Dir());
+    const bool inside = isBetweenEnds(plainOf(stretch), plain(foot));
     return inside ? p.Dist2(foot) : squaredToEnds(p, stretch);
 }
 

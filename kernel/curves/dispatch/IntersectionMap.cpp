@@ -57,7 +57,8 @@ template <class A, class B>
 void intersectPair(GmBase const& first, GmBase const& second, Points& result) {
     auto const& a = promised<A>(first);
     auto const& b = promised<B>(second);
-    for (GmPoint const& p : supportHits(a, b)) {
+    for (Vec3 const& hit : supportHits(a, b)) {
+        const GmPoint p = pointOf(hit);
         if (holds(a, p) && holds(b, p)) result.push_back(p);
     }
 }

@@ -10,7 +10,7 @@
 
 namespace gmkernel_detail {
 
-GmBase::eRotDir angleOrder(GmAngle const& a0, GmAngle const& a1, GmAngle const& a2) {
+GmBase::eRotDir angleOrder(double a0, double a1, double a2) {
     if (a0 < a1 && a1 < a2) return GmBase::eRotCCW;
     if (a2 < a0 && (a0 < a1 || a1 < a2)) return GmBase::eRotCCW;
     if (a2 < a1 && a1 < a0) return GmBase::eRotCW;

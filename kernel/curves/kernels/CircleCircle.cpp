@@ -24,24 +24,24 @@ bool apartOrNested(double dist, double r0, double r1) {
 
 }  // namespace
 
-Hits<2> intersectCircleCircle(GmPoint const& m0, double r0, GmPoint const& m1, double r1) {
+Hits<2> intersectCircleCircle(Vec3 const& m0, double r0, Vec3 const& m1, double r1) {
     Hits<2> hits;
-    const double dx = m1.X() - m0.X();
-    const double dy = m1.Y() - m0.Y();
+    const double dx = m1.x - m0.x;
+    const double dy = m1.y - m0.y;
     const double dist = std::sqrt(dx * dx + dy * dy);
     if (apartOrNested(dist, r0, r1)) return hits;
 
     const double a = (r0 * r0 - r1 * r1 + dist * dist) / (2.0 * dist);
-    const double footX = m0.X() + a * dx / dist;
-    const double footY = m0.Y() + a * dy / dist;
+    const double footX = m0.x + a * dx / dist;
+    const double footY = m0.y + a * dy / dist;
     const double h2 = r0 * r0 - a * a;
     const double h = h2 >= 0.0 ? std::sqrt(h2) : 0.0;
     if (h < GmBase::m_scdPrec) {
-        hits.add(GmPoint(footX, footY, m0.Z()));
+        hits.add({footX, footY, m0.z});
         return hits;
     }
-    hits.add(GmPoint(footX + h * dy / dist, footY - h * dx / dist, m0.Z()));
-    hits.add(GmPoint(footX - h * dy / dist, footY + h * dx / dist, m0.Z()));
+    hits.add({footX + h * dy / dist, footY - h * dx / dist, m0.z});
+    hits.add({footX - h * dy / dist, footY + h * dx / dist, m0.z});
     return hits;
 }
 

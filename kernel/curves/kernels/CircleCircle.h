@@ -1,7 +1,6 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include "gmkernel/GmPoint.h"
 #include "kernel/curves/kernels/Hits.h"
 
 namespace gmkernel_detail {
@@ -12,6 +11,6 @@ namespace gmkernel_detail {
 ///
 /// The foot of the common chord lies at a = (r0^2 - r1^2 + D^2) / (2 D) from `m0` on the line of
 /// centres, the crossings at h = sqrt(r0^2 - a^2) to both sides of it.
-Hits<2> intersectCircleCircle(GmPoint const& m0, double r0, GmPoint const& m1, double r1);
+Hits<2> intersectCircleCircle(Vec3 const& m0, double r0, Vec3 const& m1, double r1);
 
 }  // namespace gmkernel_detail

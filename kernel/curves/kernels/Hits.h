@@ -4,7 +4,7 @@
 #include <array>
 #include <cstddef>
 
-#include "gmkernel/GmPoint.h"
+#include "kernel/values/Vec3.h"
 
 namespace gmkernel_detail {
 
@@ -12,12 +12,12 @@ namespace gmkernel_detail {
 template <std::size_t N>
 class Hits {
 public:
-    void add(GmPoint const& p) { m_points[m_count++] = p; }
-    GmPoint const* begin() const { return m_points.data(); }
-    GmPoint const* end() const { return m_points.data() + m_count; }
+    void add(Vec3 const& p) { m_points[m_count++] = p; }
+    Vec3 const* begin() const { return m_points.data(); }
+    Vec3 const* end() const { return m_points.data() + m_count; }
 
 private:
-    std::array<GmPoint, N> m_points;
+    std::array<Vec3, N> m_points;
     std::size_t m_count = 0;
 };
 

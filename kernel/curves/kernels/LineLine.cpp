@@ -12,20 +12,19 @@
 
 namespace gmkernel_detail {
 
-Hits<1> intersectLineLine(GmPoint const& spA, GmDir const& dirA, GmPoint const& spB,
-                          GmDir const& dirB) {
+Hits<1> intersectLineLine(Vec3 const& spA, Vec3 const& dirA, Vec3 const& spB, Vec3 const& dirB) {
     Hits<1> hits;
-    if (GmParallelDir(dirA, dirB)) return hits;
+    if (isParallel(dirA, dirB)) return hits;
 
     const SlopeForm a = slopeForm(spA, dirA);
     const SlopeForm b = slopeForm(spB, dirB);
     if (a.parallelToY) {
-        hits.add(GmPoint(spA.X(), b.k * spA.X() + b.d, spA.Z()));
+        hits.add({spA.x, b.k * spA.x + b.d, spA.z});
     } else if (b.parallelToY) {
-        hits.add(GmPoint(spB.X(), a.k * spB.X() + a.d, spB.Z()));
+        hits.add({spB.x, a.k * spB.x + a.d, spB.z});
     } else {
         const double x = (b.d - a.d) / (a.k - b.k);
-        hits.add(GmPoint(x, a.k * x + a.d, spA.Z()));
+        hits.add({x, a.k * x + a.d, spA.z});
     }
     return hits;
 }

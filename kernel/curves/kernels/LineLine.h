@@ -1,8 +1,6 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include "gmkernel/GmDir.h"
-#include "gmkernel/GmPoint.h"
 #include "kernel/curves/kernels/Hits.h"
 
 namespace gmkernel_detail {
@@ -10,7 +8,6 @@ namespace gmkernel_detail {
 /// The crossing of two lines, each given by a point and a direction; none for parallel directions,
 /// coincident lines included. Planar: z comes from the point of `a`, or of `b` where only `b` is
 /// parallel to the y axis.
-Hits<1> intersectLineLine(GmPoint const& spA, GmDir const& dirA, GmPoint const& spB,
-                          GmDir const& dirB);
+Hits<1> intersectLineLine(Vec3 const& spA, Vec3 const& dirA, Vec3 const& spB, Vec3 const& dirB);
 
 }  // namespace gmkernel_detail

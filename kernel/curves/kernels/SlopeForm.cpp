@@ -9,14 +9,29 @@
 
 namespace gmkernel_detail {
 
-bool parallelToYAxis(GmDir const& dir) {
-    return GmParallelDir(dir, GmDir(0.0, 1.0, 0.0));
+namespace {
+
+/// Of the components of unit directions.
+double directionTolerance() {
+    return GmBase::m_scdPrec / 100.0;
 }
 
-SlopeForm slopeForm(GmPoint const& sp, GmDir const& dir) {
-    if (parallelToYAxis(dir)) return {true, 0.0, sp.X()};
-    const double k = dir.k();
-    return {false, k, sp.Y() - k * sp.X()};
+}  // namespace
+
+bool isParallel(Vec3 const& a, Vec3 const& b) {
+    return isEqual(a, b, directionTolerance()) ||
+           isEqual(a, standardized(-b), directionTolerance());
+}
+
+bool parallelToYAxis(Vec3 const& dir) {
+    return isEqual(dir, {0.0, 1.0, 0.0}, directionTolerance()) ||
+           isEqual(dir, {0.0, -1.0, 0.0}, directionTolerance());
+}
+
+SlopeForm slopeForm(Vec3 const& sp, Vec3 const& dir) {
+    if (parallelToYAxis(dir)) return {true, 0.0, sp.x};
+    const double k = dir.x == 0.0 ? 0.0 : dir.y / dir.x;
+    return {false, k, sp.y - k * sp.x};
 }
 
 }  // namespace gmkernel_detail

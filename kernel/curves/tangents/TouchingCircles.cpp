@@ -56,7 +56,8 @@ GmCircle::GmCircle(GmLine const& l1, GmLine const& l2, double r) : GmCircle() {
     const GmVec bisector(l1.Dir().Sym(l2.Dir()));
     const double angle = l1.Dir().RAngle(l2.Dir());
     const double dist = std::fabs(r / std::sin(angle / 2.0));
-    Define(GmPoint(*crossing.begin() + dist * bisector), upAxis(), std::fabs(r));
+    const GmPoint corner = gmkernel_detail::pointOf(*crossing.begin());
+    Define(GmPoint(corner + dist * bisector), upAxis(), std::fabs(r));
 }
 
 GmCircle::GmCircle(GmCircle const& c, GmLine const& l, double r, bool bRight, bool bOutside,

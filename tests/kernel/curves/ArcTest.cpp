@@ -13,7 +13,7 @@ TEST(GmArc, OrdersThreeAngles) {
         int const a = code % 3, b = code / 3 % 3, c = code / 9;
         bool const distinct = a != b && b != c && a != c;
         GmBase::eRotDir const cyclic = (b - a + 3) % 3 == 1 ? CCW : CW;
-        auto const angle = [](int i) { return GmAngle(100.0 * i - 90.0, false); };
+        auto const angle = [](int i) { return 100.0 * i - 90.0; };
         EXPECT_EQ(gmkernel_detail::angleOrder(angle(a), angle(b), angle(c)),
                   distinct ? cyclic : GmBase::eRotNone)
             << a << b << c;
