@@ -12,6 +12,7 @@
 #include "gmkernel/GmArc.h"
 #include "gmkernel/GmContour.h"
 #include "kernel/contour/ContourElements.h"
+#include "kernel/curves/PlainCurve.h"
 #include "kernel/curves/VerifiedCast.h"
 #include "kernel/values/Constants.h"
 
@@ -38,9 +39,22 @@ private:
 };
 
 /// Four chords a half-turn, at least two. A sweep that is no number gives two.
-int chordCount(GmArc const& arc) {
-    const double chords = std::fabs(arc.Ang()) * 4.0 / gmkernel_detail::kPi;
+int chordCount(double sweep) {
+    const double chords = std::fabs(sweep) * 4.0 / gmkernel_detail::kPi;
     return chords >= 2.0 && chords <= 8.0 ? static_cast<int>(chords) : 2;
+}
+
+/// Moves along the chords of an arc, to the start of the last one: to its section points, for which
+/// the sweep is computed once.
+void moveAlong(SweptArea& area, GmArc const& arc) {
+    const double sweep = arc.Ang();
+    const int chords = chordCount(sweep);
+    const gmkernel_detail::PlainArc numbers = gmkernel_detail::plainOf(arc);
+    const double turn = arc.Dir() == GmBase::eRotCW ? -sweep : sweep;
+    for (int k = 1; k < chords; ++k) {
+        area.moveTo(arc.CreationOK() ? pointOf(pointAfter(numbers, turn / chords * k))
+                                     : arc.SectionPoint(k, chords));
+    }
 }
 
 /// Twice the signed area, positive for a counter-clockwise sense.
@@ -49,11 +63,7 @@ double doubledArea(GmContour const& contour, GmPoint const& reference) {
     SweptArea area(reference, start);
     for (int i = 0; i < contour.ElementCount(); ++i) {
         GmCurve const& element = *contour.GetElement(i);
-        if (auto const* arc = gmkernel_detail::curveAs<GmArc>(element)) {
-            const int chords = chordCount(*arc);
-            for (int k = 1; k < chords; ++k)
-                area.moveTo(arc->SectionPoint(k, chords));
-        }
+        if (auto const* arc = gmkernel_detail::curveAs<GmArc>(element)) moveAlong(area, *arc);
         area.moveTo(element.EP());
     }
     if (!contour.IsClosed()) area.moveTo(start);

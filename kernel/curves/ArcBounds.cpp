@@ -9,6 +9,7 @@
 
 #include "gmkernel/GmArc.h"
 #include "gmkernel/GmRect.h"
+#include "kernel/curves/CurveBox.h"
 
 namespace {
 
@@ -36,22 +37,29 @@ double plusYOnSeam(double a) {
 
 }  // namespace
 
+namespace gmkernel_detail {
+
+CurveBox boundsOf(PlainArc const& arc) {
+    CurveBox box{std::min(arc.sp.x, arc.ep.x), std::max(arc.sp.x, arc.ep.x),
+                 std::min(arc.sp.y, arc.ep.y), std::max(arc.sp.y, arc.ep.y)};
+    const double s = arc.startDegrees;
+    const double e = arc.endDegrees;
+    if (crossesSeam(s, e, arc.sense)) box.left = arc.m.x - arc.r;
+    if (crossesSeam(plusXOnSeam(s), plusXOnSeam(e), arc.sense)) box.right = arc.m.x + arc.r;
+    if (crossesSeam(minusYOnSeam(s), minusYOnSeam(e), arc.sense)) box.bottom = arc.m.y - arc.r;
+    if (crossesSeam(plusYOnSeam(s), plusYOnSeam(e), arc.sense)) box.top = arc.m.y + arc.r;
+    return box;
+}
+
+}  // namespace gmkernel_detail
+
 GmRect GmArc::BoundingRect() const {
     return BoundingRect(false);
 }
 
 GmRect GmArc::BoundingRect(bool bIgnoreFullCircle) const {
     if (!bIgnoreFullCircle && IsFullCircle()) return GmCircle::BoundingRect();
-
-    double minX = std::min(m_SP.X(), m_EP.X());
-    double maxX = std::max(m_SP.X(), m_EP.X());
-    double minY = std::min(m_SP.Y(), m_EP.Y());
-    double maxY = std::max(m_SP.Y(), m_EP.Y());
-    const double s = SAngDeg();
-    const double e = EAngDeg();
-    if (crossesSeam(s, e, m_eDir)) minX = m_M.X() - m_dR;
-    if (crossesSeam(plusXOnSeam(s), plusXOnSeam(e), m_eDir)) maxX = m_M.X() + m_dR;
-    if (crossesSeam(minusYOnSeam(s), minusYOnSeam(e), m_eDir)) minY = m_M.Y() - m_dR;
-    if (crossesSeam(plusYOnSeam(s), plusYOnSeam(e), m_eDir)) maxY = m_M.Y() + m_dR;
-    return GmRect(GmPoint(minX, minY), GmPoint(maxX, maxY));
+    const gmkernel_detail::CurveBox box =
+        gmkernel_detail::boundsOf(gmkernel_detail::plainOf(*this));
+    return GmRect(GmPoint(box.left, box.bottom), GmPoint(box.right, box.top));
 }

@@ -33,27 +33,30 @@ public:
     bool visitUntil(CurveBox const& box, std::size_t first, Visit const& visit) const {
         if (m_levels.empty()) return false;
         const std::size_t top = m_levels.size() - 1;
-        for (std::size_t i = first >> (top * kBits); i < m_levels[top].size(); ++i) {
-            if (visitUnder(top, i, box, first, visit)) return true;
+        return visitRange(top, first >> (top * kBits), m_levels[top].size(), box, first, visit);
+    }
+
+private:
+    static constexpr std::size_t kBits = 3;  ///< two to that power have a box about them
+
+    template <class Visit>
+    bool visitRange(std::size_t level, std::size_t begin, std::size_t end, CurveBox const& box,
+                    std::size_t first, Visit const& visit) const {
+        CurveBox const* const boxes = m_levels[level].data();
+        for (std::size_t i = begin; i < end; ++i) {
+            if (!box.overlaps(boxes[i])) continue;
+            if (level == 0 ? visit(i) : visitUnder(level, i, box, first, visit)) return true;
         }
         return false;
     }
 
-private:
-    static constexpr std::size_t kBits = 4;  ///< two to that power have a box about them
-
     template <class Visit>
     bool visitUnder(std::size_t level, std::size_t index, CurveBox const& box, std::size_t first,
                     Visit const& visit) const {
-        if (!box.overlaps(m_levels[level][index])) return false;
-        if (level == 0) return visit(index);
         const std::size_t below = level - 1;
         const std::size_t begin = std::max(index << kBits, first >> (below * kBits));
         const std::size_t end = std::min((index + 1) << kBits, m_levels[below].size());
-        for (std::size_t i = begin; i < end; ++i) {
-            if (visitUnder(below, i, box, first, visit)) return true;
-        }
-        return false;
+        return visitRange(below, begin, end, box, first, visit);
     }
 
     /// The box about the boxes under one of a level above the row.

@@ -8,7 +8,6 @@
 /// too small for segments and arcs; it may be larger than needed. Endless curves have no such box.
 #include "kernel/curves/CurveBox.h"
 
-#include "gmkernel/GmArc.h"
 #include "gmkernel/GmRect.h"
 #include "kernel/curves/VerifiedCast.h"
 
@@ -21,36 +20,46 @@ constexpr double kReachMargin = 0.02;
 
 /// Does the arc's membership test accept points all around the circle? Arcs whose ends are equal
 /// within the point tolerance count as full circles there, whatever their sweep.
-bool reachesAround(GmArc const& arc) {
-    const bool hasSense = arc.Dir() == GmBase::eRotCW || arc.Dir() == GmBase::eRotCCW;
-    return !hasSense || arc.SP() == arc.EP();
+bool reachesAround(PlainArc const& arc) {
+    const bool hasSense = arc.sense == GmBase::eRotCW || arc.sense == GmBase::eRotCCW;
+    return !hasSense || isSamePoint(arc.sp, arc.ep);
 }
 
-/// The point of the circle at a stored angle. Angles next to an axis are stored as the axis, so
-/// that on large circles this point differs from the end point.
-GmPoint atAngle(GmArc const& arc, double degrees) {
-    return GmPoint(arc.M() + arc.R() * GmVec(GmDir(GmAngle(degrees, false))));
+CurveBox circleBox(PlainArc const& arc) {
+    return {arc.m.x - arc.r, arc.m.x + arc.r, arc.m.y - arc.r, arc.m.y + arc.r};
 }
 
-GmRect arcReach(GmArc const& arc) {
-    GmRect box = arc.BoundingRect();
-    if (reachesAround(arc)) box = box.Or(arc.GmCircle::BoundingRect());
-    box.Include(atAngle(arc, arc.SAngDeg()));
-    box.Include(atAngle(arc, arc.EAngDeg()));
-    return box;
+/// The point of the circle in the direction of a stored angle. Angles next to an axis are stored as
+/// the axis, so that on large circles this point differs from the end point.
+PlanePoint onCircle(PlainArc const& arc, PlanePoint direction) {
+    return {arc.m.x + arc.r * direction.x, arc.m.y + arc.r * direction.y};
 }
 
 }  // namespace
 
-CurveBox boxOf(GmPoint const& p) {
-    return {p.X(), p.X(), p.Y(), p.Y()};
+CurveBox reachOf(GmCurve const& curve) {
+    if (auto const* stretch = curveAs<GmStretch>(curve)) return reachOf(plainOf(*stretch));
+    if (auto const* arc = curveAs<GmArc>(curve)) {
+        const PlainArc numbers = plainOf(*arc);
+        return reachOf(numbers, QuickSweep(numbers));
+    }
+    const GmRect box = curve.BoundingRect();
+    return CurveBox{box.Left(), box.Right(), box.Bottom(), box.Top()}.grown(kReachMargin);
 }
 
-CurveBox reachOf(GmCurve const& curve) {
-    auto const* const arc = curveAs<GmArc>(curve);
-    const GmRect box = arc != nullptr ? arcReach(*arc) : curve.BoundingRect();
-    return {box.Left() - kReachMargin, box.Right() + kReachMargin, box.Bottom() - kReachMargin,
-            box.Top() + kReachMargin};
+CurveBox reachOf(PlainSegment const& segment) {
+    CurveBox box = CurveBox::empty();
+    box.include(planePoint(segment.sp));
+    box.include(planePoint(segment.ep));
+    return box.grown(kReachMargin);
+}
+
+CurveBox reachOf(PlainArc const& arc, QuickSweep const& sweep) {
+    CurveBox box = boundsOf(arc);
+    if (reachesAround(arc)) box.include(circleBox(arc));
+    box.include(onCircle(arc, sweep.start()));
+    box.include(onCircle(arc, sweep.end()));
+    return box.grown(kReachMargin);
 }
 
 }  // namespace gmkernel_detail

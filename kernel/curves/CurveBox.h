@@ -4,7 +4,8 @@
 #include <algorithm>
 #include <limits>
 
-#include "gmkernel/GmCurve.h"
+#include "kernel/curves/PlainCurve.h"
+#include "kernel/curves/QuickSweep.h"
 
 namespace gmkernel_detail {
 
@@ -32,17 +33,26 @@ struct CurveBox {
         constexpr double kMost = std::numeric_limits<double>::max();
         return {kMost, -kMost, kMost, -kMost};
     }
+    void include(PlanePoint p) { include(CurveBox{p.x, p.x, p.y, p.y}); }
     CurveBox grown(double margin) const {
         return {left - margin, right + margin, bottom - margin, top + margin};
     }
 };
 
 /// The box of a single point.
-CurveBox boxOf(GmPoint const& p);
+inline CurveBox boxOf(PlanePoint p) {
+    return {p.x, p.x, p.y, p.y};
+}
+
+/// The box of an arc by its ends and stored angles, of its sweep alone also where it counts as a
+/// full circle.
+CurveBox boundsOf(PlainArc const& arc);
 
 /// The box of every point that the membership tests of a segment or an arc can accept: its bounding
 /// rectangle, grown by twice the loosest membership tolerance. Curves whose boxes are apart have no
 /// intersection.
 CurveBox reachOf(GmCurve const& curve);
+CurveBox reachOf(PlainSegment const& segment);
+CurveBox reachOf(PlainArc const& arc, QuickSweep const& sweep);
 
 }  // namespace gmkernel_detail

@@ -51,53 +51,106 @@ GmPoint meetingOfCaps(GmArc const& arc, double d) {
     return GmPoint(sp + chord / 2.0 + h * GmVec(towards));
 }
 
-/// Lets the caps of a tightly bent arc end where they meet.
-void shortenCaps(GmArc const& arc, double d, Cap& start, Cap& end) {
+/// Lets a cap of a tightly bent arc end where both caps meet.
+void shortenCap(GmArc const& arc, double d, PieceRole role, Cap& cap) {
     if (!(arc.R() <= std::fabs(d))) return;
-    const GmPoint meeting = meetingOfCaps(arc, d);
     const bool awayFromCentre =
         (d > 0.0 && arc.Dir() == GmBase::eRotCCW) || (d < 0.0 && arc.Dir() == GmBase::eRotCW);
-    if (awayFromCentre) {
-        start.from = meeting;
-        end.to = meeting;
-    } else {
-        start.to = meeting;
-        end.from = meeting;
+    const bool beginsThere = awayFromCentre == (role == PieceRole::kStartCap);
+    (beginsThere ? cap.from : cap.to) = meetingOfCaps(arc, d);
+}
+
+GmArc capOf(GmCurve const& element, double d, PieceRole role) {
+    Cap cap = role == PieceRole::kStartCap ? startCap(element, d) : endCap(element, d);
+    if (auto const* arc = curveAs<GmArc>(element)) shortenCap(*arc, d, role, cap);
+    return GmArc(cap.from, cap.to, cap.centre, d > 0.0 ? GmBase::eRotCCW : GmBase::eRotCW);
+}
+
+/// The offset of a stretch or an arc, on the other side reversed.
+template <class Curve>
+Curve offsetOf(Curve const& element, double d, PieceRole role) {
+    if (role == PieceRole::kChosenSide) return Curve(element, d);
+    Curve offset(element, -d);
+    offset.Invert();
+    return offset;
+}
+
+/// Calls visit(curve) with the curve that has a role in the band, unless it vanishes.
+template <class Visit>
+void visitBandCurve(GmCurve const& element, double d, PieceRole role, Visit const& visit) {
+    if (role == PieceRole::kStartCap || role == PieceRole::kEndCap) {
+        visit(capOf(element, d, role));
+    } else if (auto const* stretch = curveAs<GmStretch>(element)) {
+        const GmStretch offset = offsetOf(*stretch, d, role);
+        if (offset.CreationOK()) visit(offset);
+    } else if (auto const* arc = curveAs<GmArc>(element)) {
+        const GmArc offset = offsetOf(*arc, d, role);
+        if (offset.CreationOK()) visit(offset);
     }
 }
 
-/// The offset of a stretch or an arc, null when it vanishes.
-std::unique_ptr<GmCurve> offsetOf(GmCurve const& element, double d) {
-    std::unique_ptr<GmCurve> offset(element.GetParallel(d));
-    if (!offset->CreationOK()) offset.reset();
-    return offset;
+/// Calls visit(role, curve) for the boundary of the band, in order.
+template <class Visit>
+void visitBand(GmCurve const& element, double d, Visit const& visit) {
+    if (!isSegmentOrArc(element)) return;
+    for (const PieceRole role : {PieceRole::kStartCap, PieceRole::kChosenSide, PieceRole::kEndCap,
+                                 PieceRole::kOtherSide}) {
+        visitBandCurve(element, d, role, [&](auto const& curve) { visit(role, curve); });
+    }
 }
 
 }  // namespace
 
 std::vector<GmOffsetElement> bandPieces(GmCurve const& element, int source, int id, double d) {
     std::vector<GmOffsetElement> pieces;
-    if (!isSegmentOrArc(element)) return pieces;
-
-    const auto add = [&](PieceRole role, std::unique_ptr<GmCurve> curve) {
-        pieces.emplace_back(std::move(curve), source, id, role);
-    };
-    const GmBase::eRotDir rot = d > 0.0 ? GmBase::eRotCCW : GmBase::eRotCW;
-    const auto arcOf = [rot](Cap const& cap) {
-        return std::make_unique<GmArc>(cap.from, cap.to, cap.centre, rot);
-    };
-    Cap start = startCap(element, d);
-    Cap end = endCap(element, d);
-    if (auto const* arc = curveAs<GmArc>(element)) shortenCaps(*arc, d, start, end);
-
-    add(PieceRole::kStartCap, arcOf(start));
-    if (auto offset = offsetOf(element, d)) add(PieceRole::kChosenSide, std::move(offset));
-    add(PieceRole::kEndCap, arcOf(end));
-    if (auto other = offsetOf(element, -d)) {
-        other->Invert();
-        add(PieceRole::kOtherSide, std::move(other));
-    }
+    visitBand(element, d, [&](PieceRole role, auto const& curve) {
+        pieces.emplace_back(std::unique_ptr<GmCurve>(curve.Clone()), source, id, role);
+    });
     return pieces;
+}
+
+void appendBandPieces(GmCurve const& element, int source, int id, double d,
+                      std::vector<Piece>& pieces) {
+    visitBand(element, d, [&](PieceRole role, auto const& curve) {
+        pieces.emplace_back(plainOf(curve), source, id, role);
+    });
+}
+
+bool splitsItself(GmCurve const& element, double d) {
+    // Within these bounds rounding moves the point in which a cap touches an offset by less than
+    // half the length tolerance, so that it is the joint; and caps that cross do so far from both
+    // half circles.
+    constexpr double kShortest = 0.01;
+    constexpr double kNearest = 0.01;
+    constexpr double kFarthest = 50.0;
+    constexpr double kLargestCoordinate = 1e4;
+    constexpr double kSkew = 1e-11;
+    // Next to an axis, lines are taken for vertical and angles of cuts for those of the axis.
+    constexpr double kNextToAxis = 2e-4;
+    auto const* const stretch = curveAs<GmStretch>(element);
+    if (stretch == nullptr) return true;
+    const PlainSegment segment = plainOf(*stretch);
+    const auto isCommon = [](Vec3 const& p) {
+        return std::fabs(p.x) < kLargestCoordinate && std::fabs(p.y) < kLargestCoordinate;
+    };
+    const auto isBesideAxis = [](double slope, double extent) {
+        return std::fabs(slope) <= kNextToAxis && !(std::fabs(extent) < kSkew);
+    };
+    const bool asItLies = !isBesideAxis(segment.dir.x, segment.ep.x - segment.sp.x) &&
+                          !isBesideAxis(segment.dir.y, segment.ep.y - segment.sp.y);
+    const bool common = isCommon(segment.sp) && isCommon(segment.ep) && std::fabs(d) > kNearest &&
+                        std::fabs(d) < kFarthest && segment.sp.z == segment.ep.z;
+    return !common || !asItLies || !(distance(segment.sp, segment.ep) > kShortest) ||
+           !(distance(segment.ep, footOn(segment, segment.ep)) < kSkew);
+}
+
+GmOffsetElement elementOf(Piece const& piece, GmCurve const& element, double d) {
+    std::unique_ptr<GmCurve> curve;
+    visitBandCurve(element, d, piece.role(),
+                   [&](auto const& offset) { curve.reset(offset.Clone()); });
+    if (piece.startMoved()) curve->SetSP(pointOf(startOf(piece.curve())));
+    if (piece.endMoved()) curve->SetEP(pointOf(endOf(piece.curve())));
+    return {std::move(curve), piece.source(), piece.id(), piece.role()};
 }
 
 }  // namespace gmkernel_detail

@@ -4,6 +4,7 @@
 #include <vector>
 
 #include "kernel/contour/offset/OffsetElement.h"
+#include "kernel/contour/offset/Piece.h"
 
 namespace gmkernel_detail {
 
@@ -16,5 +17,19 @@ namespace gmkernel_detail {
 /// @param id its identifier
 /// @param d the offset distance, positive to the right of the direction of travel
 std::vector<GmOffsetElement> bandPieces(GmCurve const& element, int source, int id, double d);
+
+/// The same in plain numbers, appended to a list.
+void appendBandPieces(GmCurve const& element, int source, int id, double d,
+                      std::vector<Piece>& pieces);
+
+/// May pieces of an element's own band split each other? False where they only touch at their
+/// joints, which is certain for segments of common sizes.
+bool splitsItself(GmCurve const& element, double d);
+
+/// The curve of a piece that splitting has left of a band.
+/// @param piece the piece
+/// @param element the source element of its band
+/// @param d the offset distance for which the band was made
+GmOffsetElement elementOf(Piece const& piece, GmCurve const& element, double d);
 
 }  // namespace gmkernel_detail

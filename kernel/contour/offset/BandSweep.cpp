@@ -8,62 +8,49 @@
 /// contour, results are right only where the contour keeps away from what left the span.
 #include "kernel/contour/offset/BandSweep.h"
 
-#include <cmath>
-#include <limits>
-
 #include "kernel/contour/offset/BandPieces.h"
-#include "kernel/contour/offset/Insertion.h"
-#include "kernel/curves/VerifiedCast.h"
 
 namespace gmkernel_detail {
 
-namespace {
-
-/// The box of the points that may be nearer to a source element than |d|; everywhere for elements
-/// that are neither segments nor arcs.
-CurveBox nearbyOf(GmCurve const& element, double d) {
-    constexpr double kEverywhere = std::numeric_limits<double>::max();
-    if (!isSegmentOrArc(element)) return {-kEverywhere, kEverywhere, -kEverywhere, kEverywhere};
-    return reachOf(element).grown(std::fabs(d));
-}
-
-}  // namespace
+BandSweep::BandSweep(double d, int span)
+    : m_d(d), m_spanSize(span), m_span(d), m_insertion(m_active), m_removal(m_active, m_span, d) {}
 
 void BandSweep::add(GmContElement const& record) {
     ++m_index;
-    advanceSpan(*record.pCurve);
-    for (GmOffsetElement& piece :
-         bandPieces(*record.pCurve, m_index, static_cast<int>(record.lId), m_d)) {
-        insertPiece(m_active, std::move(piece));
-    }
-    removeNearPieces(m_active, m_span, m_d);
+    const bool spanGrew = advanceSpan(*record.pCurve);
+    m_band.clear();
+    appendBandPieces(*record.pCurve, m_index, static_cast<int>(record.lId), m_d, m_band);
+    const bool cutsOwnBand = splitsItself(*record.pCurve, m_d);
+    for (Piece const& piece : m_band)
+        m_insertion.insert(piece, cutsOwnBand);
+    m_removal.removeNearPieces(spanGrew);
     retire();
 }
 
-/// Appends an element to the span, if it joins, and lets the oldest one leave.
-void BandSweep::advanceSpan(GmCurve const& element) {
-    const bool appended = m_span.elements.AddElement(&element, false, 0);
-    if (appended) {
-        m_span.nearby.append(nearbyOf(element, m_d));
-        m_span.quick.emplace_back(element);
-    }
-    if (m_index >= m_spanSize && !m_span.isEmpty()) {
-        m_span.elements.RemoveElement(0);
-        ++m_span.oldest;
-    }
-    m_span.grew = appended && !m_span.isEmpty();
+/// Appends an element to the span, if it joins, and lets the oldest one leave. Answers whether the
+/// last element is new.
+bool BandSweep::advanceSpan(GmCurve const& element) {
+    const bool appended = m_span.append(element);
+    if (m_index >= m_spanSize && !m_span.isEmpty()) m_span.dropOldest();
+    return appended && !m_span.isEmpty();
 }
 
-/// Moves the pieces of elements that are leaving the span to the finished ones.
+/// Retires the pieces of elements that are leaving the span.
 void BandSweep::retire() {
     const long long oldestKept = static_cast<long long>(m_index) - m_spanSize + 1;
-    if (oldestKept >= 0) m_active.retire(oldestKept, m_finished);
+    if (oldestKept >= 0) m_active.retire(oldestKept);
 }
 
-PieceList BandSweep::finish() {
-    m_active.retireAll(m_finished);
-    m_finished.remove_if([](Piece const& piece) { return !piece.element.kept(); });
-    return std::move(m_finished);
+std::vector<Piece const*> BandSweep::finish() {
+    m_active.retireAll();
+    PieceRows const& pieces = m_active.pieces();
+    std::vector<Piece const*> kept;
+    kept.reserve(m_active.retired().size);
+    PiecePlace place = m_active.retired().first;
+    for (; place != kNoPiece; place = pieces.after(place)) {
+        if (isKept(pieces[place].role())) kept.push_back(&pieces[place]);
+    }
+    return kept;
 }
 
 }  // namespace gmkernel_detail

@@ -1,8 +1,11 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include <vector>
+
 #include "gmkernel/GmContElement.h"
 #include "kernel/contour/offset/ActivePieces.h"
+#include "kernel/contour/offset/Insertion.h"
 #include "kernel/contour/offset/Removal.h"
 
 namespace gmkernel_detail {
@@ -15,23 +18,26 @@ class BandSweep {
 public:
     /// @param d the offset distance, positive to the right
     /// @param span how many of the most recent elements cut and test pieces; none for 0 or less
-    BandSweep(double d, int span) : m_d(d), m_spanSize(span) {}
+    BandSweep(double d, int span);
 
-    /// Takes the next element of the source.
+    /// Takes the next element of the source, which must stay where it is until the end of the walk.
     void add(GmContElement const& record);
-    /// Ends the walk: the pieces of the kept side, in the order in which they were retired.
-    PieceList finish();
+    /// Ends the walk: the pieces of the kept side, in the order in which they were retired. They
+    /// live as long as this object.
+    std::vector<Piece const*> finish();
 
 private:
-    void advanceSpan(GmCurve const& element);
+    bool advanceSpan(GmCurve const& element);
     void retire();
 
     double m_d;
     int m_spanSize;
-    int m_index = -1;   ///< index of the newest element
-    SourceSpan m_span;  ///< clones of the most recent elements
+    int m_index = -1;  ///< index of the newest element
+    SourceSpan m_span;
     ActivePieces m_active;
-    PieceList m_finished;  ///< retired pieces
+    Insertion m_insertion;
+    Removal m_removal;
+    std::vector<Piece> m_band;  ///< scratch: the band of the newest element
 };
 
 }  // namespace gmkernel_detail

@@ -31,59 +31,64 @@ constexpr double kShortestPiece = 0.001;
 
 }  // namespace
 
-Chaining::Chaining(PieceList pieces)
-    : m_pieces(std::move(pieces)), m_taken(m_pieces.size(), false), m_starts(jointGap()) {
-    for (auto place = m_pieces.begin(); place != m_pieces.end(); ++place) {
-        m_starts.add(place->element.curve().SP(), m_places.size());
-        m_places.push_back(place);
-        m_ids.push_back(place->element.id());
-    }
+Chaining::Chaining(std::vector<Piece const*> pieces)
+    : m_pieces(std::move(pieces)),
+      m_left(m_pieces.size()),
+      m_taken(m_pieces.size(), false),
+      m_byId(m_pieces.size()),
+      m_starts(jointGap()) {
+    for (std::size_t number = 0; number < m_pieces.size(); ++number)
+        m_starts.add(startOf(curve(number)), number);
     m_starts.order();
-    m_byId.resize(m_places.size());
     std::iota(m_byId.begin(), m_byId.end(), std::size_t{0});
     std::stable_sort(m_byId.begin(), m_byId.end(),
-                     [this](std::size_t a, std::size_t b) { return m_ids[a] < m_ids[b]; });
+                     [this](std::size_t a, std::size_t b) { return id(a) < id(b); });
 }
 
-PieceList Chaining::takeChain() {
-    PieceList chain;
-    begin(chain);
-    growBackward(chain);
-    growForward(chain);
-    chain.remove_if(
-        [](Piece const& piece) { return piece.element.curve().Length() < kShortestPiece; });
+Chaining::Chain Chaining::takeChain() {
+    Numbers numbers = growBackward(takeFirst());
+    growForward(numbers);
+    Chain chain;
+    for (const std::size_t number : numbers) {
+        if (!(lengthOf(curve(number)) < kShortestPiece)) chain.push_back(m_pieces[number]);
+    }
     return chain;
 }
 
-void Chaining::take(PieceList& chain, PieceList::iterator before, std::size_t number) {
-    chain.splice(before, m_pieces, m_places[number]);
+void Chaining::take(std::size_t number) {
     m_taken[number] = true;
+    --m_left;
 }
 
-/// The piece with the smallest identifier, the first of equals, alone in a new chain.
-void Chaining::begin(PieceList& chain) {
+/// The piece with the smallest identifier, the first of equals.
+std::size_t Chaining::takeFirst() {
     while (m_taken[m_byId[m_first]])
         ++m_first;
-    take(chain, chain.end(), m_byId[m_first]);
+    take(m_byId[m_first]);
+    return m_byId[m_first];
 }
 
 /// One walk through the pieces with the identifier of the first one.
-void Chaining::growBackward(PieceList& chain) {
-    const int id = chain.front().element.id();
-    for (std::size_t i = m_first; i < m_byId.size() && m_ids[m_byId[i]] == id; ++i) {
+Chaining::Numbers Chaining::growBackward(std::size_t first) {
+    const int smallest = id(first);
+    Numbers chain{first};
+    for (std::size_t i = m_first; i < m_byId.size() && id(m_byId[i]) == smallest; ++i) {
         const std::size_t number = m_byId[i];
         if (m_taken[number]) continue;
-        if (piece(number).element.curve().EP() == chain.front().element.curve().SP()) {
-            take(chain, chain.begin(), number);
-        }
+        Vec3 const& start = startOf(curve(chain.back()));
+        if (!isSamePoint(endOf(curve(number)), start)) continue;
+        take(number);
+        chain.push_back(number);
     }
+    std::reverse(chain.begin(), chain.end());
+    return chain;
 }
 
 /// Goes on by the only piece that starts at the end, or of several by the first that leads on to
 /// another piece, else by the first.
-void Chaining::growForward(PieceList& chain) {
+void Chaining::growForward(Numbers& chain) {
     while (true) {
-        collectStartsAt(chain.back().element.curve().EP(), m_next);
+        collectStartsAt(endOf(curve(chain.back())), m_next);
         if (m_next.empty()) return;
         std::size_t next = m_next.front();
         if (m_next.size() > 1) {
@@ -91,26 +96,30 @@ void Chaining::growForward(PieceList& chain) {
                                             [this](std::size_t number) { return leadsOn(number); });
             if (found != m_next.end()) next = *found;
         }
-        take(chain, chain.end(), next);
+        take(next);
+        chain.push_back(next);
     }
 }
 
-bool Chaining::startsAt(std::size_t number, GmPoint const& p, CurveBox const& box) const {
-    return !m_taken[number] && box.overlaps(piece(number).reach) &&
-           piece(number).element.curve().SP().Dist(p) < jointGap();
+bool Chaining::startsAt(std::size_t number, Vec3 const& p) const {
+    return !m_taken[number] && distance(startOf(curve(number)), p) < jointGap();
 }
 
 /// The pieces left that start at a point, in the order of the list.
-void Chaining::collectStartsAt(GmPoint const& p, Numbers& numbers) const {
+void Chaining::collectStartsAt(Vec3 const& p, Numbers& numbers) const {
     m_starts.collectNear(p, numbers);
-    const CurveBox box = boxOf(p);
-    const auto isElsewhere = [&](std::size_t number) { return !startsAt(number, p, box); };
+    const auto isElsewhere = [&](std::size_t number) { return !startsAt(number, p); };
     numbers.erase(std::remove_if(numbers.begin(), numbers.end(), isElsewhere), numbers.end());
 }
 
 bool Chaining::leadsOn(std::size_t number) {
-    collectStartsAt(piece(number).element.curve().EP(), m_further);
+    collectStartsAt(endOf(curve(number)), m_further);
     return !m_further.empty();
+}
+
+bool hasOffset(Chaining::Chain const& chain) {
+    return std::any_of(chain.begin(), chain.end(),
+                       [](Piece const* piece) { return !isAuxiliary(piece->role()); });
 }
 
 }  // namespace gmkernel_detail

@@ -10,74 +10,79 @@
 #include "kernel/contour/offset/Insertion.h"
 
 #include <algorithm>
-#include <iterator>
-#include <vector>
 
 namespace gmkernel_detail {
 
 namespace {
 
-using Points = std::vector<GmPoint>;
-
-/// Brings points of a curve into their order along it.
-void sortAlong(GmCurve const& curve, Points& points) {
-    if (points.size() < 2) return;
-    struct Place {
-        double fromStart;
-        GmPoint point;
-    };
-    std::vector<Place> places;
-    places.reserve(points.size());
-    for (GmPoint const& p : points)
-        places.push_back({curve.DistSP(p), p});
-    std::stable_sort(places.begin(), places.end(),
-                     [](Place const& a, Place const& b) { return a.fromStart < b.fromStart; });
-    std::transform(places.begin(), places.end(), points.begin(),
-                   [](Place const& place) { return place.point; });
-}
-
-/// Splits a piece at points of its curve, taken in order along the curve. Points equal to an end
-/// split nothing. The parts before each point are inserted before the piece, which keeps the rest.
-void splitPiece(ActivePieces& active, std::size_t index, PieceList::iterator piece,
-                Points& points) {
-    PieceRun& run = active.run(index);
-    GmCurve& curve = piece->element.curve();
-    sortAlong(curve, points);
-
-    bool split = false;
-    for (GmPoint const& p : points) {
-        if (p == curve.SP() || p == curve.EP()) continue;
-        GmOffsetElement part(piece->element);
-        part.curve().SetEP(p);
-        active.changed(index, *run.pieces.insert(piece, Piece(std::move(part))));
-        curve.SetSP(p);
-        split = true;
-    }
-    if (!split) return;
-    piece->measure();
-    active.changed(index, *piece);
-}
-
-/// Cuts the pieces of a run where they cross the added one, and collects the points.
-void cutRun(ActivePieces& active, std::size_t index, Piece const& added, Points& ofAdded) {
-    PieceRun& run = active.run(index);
-    Points ofOld;
-    for (auto old = run.pieces.begin(); old != run.pieces.end(); ++old) {
-        if (!added.reach.overlaps(old->reach)) continue;
-        ::Intersection(added.element.curve(), old->element.curve(), ofOld);
-        ofAdded.insert(ofAdded.end(), ofOld.begin(), ofOld.end());
-        splitPiece(active, index, old, ofOld);
-    }
+/// Are the pieces of one band that does not split itself, and is nothing lost without their joint?
+/// Where a cap meets an offset at its start, the joint counts: the angle of a cut beside it may
+/// snap to that of the start, and then the order of both points decides.
+bool onlyTouch(Piece const& added, Piece const& old) {
+    if (old.source() != added.source()) return false;
+    return added.role() != PieceRole::kEndCap || old.role() == PieceRole::kStartCap;
 }
 
 }  // namespace
 
-void insertPiece(ActivePieces& active, GmOffsetElement element) {
-    Piece added(std::move(element));
-    Points ofAdded;
-    active.visitReached(added.reach, [&](std::size_t run) { cutRun(active, run, added, ofAdded); });
-    const std::size_t last = active.append(std::move(added));
-    splitPiece(active, last, std::prev(active.run(last).pieces.end()), ofAdded);
+void Insertion::insert(Piece const& added, bool cutsOwnBand) {
+    m_cutsOwnBand = cutsOwnBand;
+    m_ofAdded.clear();
+    m_active.visitReached(added.reach(), [&](std::size_t run) { cutRun(run, added); });
+    const std::size_t last = m_active.append(added);
+    splitPiece(last, m_active.run(last).row.last, m_ofAdded);
+}
+
+/// Cuts the pieces of a run where they cross the added one, and collects the points.
+void Insertion::cutRun(std::size_t index, Piece const& added) {
+    PieceRows const& pieces = m_active.pieces();
+    PiecePlace place = m_active.run(index).row.first;
+    for (; place != kNoPiece; place = pieces.after(place)) {
+        Piece const& old = pieces[place];
+        if (!added.reach().overlaps(old.reach())) continue;
+        if (!m_cutsOwnBand && onlyTouch(added, old)) continue;
+        const Hits<2> points = crossings(added, old);
+        m_ofOld.assign(points.begin(), points.end());
+        m_ofAdded.insert(m_ofAdded.end(), points.begin(), points.end());
+        splitPiece(index, place, m_ofOld);
+    }
+}
+
+/// Splits a piece at points of its curve, taken in order along the curve. Points equal to an end
+/// split nothing. The parts before each point are inserted before the piece, which keeps the rest.
+void Insertion::splitPiece(std::size_t index, PiecePlace place, Points& points) {
+    if (points.empty()) return;
+    PieceRows& pieces = m_active.pieces();
+    sortAlong(pieces[place].curve(), points);
+
+    bool split = false;
+    for (Vec3 const& p : points) {
+        Piece& rest = pieces[place];
+        if (isSamePoint(p, startOf(rest.curve())) || isSamePoint(p, endOf(rest.curve()))) continue;
+        Piece part = rest;
+        part.moveEnd(p);
+        part.measure();
+        rest.moveStart(p);
+        m_active.insert(index, place, part);
+        split = true;
+    }
+    if (!split) return;
+    pieces[place].measure();
+    m_active.changed(index, pieces[place]);
+}
+
+/// Brings points of a curve into their order along it; equal ones keep theirs.
+void Insertion::sortAlong(PlainCurve const& curve, Points& points) {
+    if (points.size() < 2) return;
+    m_distances.clear();
+    for (Vec3 const& p : points)
+        m_distances.push_back({distanceFromStart(curve, p), m_distances.size()});
+    std::sort(m_distances.begin(), m_distances.end(), [](Distance const& a, Distance const& b) {
+        return a.fromStart < b.fromStart || (!(b.fromStart < a.fromStart) && a.number < b.number);
+    });
+    m_unsorted = points;
+    std::transform(m_distances.begin(), m_distances.end(), points.begin(),
+                   [&](Distance const& distance) { return m_unsorted[distance.number]; });
 }
 
 }  // namespace gmkernel_detail

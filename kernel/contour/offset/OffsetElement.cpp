@@ -5,6 +5,8 @@
 
 #include "kernel/values/TraceText.h"
 
+using gmkernel_detail::isAuxiliary;
+using gmkernel_detail::isKept;
 using gmkernel_detail::PieceRole;
 
 GmOffsetElement::GmOffsetElement(std::unique_ptr<GmCurve> curve, int source, int id, PieceRole role)
@@ -22,11 +24,11 @@ GmOffsetElement& GmOffsetElement::operator=(GmOffsetElement const& other) {
 }
 
 bool GmOffsetElement::kept() const {
-    return m_role == PieceRole::kChosenSide || m_role == PieceRole::kEndCap;
+    return isKept(m_role);
 }
 
 bool GmOffsetElement::auxiliary() const {
-    return m_role != PieceRole::kChosenSide;
+    return isAuxiliary(m_role);
 }
 
 void GmOffsetElement::Trace() const {

@@ -2,18 +2,29 @@
 #pragma once
 
 #include <memory>
+#include <utility>
 
 #include "gmkernel/GmCurve.h"
 
 namespace gmkernel_detail {
 
 /// The role of a piece in the boundary of its element's band.
-enum class PieceRole {
+enum class PieceRole : char {
     kStartCap,    ///< around the element's start: only cuts other pieces
     kChosenSide,  ///< the offset on the side that is asked for: what results are made of
     kEndCap,      ///< around the element's end: rounds a corner of a result
     kOtherSide    ///< the offset on the opposite side, reversed: only cuts other pieces
 };
+
+/// May pieces of this role end up in a result?
+inline bool isKept(PieceRole role) {
+    return role == PieceRole::kChosenSide || role == PieceRole::kEndCap;
+}
+
+/// Are they anything but the offset on the chosen side?
+inline bool isAuxiliary(PieceRole role) {
+    return role != PieceRole::kChosenSide;
+}
 
 }  // namespace gmkernel_detail
 
@@ -41,6 +52,8 @@ public:
 
     GmCurve& curve() { return *m_curve; }
     GmCurve const& curve() const { return *m_curve; }
+    /// Hands the curve over and leaves the piece without one.
+    std::unique_ptr<GmCurve> takeCurve() { return std::move(m_curve); }
     int source() const { return m_source; }
     int id() const { return m_id; }
     gmkernel_detail::PieceRole role() const { return m_role; }

@@ -13,9 +13,11 @@
 /// everything.
 #include <cmath>
 #include <memory>
+#include <vector>
 
 #include "gmkernel/GmContour.h"
 #include "kernel/contour/GmContourArray.h"
+#include "kernel/contour/offset/BandPieces.h"
 #include "kernel/contour/offset/BandSweep.h"
 #include "kernel/contour/offset/Chaining.h"
 #include "kernel/contour/offset/ResultContour.h"
@@ -26,6 +28,16 @@ using namespace gmkernel_detail;
 
 /// The span that lets every element cut and test every piece.
 constexpr int kWholeContour = 1000000;
+
+/// The curves of a chain of pieces.
+std::vector<GmOffsetElement> elementsOf(Chaining::Chain const& chain, GmContour const& source,
+                                        double d) {
+    std::vector<GmOffsetElement> elements;
+    elements.reserve(chain.size());
+    for (Piece const* piece : chain)
+        elements.push_back(elementOf(*piece, *source.GetElement(piece->source()), d));
+    return elements;
+}
 
 bool goesInside(GmBase::eRotDir sense, double d) {
     return (sense == GmBase::eRotCW && d > 0.0) || (sense == GmBase::eRotCCW && d < 0.0);
@@ -52,9 +64,10 @@ int GmContour::Offsetting(double d, int nSpan, bool bKeepOpen) {
 
     RemoveAllSubConts();
     while (!chaining.done()) {
-        const PieceList chain = chaining.takeChain();
-        std::unique_ptr<GmContour> result = resultContour(chain);
-        if (!hasOffset(chain) || (insideOnly && !result->IsClosed())) continue;
+        const Chaining::Chain chain = chaining.takeChain();
+        if (!hasOffset(chain)) continue;
+        std::unique_ptr<GmContour> result = resultContour(elementsOf(chain, *this, d));
+        if (insideOnly && !result->IsClosed()) continue;
         m_pSubConts->Take(std::move(result));
     }
     return m_pSubConts->GetCount();

@@ -3,15 +3,10 @@
 
 #include <optional>
 
-#include "gmkernel/GmCurve.h"
+#include "kernel/curves/PlainCurve.h"
+#include "kernel/curves/QuickSweep.h"
 
 namespace gmkernel_detail {
-
-/// A point of the plane in plain numbers.
-struct PlanePoint {
-    double x;
-    double y;
-};
 
 /// A source element in plain numbers, for telling quickly whether a point is nearer to it than a
 /// threshold, as `Distance` would tell it.
@@ -23,18 +18,17 @@ public:
     double z() const { return m_z; }
 
     /// Nothing where the answer depends on rounding or on a tolerance, or where the element is of
-    /// another kind; then `Distance` has to be asked. The point is known to about 1e-13 of its
-    /// size.
-    std::optional<bool> isNearer(PlanePoint p, double threshold) const;
+    /// another kind; then `Distance` has to be asked. Beside its error the point is known to about
+    /// 1e-13 of its size.
+    std::optional<bool> isNearer(QuickPoint const& point, double threshold) const;
 
 private:
     enum class Kind { kUnknown, kSegment, kArc };
 
-    void takeSegment(GmCurve const& element);
-    void takeArc(GmCurve const& element);
+    void take(PlainSegment const& segment);
+    void take(PlainArc const& arc);
     std::optional<double> toSegment(PlanePoint p) const;
     std::optional<double> toArc(PlanePoint p) const;
-    std::optional<bool> sweeps(PlanePoint direction) const;
     bool isBesideEnd(PlanePoint p) const;
     double toEnds(PlanePoint p) const;
 
@@ -43,19 +37,14 @@ private:
     double m_size = 0.0;  ///< what the rounding of its coordinates goes by
     PlanePoint m_sp{};
     PlanePoint m_ep{};
-    PlanePoint m_first{};  ///< of a segment its direction, of an arc that of the start of its sweep
-    PlanePoint m_second{};  ///< of an arc the direction of the end, counter-clockwise
+    PlanePoint m_direction{};  ///< of a segment
+    double m_length = 0.0;     ///< of a segment
     PlanePoint m_centre{};
     double m_radius = 0.0;
-    double m_length = 0.0;  ///< of a segment
-    bool m_full = false;    ///< the arc counts as a full circle
+    QuickSweep m_sweep;
 };
 
-/// The z coordinate of a stretch or an arc; not a number where it is not the same all along.
-double heightOf(GmCurve const& curve);
-
-/// The halving point of an arc, up to rounding; nothing for other curves, and for sweeps next to
-/// half and full circles.
-std::optional<PlanePoint> quickHalvingPoint(GmCurve const& curve);
+/// The z coordinate of a curve; not a number where it is not the same all along.
+double heightOf(PlainCurve const& curve);
 
 }  // namespace gmkernel_detail

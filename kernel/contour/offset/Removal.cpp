@@ -10,7 +10,6 @@
 #include "kernel/contour/offset/Removal.h"
 
 #include <cmath>
-#include <vector>
 
 #include "kernel/curves/dispatch/Distance.h"
 
@@ -18,48 +17,60 @@ namespace gmkernel_detail {
 
 namespace {
 
-/// Is the halving point of a piece nearer than `threshold` to an element of the span, from the one
-/// with the number `first` on? Which of them it is does not matter, so boxes may choose the order.
-bool isNear(Piece& piece, SourceSpan const& span, std::size_t first, double threshold) {
-    const PlanePoint p = piece.quickHalving();
-    const double z = piece.height;
-    return span.nearby.visitUntil({p.x, p.x, p.y, p.y}, first, [&](std::size_t number) {
-        QuickDistance const& quick = span.quick[number];
-        if (quick.z() == z) {
-            if (const auto nearer = quick.isNearer(p, threshold)) return *nearer;
-        }
-        const int index = static_cast<int>(number - span.oldest);
-        return Distance(piece.halving(), *span.elements.GetElement(index)) < threshold;
-    });
-}
-
-void removeFromRun(ActivePieces& active, std::size_t index, SourceSpan const& span,
-                   double threshold) {
-    PieceRun& run = active.run(index);
-    const std::size_t before = run.pieces.size();
-    const std::size_t newest = span.nearby.size() - (span.grew ? 1 : 0);
-    run.pieces.remove_if([&](Piece& piece) {
-        const std::size_t first = piece.clearOfSpan ? newest : span.oldest;
-        if (isNear(piece, span, first, threshold)) return true;
-        piece.clearOfSpan = true;
-        return false;
-    });
-    run.settled = true;
-    if (run.pieces.size() < before) active.shrink(index);
+/// Is the halving point of a piece nearer than `threshold` to an element?
+bool isNearTo(Piece& piece, SourceSpan const& span, std::size_t number, double threshold) {
+    QuickDistance const& quick = span.quick(number);
+    if (quick.z() == piece.height()) {
+        if (const auto nearer = quick.isNearer(piece.quickHalving(), threshold)) return *nearer;
+    }
+    return Distance(pointOf(piece.halving()), span.element(number)) < threshold;
 }
 
 }  // namespace
 
-void removeNearPieces(ActivePieces& active, SourceSpan const& span, double d) {
-    const double threshold = std::fabs(std::fabs(d) - GmBase::m_scdPrecCalc);
-    const std::vector<std::size_t> unsettled = active.takeUnsettled();
-    if (span.grew && !span.isEmpty()) {
-        active.visitReached(span.newestNearby(), [&](std::size_t index) {
-            if (active.run(index).settled) removeFromRun(active, index, span, threshold);
+Removal::Removal(ActivePieces& active, SourceSpan const& span, double d)
+    : m_active(active),
+      m_span(span),
+      m_threshold(std::fabs(std::fabs(d) - GmBase::m_scdPrecCalc)) {}
+
+void Removal::removeNearPieces(bool spanGrew) {
+    m_untested = m_span.end() - (spanGrew ? 1 : 0);
+    if (spanGrew) {
+        m_active.visitReached(m_span.nearby()[m_untested], [&](std::size_t index) {
+            if (m_active.run(index).settled) removeFromRun(index);
         });
     }
-    for (const std::size_t index : unsettled)
-        removeFromRun(active, index, span, threshold);
+    for (const std::size_t index : m_active.unsettled())
+        removeFromRun(index);
+    m_active.settle();
+}
+
+void Removal::removeFromRun(std::size_t index) {
+    PieceRows& pieces = m_active.pieces();
+    PieceRow& row = m_active.run(index).row;
+    const std::size_t before = row.size;
+    for (PiecePlace place = row.first; place != kNoPiece;) {
+        const PiecePlace next = pieces.after(place);
+        Piece& piece = pieces[place];
+        piece.clearOfSpan = !isNear(piece);
+        if (!piece.clearOfSpan) pieces.remove(row, place);
+        place = next;
+    }
+    if (row.size < before) m_active.shrink(index);
+}
+
+/// Is a piece nearer than the threshold to an element that it was not tested against? Which of them
+/// it is does not matter, so boxes may choose the order.
+bool Removal::isNear(Piece& piece) const {
+    const CurveBox at = boxOf(piece.quickHalving().p);
+    if (piece.clearOfSpan && !hasUntested()) return false;
+    const auto isNearToNumber = [&](std::size_t number) {
+        return isNearTo(piece, m_span, number, m_threshold);
+    };
+    if (piece.clearOfSpan) {
+        return at.overlaps(m_span.nearby()[m_untested]) && isNearToNumber(m_untested);
+    }
+    return m_span.nearby().visitUntil(at, m_span.oldest(), isNearToNumber);
 }
 
 }  // namespace gmkernel_detail

@@ -7,8 +7,6 @@
 /// Linear in the pieces.
 #include "kernel/contour/offset/ResultContour.h"
 
-#include <algorithm>
-
 #include "gmkernel/GmContElement.h"
 #include "gmkernel/GmStretch.h"
 #include "kernel/contour/ContourElements.h"
@@ -37,20 +35,13 @@ void bridgeGap(GmContour& contour, GmPoint const& to, int id) {
 
 }  // namespace
 
-std::unique_ptr<GmContour> resultContour(PieceList const& chain) {
+std::unique_ptr<GmContour> resultContour(std::vector<GmOffsetElement> chain) {
     auto contour = std::make_unique<GmContour>();
-    for (Piece const& piece : chain) {
-        GmOffsetElement const& element = piece.element;
+    for (GmOffsetElement& element : chain) {
         bridgeGap(*contour, element.curve().SP(), element.id());
-        append(*contour, std::unique_ptr<GmCurve>(element.curve().Clone()), element.id(),
-               element.auxiliary());
+        append(*contour, element.takeCurve(), element.id(), element.auxiliary());
     }
     return contour;
-}
-
-bool hasOffset(PieceList const& chain) {
-    return std::any_of(chain.begin(), chain.end(),
-                       [](Piece const& piece) { return !piece.element.auxiliary(); });
 }
 
 }  // namespace gmkernel_detail

@@ -4,7 +4,7 @@
 #include <cstddef>
 #include <vector>
 
-#include "gmkernel/GmPoint.h"
+#include "kernel/values/Vec3.h"
 
 namespace gmkernel_detail {
 
@@ -15,13 +15,13 @@ public:
     /// Points nearer to each other than `reach`, positive, are found.
     explicit StartCells(double reach);
 
-    void add(GmPoint const& start, std::size_t number);
+    void add(Vec3 const& start, std::size_t number);
     /// To be called once, when all points are added. Cost: that of sorting them.
     void order();
 
     /// The numbers of all points nearer than the reach, and of some beyond it, in increasing order.
     /// Cost: the logarithm of the number of points, and those that are found.
-    void collectNear(GmPoint const& p, std::vector<std::size_t>& numbers) const;
+    void collectNear(Vec3 const& p, std::vector<std::size_t>& numbers) const;
 
 private:
     struct Entry {
@@ -33,6 +33,7 @@ private:
     static bool comesBefore(Entry const& a, Entry const& b);
     double cellOf(double coordinate) const;
 
+    double m_reach;
     double m_width;
     std::vector<Entry> m_entries;
 };

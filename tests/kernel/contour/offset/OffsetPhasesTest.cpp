@@ -18,21 +18,41 @@ namespace {
 
 using namespace gmkernel_detail;
 
-GmOffsetElement Segment(double x0, double y0, double x1, double y1, int id = 1,
-                        PieceRole role = PieceRole::kChosenSide) {
-    auto curve = std::make_unique<GmStretch>(GmPoint(x0, y0), GmPoint(x1, y1));
-    return {std::move(curve), 0, id, role};
+PlainSegment Line(double x0, double y0, double x1, double y1) {
+    return plainOf(GmStretch(GmPoint(x0, y0), GmPoint(x1, y1)));
 }
 
-PieceList ListOf(std::vector<GmOffsetElement> const& elements) {
-    return PieceList(elements.begin(), elements.end());
+Piece Segment(double x0, double y0, double x1, double y1, int id = 1,
+              PieceRole role = PieceRole::kChosenSide) {
+    return {Line(x0, y0, x1, y1), 0, id, role};
 }
+
+GmOffsetElement Element(double x0, double y0, double x1, double y1, int id,
+                        PieceRole role = PieceRole::kChosenSide) {
+    return {std::make_unique<GmStretch>(GmPoint(x0, y0), GmPoint(x1, y1)), 0, id, role};
+}
+
+/// Pieces for chaining, which wants them to stay.
+struct Loose {
+    std::vector<Piece> pieces;
+    Chaining chaining;
+
+    explicit Loose(std::vector<Piece> list) : pieces(std::move(list)), chaining(Places(pieces)) {}
+
+    static std::vector<Piece const*> Places(std::vector<Piece> const& list) {
+        std::vector<Piece const*> places;
+        for (Piece const& piece : list)
+            places.push_back(&piece);
+        return places;
+    }
+    Chaining::Chain Take() { return chaining.takeChain(); }
+};
 
 /// The start points of pieces along x, as a fingerprint of an order.
-std::vector<double> Starts(PieceList const& pieces) {
+std::vector<double> Starts(Chaining::Chain const& pieces) {
     std::vector<double> starts;
-    for (Piece const& piece : pieces)
-        starts.push_back(piece.element.curve().SP().X());
+    for (Piece const* piece : pieces)
+        starts.push_back(startOf(piece->curve()).x);
     return starts;
 }
 
@@ -121,22 +141,24 @@ TEST(Insertion, BoxesCoverEveryPointThatAMembershipTestAccepts) {
 }
 
 TEST(Chaining, GoesOnOverGapsBelowThreeTolerancesAndLeavesShortPiecesOut) {
-    Chaining gaps(
-        ListOf({Segment(0, 0, 1, 0), Segment(1.00029, 0, 2, 0, 9), Segment(2.00031, 0, 3, 0, 9)}));
-    EXPECT_EQ(Starts(gaps.takeChain()), (std::vector<double>{0, 1.00029}));
-    EXPECT_EQ(Starts(gaps.takeChain()), (std::vector<double>{2.00031}));
-    EXPECT_TRUE(gaps.done());
-    Chaining tiny(ListOf({Segment(0, 0, 0.0009, 0, 1), Segment(0.0009, 0, 0.002, 0, 2)}));
-    EXPECT_EQ(Starts(tiny.takeChain()), (std::vector<double>{0.0009}));
+    Loose gaps({Segment(0, 0, 1, 0), Segment(1.00029, 0, 2, 0, 9), Segment(2.00031, 0, 3, 0, 9)});
+    EXPECT_EQ(Starts(gaps.Take()), (std::vector<double>{0, 1.00029}));
+    EXPECT_EQ(Starts(gaps.Take()), (std::vector<double>{2.00031}));
+    EXPECT_TRUE(gaps.chaining.done());
+    Loose tiny({Segment(0, 0, 0.0009, 0, 1), Segment(0.0009, 0, 0.002, 0, 2)});
+    EXPECT_EQ(Starts(tiny.Take()), (std::vector<double>{0.0009}));
 }
 
 TEST(Chaining, PrefersCandidatesThatLeadOn) {
-    Chaining leading(
-        ListOf({Segment(0, 0, 1, 0, 1), Segment(1, 0, 1, 5, 2), Segment(1, 0, 2, 0, 3),
-                Segment(1, 0, 2, 1, 4), Segment(2, 0, 3, 0, 5), Segment(2, 1, 3, 1, 6)}));
-    EXPECT_EQ(leading.takeChain().back().element.id(), 5) << "the first that leads on";
-    Chaining dead(ListOf({Segment(0, 0, 1, 0, 1), Segment(1, 0, 1, 5, 2), Segment(1, 0, 2, 0, 3)}));
-    EXPECT_EQ(dead.takeChain().back().element.id(), 2) << "the first where none leads on";
+    Loose leading({Segment(0, 0, 1, 0, 1), Segment(1, 0, 1, 5, 2), Segment(1, 0, 2, 0, 3),
+                   Segment(1, 0, 2, 1, 4), Segment(2, 0, 3, 0, 5), Segment(2, 1, 3, 1, 6)});
+    EXPECT_EQ(leading.Take().back()->id(), 5) << "the first that leads on";
+    Loose dead({Segment(0, 0, 1, 0, 1), Segment(1, 0, 1, 5, 2), Segment(1, 0, 2, 0, 3)});
+    EXPECT_EQ(dead.Take().back()->id(), 2) << "the first where none leads on";
+    Loose caps({Segment(0, 0, 1, 0, 1, PieceRole::kEndCap), Segment(1, 0, 2, 0, 2),
+                Segment(9, 0, 9, 1, 3, PieceRole::kEndCap)});
+    EXPECT_TRUE(hasOffset(caps.Take()));
+    EXPECT_FALSE(hasOffset(caps.Take()));
 }
 
 TEST(Chaining, FindsEveryStartWithinReachOnEitherSideOfACell) {
@@ -144,22 +166,25 @@ TEST(Chaining, FindsEveryStartWithinReachOnEitherSideOfACell) {
     const auto unit = [&engine] { return double(engine() % 2001) / 1000.0 - 1.0; };
     for (const double far : {0.0, 3e-4, -6e-4, 1234.5678, -1e6, 1e12}) {
         for (int i = 0; i < 300; ++i) {
-            const GmPoint start(far + 2e-3 * unit(), far - 2e-3 * unit());
-            const GmPoint p(start.X() + 2.9e-4 * unit(), start.Y());
+            const Vec3 start{far + 2e-3 * unit(), far - 2e-3 * unit(), 0};
+            const Vec3 p{start.x + 2.9e-4 * unit(), start.y, 0};
             StartCells cells(3e-4);
             cells.add(start, 5);
-            cells.add(GmPoint(far + 1, far), 4);
+            cells.add({far + 1, far, 0}, 4);
             cells.order();
             std::vector<std::size_t> found;
             cells.collectNear(p, found);
-            ASSERT_EQ(found, (std::vector<std::size_t>{5})) << start.GetTraceString();
+            ASSERT_EQ(found, (std::vector<std::size_t>{5})) << start.x << " " << start.y;
         }
     }
 }
 
 TEST(ResultContour, BridgesGapsAndTellsWhatIsMade) {
-    const auto contour = resultContour(ListOf({Segment(0, 0, 4, 0, 1), Segment(4, 0.0002, 4, 3, 2),
-                                               Segment(4, 3.00005, 0, 0, 3, PieceRole::kEndCap)}));
+    std::vector<GmOffsetElement> chain;
+    chain.push_back(Element(0, 0, 4, 0, 1));
+    chain.push_back(Element(4, 0.0002, 4, 3, 2));
+    chain.push_back(Element(4, 3.00005, 0, 0, 3, PieceRole::kEndCap));
+    const auto contour = resultContour(std::move(chain));
     // One gap is bridged, the other within tolerance.
     ASSERT_EQ(shapes::Identifiers(*contour), (std::vector<long>{1, 2, 2, 3}));
     for (int i = 0; i < 4; ++i) {
@@ -167,7 +192,4 @@ TEST(ResultContour, BridgesGapsAndTellsWhatIsMade) {
         EXPECT_EQ(contour->GetContElement(i)->lIndex, i);
     }
     EXPECT_TRUE(contour->IsClosed());
-    EXPECT_TRUE(
-        hasOffset(ListOf({Segment(0, 0, 1, 0, 1, PieceRole::kEndCap), Segment(1, 0, 2, 0)})));
-    EXPECT_FALSE(hasOffset(ListOf({Segment(0, 0, 1, 0, 1, PieceRole::kEndCap)})));
 }

@@ -137,10 +137,11 @@ std::vector<std::unique_ptr<GmContour>> PlainOffsetting(GmContour& source, doubl
         Pieces chain = TakeChain(pieces);
         const auto tooShort = [](GmOffsetElement const& p) { return p.curve().Length() < 0.001; };
         chain.erase(std::remove_if(chain.begin(), chain.end(), tooShort), chain.end());
-        gmkernel_detail::PieceList ofResult(chain.begin(), chain.end());
-        auto contour = gmkernel_detail::resultContour(ofResult);
+        const bool hasOffset =
+            std::any_of(chain.begin(), chain.end(), [](auto const& p) { return !p.auxiliary(); });
+        auto contour = gmkernel_detail::resultContour(std::move(chain));
         const bool dropped = insideOnly && !contour->IsClosed();
-        if (gmkernel_detail::hasOffset(ofResult) && !dropped) results.push_back(std::move(contour));
+        if (hasOffset && !dropped) results.push_back(std::move(contour));
     }
     return results;
 }

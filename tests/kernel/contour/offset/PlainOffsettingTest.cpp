@@ -100,6 +100,28 @@ private:
     GmContour m_contour;
 };
 
+/// Segments to and fro along an axis, on it or beside it by 1e-9 to 1e-4, and at last away from it:
+/// their bands are cut next to joints, where angles and lines are taken for those of the axis.
+GmContour AlongAnAxis(std::mt19937& engine) {
+    const auto unit = [&engine] { return double(engine()) / double(std::mt19937::max()); };
+    const double axis = double(engine() % 4) * std::acos(0.0);
+    GmContour chain;
+    GmPoint at(0, 0);
+    const int n = 3 + static_cast<int>(engine() % 5);
+    for (int i = 1; i <= n; ++i) {
+        const double side = engine() % 2 == 0 ? 1.0 : -1.0;
+        const double back = engine() % 3 == 0 ? std::acos(-1.0) : 0.0;
+        const double beside = engine() % 2 == 0 ? 0.0 : std::pow(10.0, -4.0 - 5.0 * unit());
+        const double turn = i < n ? side * beside : side;
+        const double length = 6.0 * std::pow(10.0, -2.0 * unit());
+        const GmDir towards(GmAngle(axis + back + turn, true));
+        const GmPoint to(at + length * GmVec(towards));
+        chain.AddElement(GmStretch(at, to), false, i);
+        at = to;
+    }
+    return chain;
+}
+
 }  // namespace
 
 TEST(PlainOffsetting, GivesTheSameDigitsOnContours) {
@@ -134,4 +156,17 @@ TEST(PlainOffsetting, GivesTheSameDigitsOnWildChains) {
         }
     }));
     EXPECT_GT(results, 300);
+}
+
+TEST(PlainOffsetting, GivesTheSameDigitsAlongAnAxis) {
+    std::mt19937 engine(1);
+    int results = 0;
+    for (int i = 0; i < 3000; ++i) {
+        GmContour chain = AlongAnAxis(engine);
+        const double d = std::pow(10.0, double(engine() % 3000) / 1500.0 - 0.8);
+        const int agreed = AgreedResults(chain, engine() % 2 == 0 ? d : -d, 1000000, true);
+        ASSERT_GE(agreed, 0) << "chain " << i << ", d " << d;
+        results += agreed;
+    }
+    EXPECT_GT(results, 1000);
 }
