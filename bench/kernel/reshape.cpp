@@ -41,14 +41,12 @@ void RoundAllCorners(benchmark::State& state, ChainKind kind) {
 }  // namespace
 
 BENCHMARK_CAPTURE(Melt, lines, ChainKind::eLines)
-    ->Arg(10)
-    ->Arg(100)
-    ->Arg(1000)
+    ->RangeMultiplier(10)
+    ->Range(10, 100000)
     ->Unit(benchmark::kMicrosecond);
 BENCHMARK_CAPTURE(Melt, lines_and_arcs, ChainKind::eLinesAndArcs)
-    ->Arg(10)
-    ->Arg(100)
-    ->Arg(1000)
+    ->RangeMultiplier(10)
+    ->Range(10, 100000)
     ->Unit(benchmark::kMicrosecond);
 BENCHMARK_CAPTURE(RoundAllCorners, lines, ChainKind::eLines)
     ->Arg(100)

@@ -11,7 +11,7 @@ namespace gmkernel_detail {
 
 /// Boxes in a row, for finding those that overlap another one without a look at all of them.
 ///
-/// Level upon level, every sixteen neighbours have a box about them, so that whole stretches of the
+/// Level upon level, every eight neighbours have a box about them, so that whole stretches of the
 /// row are passed over. That is quick where neighbours in the row are neighbours in the plane, as
 /// along a contour. The row grows at its end only.
 class BoxLevels {
