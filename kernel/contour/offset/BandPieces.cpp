@@ -116,34 +116,6 @@ void appendBandPieces(GmCurve const& element, int source, int id, double d,
     });
 }
 
-bool splitsItself(GmCurve const& element, double d) {
-    // Within these bounds rounding moves the point in which a cap touches an offset by less than
-    // half the length tolerance, so that it is the joint; and caps that cross do so far from both
-    // half circles.
-    constexpr double kShortest = 0.01;
-    constexpr double kNearest = 0.01;
-    constexpr double kFarthest = 50.0;
-    constexpr double kLargestCoordinate = 1e4;
-    constexpr double kSkew = 1e-11;
-    // Next to an axis, lines are taken for vertical and angles of cuts for those of the axis.
-    constexpr double kNextToAxis = 2e-4;
-    auto const* const stretch = curveAs<GmStretch>(element);
-    if (stretch == nullptr) return true;
-    const PlainSegment segment = plainOf(*stretch);
-    const auto isCommon = [](Vec3 const& p) {
-        return std::fabs(p.x) < kLargestCoordinate && std::fabs(p.y) < kLargestCoordinate;
-    };
-    const auto isBesideAxis = [](double slope, double extent) {
-        return std::fabs(slope) <= kNextToAxis && !(std::fabs(extent) < kSkew);
-    };
-    const bool asItLies = !isBesideAxis(segment.dir.x, segment.ep.x - segment.sp.x) &&
-                          !isBesideAxis(segment.dir.y, segment.ep.y - segment.sp.y);
-    const bool common = isCommon(segment.sp) && isCommon(segment.ep) && std::fabs(d) > kNearest &&
-                        std::fabs(d) < kFarthest && segment.sp.z == segment.ep.z;
-    return !common || !asItLies || !(distance(segment.sp, segment.ep) > kShortest) ||
-           !(distance(segment.ep, footOn(segment, segment.ep)) < kSkew);
-}
-
 GmOffsetElement elementOf(Piece const& piece, GmCurve const& element, double d) {
     std::unique_ptr<GmCurve> curve;
     visitBandCurve(element, d, piece.role(),

@@ -22,10 +22,6 @@ std::vector<GmOffsetElement> bandPieces(GmCurve const& element, int source, int 
 void appendBandPieces(GmCurve const& element, int source, int id, double d,
                       std::vector<Piece>& pieces);
 
-/// May pieces of an element's own band split each other? False where they only touch at their
-/// joints, which is certain for segments of common sizes.
-bool splitsItself(GmCurve const& element, double d);
-
 /// The curve of a piece that splitting has left of a band.
 /// @param piece the piece
 /// @param element the source element of its band

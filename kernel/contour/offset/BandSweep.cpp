@@ -9,6 +9,7 @@
 #include "kernel/contour/offset/BandSweep.h"
 
 #include "kernel/contour/offset/BandPieces.h"
+#include "kernel/contour/offset/OwnBand.h"
 
 namespace gmkernel_detail {
 
@@ -20,7 +21,7 @@ void BandSweep::add(GmContElement const& record) {
     const bool spanGrew = advanceSpan(*record.pCurve);
     m_band.clear();
     appendBandPieces(*record.pCurve, m_index, static_cast<int>(record.lId), m_d, m_band);
-    const bool cutsOwnBand = splitsItself(*record.pCurve, m_d);
+    const bool cutsOwnBand = cutsItself(*record.pCurve, m_d);
     for (Piece const& piece : m_band)
         m_insertion.insert(piece, cutsOwnBand);
     m_removal.removeNearPieces(spanGrew);

@@ -11,19 +11,9 @@
 
 #include <algorithm>
 
+#include "kernel/contour/offset/OwnBand.h"
+
 namespace gmkernel_detail {
-
-namespace {
-
-/// Are the pieces of one band that does not split itself, and is nothing lost without their joint?
-/// Where a cap meets an offset at its start, the joint counts: the angle of a cut beside it may
-/// snap to that of the start, and then the order of both points decides.
-bool onlyTouch(Piece const& added, Piece const& old) {
-    if (old.source() != added.source()) return false;
-    return added.role() != PieceRole::kEndCap || old.role() == PieceRole::kStartCap;
-}
-
-}  // namespace
 
 void Insertion::insert(Piece const& added, bool cutsOwnBand) {
     m_cutsOwnBand = cutsOwnBand;
