@@ -6,6 +6,7 @@
 /// so that the direction lies on the seam of (-180, 180], a clockwise arc passes it when its start
 /// angle is the smaller one, a counter-clockwise arc when its end angle is.
 #include <algorithm>
+#include <utility>
 
 #include "gmkernel/GmArc.h"
 #include "gmkernel/GmRect.h"
@@ -48,6 +49,9 @@ CurveBox boundsOf(PlainArc const& arc) {
     if (crossesSeam(plusXOnSeam(s), plusXOnSeam(e), arc.sense)) box.right = arc.m.x + arc.r;
     if (crossesSeam(minusYOnSeam(s), minusYOnSeam(e), arc.sense)) box.bottom = arc.m.y - arc.r;
     if (crossesSeam(plusYOnSeam(s), plusYOnSeam(e), arc.sense)) box.top = arc.m.y + arc.r;
+    // Ends that lie beyond the circle may be beyond the point that the sweep reaches.
+    if (box.right < box.left) std::swap(box.left, box.right);
+    if (box.top < box.bottom) std::swap(box.bottom, box.top);
     return box;
 }
 

@@ -48,8 +48,9 @@ inline CurveBox boxOf(PlanePoint p) {
 /// full circle.
 CurveBox boundsOf(PlainArc const& arc);
 
-/// The box of every point that the membership tests of a segment or an arc can accept: its bounding
-/// rectangle, grown by twice the loosest membership tolerance. Curves whose boxes are apart have no
+/// The box of every point that the membership tests of a segment or an arc can accept, but for ends
+/// of an arc that were moved off its circle: its bounding rectangle, grown by twice the loosest
+/// membership tolerance. Curves whose boxes are apart have no
 /// intersection.
 CurveBox reachOf(GmCurve const& curve);
 CurveBox reachOf(PlainSegment const& segment);

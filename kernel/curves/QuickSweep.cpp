@@ -19,7 +19,7 @@ namespace gmkernel_detail {
 namespace {
 
 /// Beside kEndMargin on the circle, a margin for directions: those next to an axis are taken for
-/// the axis, within a tenth of this.
+/// the axis, within a fifth of this.
 constexpr double kDirectionMargin = 5e-4;
 
 /// By how much the directions of two ways to a halving point may differ, in radians, several times

@@ -8,7 +8,7 @@
 
 namespace gmkernel_detail {
 
-/// Directions next to the end of a sweep are not decided: what is ten times the tolerance within
+/// Directions next to the end of a sweep are not decided: what is three times the tolerance within
 /// which points are equal, in length units.
 constexpr double kEndMargin = 3e-4;
 

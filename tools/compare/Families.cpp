@@ -21,6 +21,8 @@ std::vector<Family> const& Families() {
         {"offsets", 12000, kFewer, AskOffsets},
         {"plates", 10000, kFewer, AskPlates},
         {"faulty", 8000, kFewer, AskFaulty},
+        {"torn", 6000, kFewer, AskTorn},
+        {"axes", 6000, kFewer, AskAlongAxes},
         {"large", 1000, 20, AskLarge},
         {"varparallels", 8000, kFewer, AskVarParallels},
         {"melts", 7000, kFewer, AskMelts},

@@ -23,6 +23,8 @@ void AskLeads(Dice& dice, Answer& answer);
 void AskOffsets(Dice& dice, Answer& answer);
 void AskPlates(Dice& dice, Answer& answer);
 void AskFaulty(Dice& dice, Answer& answer);
+void AskTorn(Dice& dice, Answer& answer);
+void AskAlongAxes(Dice& dice, Answer& answer);
 void AskLarge(Dice& dice, Answer& answer);
 void AskVarParallels(Dice& dice, Answer& answer);
 void AskMelts(Dice& dice, Answer& answer);

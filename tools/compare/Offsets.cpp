@@ -1,4 +1,6 @@
 // SPDX-License-Identifier: MIT
+#include <cmath>
+
 #include "Families.h"
 #include "Shapes.h"
 
@@ -90,6 +92,42 @@ void AskFaulty(Dice& dice, Answer& answer) {
         Spoil(dice, corners);
     GmContour contour = Chain(dice, corners, !dice.Once(4));
     AskAllOffsets(dice, answer, contour);
+}
+
+/// Joints moved off the circles of their arcs, by up to more than the arcs are wide.
+void AskTorn(Dice& dice, Answer& answer) {
+    GmContour contour = dice.Once(2) ? Chain(dice, Plate(dice), true) : SoundContour(dice);
+    for (int i = 1; i < contour.ElementCount(); ++i) {
+        if (dice.Once(2)) continue;
+        const double far = std::pow(10.0, dice.In(-4.0, 0.5));
+        const GmPoint p(contour.GetElement(i)->SP() +
+                        GmVec(dice.In(-far, far), dice.In(-far, far), 0));
+        contour.GetElement(i - 1)->SetEP(p);
+        contour.GetElement(i)->SetSP(p);
+    }
+    AskAllOffsets(dice, answer, contour);
+}
+
+/// Segments to and fro along an axis, on it or beside it by as little as 1e-9, where angles and
+/// lines are taken for those of the axis.
+void AskAlongAxes(Dice& dice, Answer& answer) {
+    const double axis = dice.Below(4) * std::acos(0.0);
+    GmContour contour;
+    GmPoint at = dice.Once(4) ? dice.AnyPoint() : GmPoint(0, 0);
+    for (int i = 3 + dice.Below(6); i > 0; --i) {
+        const double beside = dice.Once(2) ? 0.0 : std::pow(10.0, dice.In(-9.0, -4.0));
+        const double turn = i > 1 ? beside : 1.0;
+        const double back = dice.Once(3) ? std::acos(-1.0) : 0.0;
+        const GmAngle angle(axis + back + (dice.Once(2) ? turn : -turn), true);
+        const double length = 6.0 * std::pow(10.0, dice.In(-2.0, 0.0));
+        const GmPoint to(at + length * GmVec(GmDir(angle)));
+        contour.AddElement(GmStretch(at, to), false, i);
+        at = to;
+    }
+    answer.Add("contour", AsCurve(contour));
+    const double d = std::pow(10.0, dice.In(-1.5, 1.5));
+    AskOffset(answer, contour, d, kUnboundedSpan, true);
+    AskOffset(answer, contour, -d, kUnboundedSpan, true);
 }
 
 void AskLarge(Dice& dice, Answer& answer) {

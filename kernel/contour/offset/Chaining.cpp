@@ -102,7 +102,9 @@ void Chaining::growForward(Numbers& chain) {
 }
 
 bool Chaining::startsAt(std::size_t number, Vec3 const& p) const {
-    return !m_taken[number] && distance(startOf(curve(number)), p) < jointGap();
+    // The start of an arc may lie so far off its circle that it is outside the box.
+    return !m_taken[number] && boxOf(planePoint(p)).overlaps(m_pieces[number]->reach()) &&
+           distance(startOf(curve(number)), p) < jointGap();
 }
 
 /// The pieces left that start at a point, in the order of the list.

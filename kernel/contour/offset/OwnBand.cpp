@@ -6,12 +6,14 @@
 /// that turn their backs to each other: where their circles cross, they are not. A cap and a
 /// parallel touch at their joint, where nothing is split, since it is an end of both.
 ///
-/// Computed, a tangent point lies beside the joint: by the root of twice the radius times the
-/// rounding of the distance between line and centre. The bounds below keep it within half of the
-/// tolerance of points. They leave out what is bent or tilted by the tolerances themselves:
-/// segments whose direction is not quite that of their ends, lines so near to the direction of y
-/// that they are taken for vertical, and caps that end so near to the direction of an axis that the
-/// angle of a cut beside the joint snaps to the axis while that of the joint does not.
+/// Computed, the tangent point lies a little beside the joint, or it comes out as two points on
+/// either side: then the one is on the parallel but before the cap, the other on the cap but beyond
+/// the parallel. That holds while the ends of the cap are told apart from other directions. So the
+/// bounds below leave out what is bent or tilted by the tolerances themselves: segments whose
+/// direction is not quite that of their ends, lines so near to the direction of y that they are
+/// taken for vertical, and caps that end so near to the direction of an axis that the angle of a
+/// cut beside the joint snaps to the axis while that of the joint does not; and sizes at which
+/// rounding comes near to the tolerances.
 ///
 /// One joint counts nevertheless: that of an end cap with the parallel before it. A cut next to it
 /// may have the same angle, and then the order of both points decides where the cap is split.

@@ -71,7 +71,7 @@ void QuickDistance::take(PlainArc const& arc) {
 std::optional<bool> QuickDistance::isNearer(QuickPoint const& point, double threshold) const {
     const PlanePoint p = point.p;
     if (m_kind == Kind::kUnknown) return std::nullopt;
-    const std::optional<double> distance = m_kind == Kind::kArc ? toArc(p) : toSegment(p);
+    const std::optional<double> distance = m_kind == Kind::kArc ? toArc(point) : toSegment(p);
     if (!distance) return std::nullopt;
     const double slack = point.error + kSlack + kRelativeSlack * (m_size + size(p));
     if (*distance < threshold - slack) return true;
@@ -89,10 +89,13 @@ std::optional<double> QuickDistance::toSegment(PlanePoint p) const {
     return std::nullopt;
 }
 
-std::optional<double> QuickDistance::toArc(PlanePoint p) const {
+std::optional<double> QuickDistance::toArc(QuickPoint const& point) const {
+    // An error of the point must not turn its direction by more than a part of the margins there.
+    constexpr double kLargestTurn = 1e-5;
+    const PlanePoint p = point.p;
     const PlanePoint radial = p - m_centre;
     const double fromCentre = length(radial);
-    if (!(fromCentre > kEndMargin)) return std::nullopt;
+    if (!(fromCentre > kEndMargin && point.error < kLargestTurn * fromCentre)) return std::nullopt;
     const PlanePoint direction{radial.x / fromCentre, radial.y / fromCentre};
     if (isBesideEnd({m_centre.x + m_radius * direction.x, m_centre.y + m_radius * direction.y})) {
         return std::nullopt;

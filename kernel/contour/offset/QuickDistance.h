@@ -28,7 +28,7 @@ private:
     void take(PlainSegment const& segment);
     void take(PlainArc const& arc);
     std::optional<double> toSegment(PlanePoint p) const;
-    std::optional<double> toArc(PlanePoint p) const;
+    std::optional<double> toArc(QuickPoint const& point) const;
     bool isBesideEnd(PlanePoint p) const;
     double toEnds(PlanePoint p) const;
 
