@@ -1,0 +1,121 @@
+// SPDX-License-Identifier: MIT
+/// @file
+/// Crossings of lines and circles in one form.
+///
+/// With G as in Carrier.cpp, written from a point of the flatter carrier, the combination
+/// G_flat - (k_flat / k_bent) G_bent has no square in it: it is a line through both crossings, the
+/// flatter carrier itself when that is a line. That line meets the more bent carrier where a square
+/// equation says; its roots are taken without cancellation, so that one crossing may be near and
+/// the other as far away as it likes. Two lines have a linear equation.
+///
+/// Each crossing is then improved by a step of Newton's method on both forms, each written from the
+/// point by which its own carrier is given: it takes out what the common origin cost in digits.
+#include "region/plane/Crossing.h"
+
+#include <cmath>
+
+namespace gmregion {
+
+namespace {
+
+/// The form of a carrier written from another origin: value + gradient x - k/2 x x.
+struct Form {
+    double value;
+    Vec2 gradient;
+    double curvature;
+};
+
+Form formFrom(const Carrier& c, Vec2 origin) {
+    const Side side = sideOf(c, origin);
+    return {side.value, side.gradient, c.curvature};
+}
+
+/// One step towards the common zero of both sides; the point itself where they run alongside.
+Vec2 improved(const Carrier& a, const Carrier& b, Vec2 p) {
+    const Side sideA = sideOf(a, p);
+    const Side sideB = sideOf(b, p);
+    const double determinant = cross(sideA.gradient, sideB.gradient);
+    const Vec2 step{sideA.value * sideB.gradient.y - sideB.value * sideA.gradient.y,
+                    sideB.value * sideA.gradient.x - sideA.value * sideB.gradient.x};
+    const Vec2 better = p - (1.0 / determinant) * step;
+    return std::isfinite(better.x) && std::isfinite(better.y) ? better : p;
+}
+
+/// Where the line through both crossings meets the more bent carrier.
+CrossingPoints onCommonLine(const Form& flat, const Form& bent) {
+    CrossingPoints points;
+    const double share = flat.curvature / bent.curvature;
+    const Vec2 normal = flat.gradient - share * bent.gradient;
+    const double squared = dot(normal, normal);
+    if (!(squared > 0.0)) return points;
+    const Vec2 foot = ((share * bent.value - flat.value) / squared) * normal;
+    const Vec2 along = (1.0 / std::sqrt(squared)) * Vec2{-normal.y, normal.x};
+
+    // bent(foot + t along) = c + b t - k/2 t^2
+    const double k = bent.curvature;
+    const double c = bent.value + dot(bent.gradient, foot) - 0.5 * k * dot(foot, foot);
+    const double b = dot(bent.gradient - k * foot, along);
+    const double discriminant = b * b + 2.0 * k * c;
+    if (!(discriminant > 0.0)) return points;
+    const double root = std::sqrt(discriminant);
+    const double q = b < 0.0 ? b - root : b + root;
+    points.add(foot + (-2.0 * c / q) * along);
+    points.add(foot + (q / k) * along);
+    return points;
+}
+
+CrossingPoints ofLines(const Form& a, const Form& b) {
+    CrossingPoints points;
+    const double determinant = cross(a.gradient, b.gradient);
+    if (determinant == 0.0) return points;
+    points.add((1.0 / determinant) * Vec2{b.value * a.gradient.y - a.value * b.gradient.y,
+                                          a.value * b.gradient.x - b.value * a.gradient.x});
+    return points;
+}
+
+}  // namespace
+
+CrossingPoints crossings(const Carrier& a, const Carrier& b) {
+    const bool aIsFlatter = std::fabs(a.curvature) <= std::fabs(b.curvature);
+    const Carrier& flat = aIsFlatter ? a : b;
+    const Carrier& bent = aIsFlatter ? b : a;
+    const Vec2 origin = flat.at;
+    const Form flatForm = formFrom(flat, origin);
+    const Form bentForm = formFrom(bent, origin);
+    CrossingPoints points;
+    const CrossingPoints rough =
+        bent.curvature == 0.0 ? ofLines(flatForm, bentForm) : onCommonLine(flatForm, bentForm);
+    for (const Vec2 p : rough) {
+        const Vec2 point = improved(flat, bent, origin + p);
+        if (std::isfinite(point.x) && std::isfinite(point.y)) points.add(point);
+    }
+    return points;
+}
+
+double placeOn(const Element& e, Vec2 p) {
+    const Vec2 chord = e.ep - e.sp;
+    const Vec2 fromStart = p - e.sp;
+    const Vec2 toEnd = e.ep - p;
+    const double a = std::sqrt(dot(fromStart, fromStart));
+    const double b = std::sqrt(dot(toEnd, toEnd));
+    const double place = a + b > 0.0 ? a / (a + b) : 0.0;
+    // Of the circle's points beside the chord, those beyond the centre are not on the arc, which
+    // turns by half a turn at the most. The centre lies at the height L (1 - b^2) / (4 b).
+    const double heights = 4.0 * e.bulge * cross(chord, fromStart);
+    const bool beyond = heights > dot(chord, chord) * (1.0 - e.bulge) * (1.0 + e.bulge);
+    if (dot(chord, fromStart) < 0.0 || (beyond && a < b)) return -place;
+    if (dot(chord, toEnd) < 0.0 || beyond) return 2.0 - place;
+    return place;
+}
+
+CrossingPoints crossings(const Element& a, const Element& b) {
+    CrossingPoints points;
+    for (const Vec2 p : crossings(carrierOf(a), carrierOf(b))) {
+        const double onA = placeOn(a, p);
+        const double onB = placeOn(b, p);
+        if (onA >= 0.0 && onA <= 1.0 && onB >= 0.0 && onB <= 1.0) points.add(p);
+    }
+    return points;
+}
+
+}  // namespace gmregion

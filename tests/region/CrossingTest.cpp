@@ -1,0 +1,160 @@
+// SPDX-License-Identifier: MIT
+#include "region/plane/Crossing.h"
+
+#include <gtest/gtest.h>
+
+#include <algorithm>
+#include <cmath>
+#include <limits>
+#include <random>
+
+namespace {
+
+using namespace gmregion;
+
+constexpr double kEpsilon = std::numeric_limits<double>::epsilon();
+
+class Draw {
+public:
+    explicit Draw(unsigned seed) : m_engine(seed) {}
+
+    double between(double low, double high) {
+        return low + (high - low) * (double(m_engine()) / double(std::mt19937::max()));
+    }
+    double power(double low, double high) { return std::pow(10.0, between(low, high)); }
+    bool chance(unsigned n) { return m_engine() % n == 0; }
+
+private:
+    std::mt19937 m_engine;
+};
+
+/// The point that is reached from x along a circle, in extended digits.
+struct Reached {
+    long double x;
+    long double y;
+};
+Reached along(Vec2 x, long double direction, long double curvature, long double length) {
+    const long double half = 0.5L * curvature * length;
+    const long double chord = std::fabs(half) < 1e-9L ? length : length * std::sin(half) / half;
+    return {x.x + chord * std::cos(direction + half), x.y + chord * std::sin(direction + half)};
+}
+
+/// An element through a point, in a direction, from flat to nearly half a turn.
+struct Through {
+    Element element;
+    double size;  ///< what the rounding of its points goes by
+};
+Through elementThrough(Draw& draw, Vec2 x, double direction) {
+    const double before = draw.power(-3.0, 2.0);
+    const double after = draw.power(-3.0, 2.0);
+    const double turn = draw.chance(4) ? 0.0 : draw.power(-12.0, 0.45);
+    const double curvature = (draw.chance(2) ? turn : -turn) / (before + after);
+    const Reached start = along(x, direction, curvature, -before);
+    const Reached end = along(x, direction, curvature, after);
+    const long double sweep = static_cast<long double>(curvature) * (before + after);
+    Element e{{double(start.x), double(start.y)}, {double(end.x), double(end.y)}, 0.0};
+    e.bulge = double(std::tan(0.25L * sweep));
+    return {e, before + after + std::fabs(x.x) + std::fabs(x.y)};
+}
+
+double distanceTo(const CrossingPoints& points, Vec2 x) {
+    double nearest = std::numeric_limits<double>::infinity();
+    for (const Vec2 p : points)
+        nearest = std::min(nearest, std::sqrt(dot(p - x, p - x)));
+    return nearest;
+}
+
+}  // namespace
+
+TEST(Crossing, IsFoundWhereTheElementsWereMadeToCross) {
+    Draw draw(3);
+    int compared = 0;
+    for (int i = 0; i < 100000; ++i) {
+        const double far = draw.chance(3) ? 0.0 : draw.power(0.0, 3.0);
+        const Vec2 x{draw.between(-far, far), draw.between(-far, far)};
+        const double direction = draw.between(-kPi, kPi);
+        const double angle = draw.chance(3) ? draw.power(-5.0, 0.0) : draw.between(0.1, 3.0);
+        const Through a = elementThrough(draw, x, direction);
+        const Through b = elementThrough(draw, x, direction + angle);
+        const double size = std::max(a.size, b.size);
+        // The ends are rounded: that turns short elements by more, and may let elements miss each
+        // other that cross at a small angle and bend apart soon.
+        const double shortest = std::min({distance(a.element.sp, x), distance(a.element.ep, x),
+                                          distance(b.element.sp, x), distance(b.element.ep, x)});
+        const double shift = kEpsilon * size * size / shortest;
+        const double bend =
+            std::fabs(carrierOf(a.element).curvature - carrierOf(b.element).curvature);
+        const double sine = std::sin(angle);
+        if (shortest < 1e-2 || sine * sine < 1000.0 * shift * bend) continue;
+        ++compared;
+        const double bound = 200.0 * shift / sine;
+        const CrossingPoints found = crossings(a.element, b.element);
+        const CrossingPoints swapped = crossings(b.element, a.element);
+        ASSERT_LT(distanceTo(found, x), bound) << i;
+        ASSERT_LT(distanceTo(swapped, x), bound) << i;
+        for (const Vec2 p : found) {
+            ASSERT_LT(std::fabs(signedDistance(carrierOf(a.element), p)), 32 * kEpsilon * size)
+                << i;
+            ASSERT_LT(std::fabs(signedDistance(carrierOf(b.element), p)), 32 * kEpsilon * size)
+                << i;
+        }
+    }
+}
+
+TEST(Crossing, CountsWhatLiesOnBothElements) {
+    const Element line{{-2, 0.5}, {2, 0.5}, 0};
+    const Element upper{{1, 0}, {-1, 0}, 1};  // the half circle above
+    const Element lower{{-1, 0}, {1, 0}, 1};
+    EXPECT_EQ(crossings(line, upper).size(), 2u);
+    EXPECT_EQ(crossings(line, lower).size(), 0u);
+    EXPECT_EQ(crossings(Element{{-2, 1.5}, {2, 1.5}, 0}, upper).size(), 0u) << "beside it";
+    EXPECT_EQ(crossings(Element{{-2, 1}, {2, 1}, 0}, upper).size(), 0u) << "touches";
+    EXPECT_EQ(crossings(Element{{0, 0.5}, {2, 0.5}, 0}, upper).size(), 1u);
+    EXPECT_EQ(crossings(upper, Element{{1, 0}, {-1, 0}, 1}).size(), 0u) << "itself";
+    EXPECT_EQ(crossings(upper, Element{{3, 0}, {-3, 0}, 1}).size(), 0u) << "concentric";
+    EXPECT_EQ(crossings(line, Element{{0, 0.5}, {5, 0.5}, 0}).size(), 0u) << "on one line";
+    EXPECT_EQ(crossings(upper, Element{{2, 0}, {0, 0}, 1}).size(), 1u) << "of two circles";
+}
+
+TEST(Carrier, MeasuresAsTheElementDoes) {
+    Draw draw(4);
+    for (int i = 0; i < 20000; ++i) {
+        const Vec2 middle{draw.between(-10, 10), draw.between(-10, 10)};
+        const Through through = elementThrough(draw, middle, draw.between(-kPi, kPi));
+        const Carrier c = carrierOf(through.element);
+        const double bound = 64.0 * kEpsilon * through.size;
+        EXPECT_LT(std::fabs(signedDistance(c, through.element.ep)), bound) << i;
+        EXPECT_LT(std::fabs(signedDistance(c, middle)), bound) << i;
+
+        const double d = draw.between(-1.0, 1.0) * std::min(1.0, 0.5 / std::fabs(c.curvature));
+        const auto beside = parallel(c, d);
+        ASSERT_TRUE(beside);
+        const Vec2 foot = footOn(*beside, middle);
+        EXPECT_NEAR(signedDistance(*beside, foot), 0.0, bound) << i;
+        EXPECT_NEAR(signedDistance(c, foot), -d, bound) << i << ": a positive d lies to the right";
+        EXPECT_NEAR(distance(foot, middle), std::fabs(d), bound) << i;
+    }
+    const Carrier circle = carrierOf({{1, 0}, {-1, 0}, 1});
+    EXPECT_FALSE(parallel(circle, -1.0)) << "shrunk to its centre";
+    EXPECT_TRUE(parallel(circle, -0.999));
+    EXPECT_EQ(footOn(circle, {0, 0}), circle.at);
+}
+
+TEST(Crossing, PlacesGrowAlongAnElementAndBeyondItsEnds) {
+    Draw draw(5);
+    for (int i = 0; i < 5000; ++i) {
+        const Through through = elementThrough(draw, {1, 2}, draw.between(-kPi, kPi));
+        const Element& e = through.element;
+        if (distance(e.sp, e.ep) < 0.1) continue;
+        double last = -1.0;
+        for (int k = -2; k <= 12; ++k) {
+            if (k < 0 && std::fabs(sweep(e)) > 2.0) continue;  // the rest of the circle is short
+            if (k > 10 && std::fabs(sweep(e)) > 2.0) continue;
+            const double place = placeOn(e, pointAt(e, 0.1 * k));
+            EXPECT_GT(place, last) << i << " " << k;
+            EXPECT_EQ(place < -1e-9, k < 0);
+            EXPECT_EQ(place > 1 + 1e-9, k > 10);
+            last = place;
+        }
+    }
+}
