@@ -1,0 +1,95 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <algorithm>
+#include <cstddef>
+#include <vector>
+
+#include "region/model/Box.h"
+
+namespace gmregion {
+
+/// Boxes in a row, for finding those that overlap a box or each other.
+///
+/// Level upon level, every eight neighbours have a box about them, in one array without sorting.
+/// That is quick where neighbours in the row are neighbours in the plane, as along a path. Memory
+/// is kept from one row to the next.
+class BoxRow {
+public:
+    /// Takes the boxes of a row in place of those before. Cost: linear.
+    void assign(const std::vector<Box>& boxes);
+
+    std::size_t size() const { return m_ends.empty() ? 0 : m_ends.front(); }
+    const Box& operator[](std::size_t index) const { return m_boxes[index]; }
+
+    /// Calls visit(index) for the boxes that overlap a box, in the order of the row.
+    template <class Visit>
+    void visitOverlapping(const Box& box, const Visit& visit) const {
+        if (size() > 0) visitUnder(top(), 0, box, visit);
+    }
+
+    /// Calls visit(i, j) once for every two boxes of the row that overlap, i < j, in an order that
+    /// depends on the boxes alone. Cost: the number of boxes, and of pairs near each other.
+    template <class Visit>
+    void visitPairs(const Visit& visit) const {
+        if (size() > 0) pairsUnder(top(), 0, visit);
+    }
+
+private:
+    static constexpr std::size_t kBits = 3;  ///< two to that power have a box about them
+
+    std::size_t top() const { return m_ends.size() - 1; }
+    std::size_t beginOf(std::size_t level) const { return level == 0 ? 0 : m_ends[level - 1]; }
+    std::size_t countOf(std::size_t level) const { return m_ends[level] - beginOf(level); }
+    const Box& boxOf(std::size_t level, std::size_t index) const {
+        return m_boxes[beginOf(level) + index];
+    }
+    /// Behind the last of those that a box of a level is about.
+    std::size_t endUnder(std::size_t level, std::size_t index) const {
+        return std::min((index + 1) << kBits, countOf(level - 1));
+    }
+
+    template <class Visit>
+    void visitUnder(std::size_t level, std::size_t index, const Box& box,
+                    const Visit& visit) const {
+        if (!boxOf(level, index).overlaps(box)) return;
+        if (level == 0) {
+            visit(index);
+            return;
+        }
+        for (std::size_t i = index << kBits; i < endUnder(level, index); ++i)
+            visitUnder(level - 1, i, box, visit);
+    }
+
+    /// The pairs of which both are under one box.
+    template <class Visit>
+    void pairsUnder(std::size_t level, std::size_t index, const Visit& visit) const {
+        if (level == 0) return;
+        const std::size_t end = endUnder(level, index);
+        for (std::size_t i = index << kBits; i < end; ++i) {
+            pairsUnder(level - 1, i, visit);
+            for (std::size_t j = i + 1; j < end; ++j)
+                pairsBetween(level - 1, i, j, visit);
+        }
+    }
+
+    /// The pairs of which one is under the one box and the other under the other, of one level.
+    template <class Visit>
+    void pairsBetween(std::size_t level, std::size_t a, std::size_t b, const Visit& visit) const {
+        if (!boxOf(level, a).overlaps(boxOf(level, b))) return;
+        if (level == 0) {
+            visit(a, b);
+            return;
+        }
+        for (std::size_t i = a << kBits; i < endUnder(level, a); ++i) {
+            if (!boxOf(level - 1, i).overlaps(boxOf(level, b))) continue;
+            for (std::size_t j = b << kBits; j < endUnder(level, b); ++j)
+                pairsBetween(level - 1, i, j, visit);
+        }
+    }
+
+    std::vector<Box> m_boxes;         ///< the row, then level after level what stands over it
+    std::vector<std::size_t> m_ends;  ///< behind the last box of each level
+};
+
+}  // namespace gmregion

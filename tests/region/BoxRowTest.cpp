@@ -1,0 +1,92 @@
+// SPDX-License-Identifier: MIT
+#include "region/search/BoxRow.h"
+
+#include <gtest/gtest.h>
+
+#include <cmath>
+#include <random>
+#include <set>
+#include <utility>
+#include <vector>
+
+#include "region/plane/ElementBox.h"
+
+namespace {
+
+using namespace gmregion;
+using Pairs = std::set<std::pair<std::size_t, std::size_t>>;
+
+double unit(std::mt19937& engine) {
+    return double(engine()) / double(std::mt19937::max());
+}
+
+/// The boxes of a walk that comes back to itself now and then.
+std::vector<Box> boxesOfAWalk(std::mt19937& engine, std::size_t count) {
+    std::vector<Box> boxes;
+    Vec2 at{0, 0};
+    for (std::size_t i = 0; i < count; ++i) {
+        const Vec2 to = at + Vec2{2 * unit(engine) - 1, 2 * unit(engine) - 0.9};
+        Box box;
+        box.include(at);
+        box.include(to);
+        boxes.push_back(box);
+        at = i % 40 == 39 ? Vec2{0, 0} : to;
+    }
+    return boxes;
+}
+
+}  // namespace
+
+TEST(BoxRow, VisitsEveryPairAndEveryBoxThatOverlapsOnce) {
+    std::mt19937 engine(2);
+    BoxRow row;
+    for (const std::size_t count : {0u, 1u, 2u, 7u, 8u, 9u, 64u, 65u, 300u, 513u}) {
+        const std::vector<Box> boxes = boxesOfAWalk(engine, count);
+        row.assign(boxes);
+        ASSERT_EQ(row.size(), count);
+        Pairs expected;
+        for (std::size_t i = 0; i < count; ++i) {
+            for (std::size_t j = i + 1; j < count; ++j) {
+                if (boxes[i].overlaps(boxes[j])) expected.emplace(i, j);
+            }
+        }
+        Pairs found;
+        std::size_t visits = 0;
+        row.visitPairs([&](std::size_t i, std::size_t j) {
+            found.emplace(i, j);
+            ++visits;
+        });
+        EXPECT_EQ(found, expected) << count;
+        EXPECT_EQ(visits, expected.size()) << count;
+
+        const Box probe = Box{{0, 0}, {1, 2}};
+        std::vector<std::size_t> hit;
+        row.visitOverlapping(probe, [&](std::size_t i) { hit.push_back(i); });
+        std::vector<std::size_t> expectedHits;
+        for (std::size_t i = 0; i < count; ++i) {
+            if (boxes[i].overlaps(probe)) expectedHits.push_back(i);
+        }
+        EXPECT_EQ(hit, expectedHits) << "in the order of the row";
+    }
+}
+
+TEST(ElementBox, HoldsTheElementAndLittleMore) {
+    std::mt19937 engine(3);
+    for (int i = 0; i < 20000; ++i) {
+        Element e{{unit(engine), unit(engine)}, {unit(engine), unit(engine)}, 0};
+        if (engine() % 4 != 0) e.bulge = std::pow(10.0, -9.0 * unit(engine));
+        if (engine() % 2 == 0) e.bulge = -e.bulge;
+        const Box box = boxAbout(e);
+        const Box exact = boundingBox(e);
+        const double size = length(e.ep - e.sp) + 1.0;
+        for (int k = 0; k <= 20; ++k) {
+            const Vec2 p = pointAt(e, 0.05 * k);
+            EXPECT_TRUE(box.grown(1e-14 * size).holds(Box{p, p})) << i << " " << e.bulge;
+        }
+        if (std::fabs(e.bulge) >= 0.1) {
+            EXPECT_TRUE(exact.grown(1e-13 * size).holds(box)) << i << " " << e.bulge;
+        }
+        const double height = 0.5 * std::fabs(e.bulge) * length(e.ep - e.sp);
+        EXPECT_LE(box.size().x, std::fabs(e.ep.x - e.sp.x) + 2.01 * height) << i;
+    }
+}
