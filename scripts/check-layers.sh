@@ -17,7 +17,7 @@ contour='GmApprDepData|GmContour|GmContElement|KxArray'
 # The floor of every room, by the longest path that fits.
 declare -A floors=(
     [kernel/values]=1 [kernel/curves]=2 [kernel/contour]=3
-    [region/model]=1 [region/plane]=2 [region/search]=2 [region/bridge]=4
+    [region/model]=1 [region/plane]=2 [region/search]=2 [region/nodes]=3 [region/bridge]=4
     [region/offset]=5 [region/corners]=5 [region/boolean]=5
     [drawing]=6 [drawing/contours]=7 [drawing/dxf]=7 [drawing/svg]=8 [drawing/files]=9
     [machining/moves]=10 [machining/runs]=10 [machining/obstacles]=10 [machining/order]=10
