@@ -8,11 +8,15 @@
 /// equation says; its roots are taken without cancellation, so that one crossing may be near and
 /// the other as far away as it likes. Two lines have a linear equation.
 ///
+/// The same line is square to the line of centres, and passes between carriers that miss each
+/// other: where it crosses the line of centres they come nearest.
+///
 /// Each crossing is then improved by a step of Newton's method on both forms, each written from the
 /// point by which its own carrier is given: it takes out what the common origin cost in digits.
 #include "region/plane/Crossing.h"
 
 #include <cmath>
+#include <optional>
 
 namespace gmregion {
 
@@ -41,26 +45,39 @@ Vec2 improved(const Carrier& a, const Carrier& b, Vec2 p) {
     return std::isfinite(better.x) && std::isfinite(better.y) ? better : p;
 }
 
-/// Where the line through both crossings meets the more bent carrier.
-CrossingPoints onCommonLine(const Form& flat, const Form& bent) {
-    CrossingPoints points;
+/// The line through both crossings of two carriers, and where along it the more bent one is: in the
+/// roots of c + b t - k/2 t t.
+struct CommonLine {
+    Vec2 foot;
+    Vec2 along;
+    double c;
+    double b;
+    double k;
+};
+
+std::optional<CommonLine> commonLine(const Form& flat, const Form& bent) {
     const double share = flat.curvature / bent.curvature;
     const Vec2 normal = flat.gradient - share * bent.gradient;
     const double squared = dot(normal, normal);
-    if (!(squared > 0.0)) return points;
+    if (!(squared > 0.0)) return std::nullopt;
     const Vec2 foot = ((share * bent.value - flat.value) / squared) * normal;
     const Vec2 along = (1.0 / std::sqrt(squared)) * Vec2{-normal.y, normal.x};
-
-    // bent(foot + t along) = c + b t - k/2 t^2
     const double k = bent.curvature;
-    const double c = bent.value + dot(bent.gradient, foot) - 0.5 * k * dot(foot, foot);
-    const double b = dot(bent.gradient - k * foot, along);
-    const double discriminant = b * b + 2.0 * k * c;
+    return CommonLine{foot, along,
+                      bent.value + dot(bent.gradient, foot) - 0.5 * k * dot(foot, foot),
+                      dot(bent.gradient - k * foot, along), k};
+}
+
+CrossingPoints onCommonLine(const Form& flat, const Form& bent) {
+    CrossingPoints points;
+    const std::optional<CommonLine> line = commonLine(flat, bent);
+    if (!line) return points;
+    const double discriminant = line->b * line->b + 2.0 * line->k * line->c;
     if (!(discriminant > 0.0)) return points;
     const double root = std::sqrt(discriminant);
-    const double q = b < 0.0 ? b - root : b + root;
-    points.add(foot + (-2.0 * c / q) * along);
-    points.add(foot + (q / k) * along);
+    const double q = line->b < 0.0 ? line->b - root : line->b + root;
+    points.add(line->foot + (-2.0 * line->c / q) * line->along);
+    points.add(line->foot + (q / line->k) * line->along);
     return points;
 }
 
@@ -73,12 +90,24 @@ CrossingPoints ofLines(const Form& a, const Form& b) {
     return points;
 }
 
+bool isFlatter(const Carrier& a, const Carrier& b) {
+    return std::fabs(a.curvature) <= std::fabs(b.curvature);
+}
+
 }  // namespace
 
+std::optional<Vec2> nearestApproach(const Carrier& a, const Carrier& b) {
+    const Carrier& flat = isFlatter(a, b) ? a : b;
+    const Carrier& bent = isFlatter(a, b) ? b : a;
+    if (bent.curvature == 0.0) return std::nullopt;
+    const auto line = commonLine(formFrom(flat, flat.at), formFrom(bent, flat.at));
+    if (!line) return std::nullopt;
+    return flat.at + line->foot + (line->b / line->k) * line->along;
+}
+
 CrossingPoints crossings(const Carrier& a, const Carrier& b) {
-    const bool aIsFlatter = std::fabs(a.curvature) <= std::fabs(b.curvature);
-    const Carrier& flat = aIsFlatter ? a : b;
-    const Carrier& bent = aIsFlatter ? b : a;
+    const Carrier& flat = isFlatter(a, b) ? a : b;
+    const Carrier& bent = isFlatter(a, b) ? b : a;
     const Vec2 origin = flat.at;
     const Form flatForm = formFrom(flat, origin);
     const Form bentForm = formFrom(bent, origin);

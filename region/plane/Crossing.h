@@ -3,6 +3,7 @@
 
 #include <array>
 #include <cstddef>
+#include <optional>
 
 #include "region/plane/Carrier.h"
 
@@ -26,6 +27,10 @@ private:
 /// place of its distance from the points by which the carriers are given, divided by the sine of
 /// the angle between them. Cost: constant.
 CrossingPoints crossings(const Carrier& a, const Carrier& b);
+
+/// The point between two carriers that do not cross, or hardly do, where they come nearest to each
+/// other; nothing for two lines and for concentric circles. Cost: constant.
+std::optional<Vec2> nearestApproach(const Carrier& a, const Carrier& b);
 
 /// Where a point of an element's carrier lies along the element: 0 at the start, 1 at the end,
 /// growing between them; below 0 and above 1 beside the ends, for the rest of a circle, too. The
