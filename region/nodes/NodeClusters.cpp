@@ -52,11 +52,13 @@ std::size_t NodeClusters::findNode(Vec2 p) const {
     const double column = std::floor(p.x / m_tolerance);
     const double row = std::floor(p.y / m_tolerance);
     std::size_t first = kNone;
-    for (int cell = 0; cell < 9; ++cell) {
-        const std::size_t slot = slotOf(column + cell % 3 - 1, row + cell / 3 - 1);
-        for (std::size_t node = m_latest[slot]; node != kNone; node = m_before[node]) {
-            const Vec2 away = m_nodes[node] - p;
-            if (dot(away, away) <= m_tolerance * m_tolerance) first = std::min(first, node);
+    for (const double aside : {-1.0, 0.0, 1.0}) {
+        for (const double above : {-1.0, 0.0, 1.0}) {
+            const std::size_t slot = slotOf(column + aside, row + above);
+            for (std::size_t node = m_latest[slot]; node != kNone; node = m_before[node]) {
+                const Vec2 away = m_nodes[node] - p;
+                if (dot(away, away) <= m_tolerance * m_tolerance) first = std::min(first, node);
+            }
         }
     }
     return first;

@@ -116,18 +116,23 @@ TEST(Arrangement, SharesArcsAndTouchesOnce) {
     ASSERT_EQ(arrangement.edges().size(), 4u);
     for (const Edge& edge : arrangement.edges())
         EXPECT_EQ(std::abs(edge.multiplicity), 2);
+}
 
-    for (const double gap : {0.0, 0.9e-7, -0.9e-7, 1.1e-7}) {
-        std::vector<Element> touching = circle;
+TEST(Arrangement, SharesOneNodeWhereACircleTouchesASide) {
+    const double tolerance = 1e-7;
+    Arrangement arrangement(tolerance);
+    const auto expectShared = [&](double gap, std::size_t nodes, std::size_t edges) {
+        std::vector<Element> touching{{{1, 0}, {-1, 0}, 1}, {{-1, 0}, {1, 0}, 1}};
         append(touching, square(-3, 1 + gap, 6));
         arrangement.assign(touching);
-        // One node for the touch; where the circle reaches over by less than the tolerance, one
-        // edge that is both.
-        const std::size_t shared = gap > 1e-7 ? 0 : gap < 0.0 ? 2 : 1;
-        EXPECT_EQ(arrangement.nodes().size(), 6 + shared) << gap;
-        EXPECT_EQ(arrangement.edges().size(), shared == 0 ? 6 : 7 + shared) << gap;
+        EXPECT_EQ(arrangement.nodes().size(), 6 + nodes) << gap;
+        EXPECT_EQ(arrangement.edges().size(), 6 + edges) << gap;
         expectSound(arrangement, touching, tolerance);
-    }
+    };
+    expectShared(0.0, 1, 2);
+    expectShared(0.9e-7, 1, 2);
+    expectShared(1.1e-7, 0, 0);
+    expectShared(-0.9e-7, 2, 3);  // the circle reaches over, along an edge that is both
 }
 
 TEST(Arrangement, FindsWhereElementsTouch) {
