@@ -62,8 +62,9 @@ void Removal::removeFromRun(std::size_t index) {
 /// Is a piece nearer than the threshold to an element that it was not tested against? Which of them
 /// it is does not matter, so boxes may choose the order.
 bool Removal::isNear(Piece& piece) const {
-    const CurveBox at = boxOf(piece.quickHalving().p);
     if (piece.clearOfSpan && !hasUntested()) return false;
+    QuickPoint const& halving = piece.quickHalving();
+    const CurveBox at = boxOf(halving.p).grown(halving.error);
     const auto isNearToNumber = [&](std::size_t number) {
         return isNearTo(piece, m_span, number, m_threshold);
     };
