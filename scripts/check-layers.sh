@@ -17,7 +17,8 @@ contour='GmApprDepData|GmContour|GmContElement|KxArray'
 # The floor of every room, by the longest path that fits.
 declare -A floors=(
     [kernel/values]=1 [kernel/curves]=2 [kernel/contour]=3
-    [region/model]=1 [region/plane]=2 [region/search]=2 [region/nodes]=3 [region/bridge]=4
+    [region/public]=0 [region/model]=1 [region/plane]=2 [region/search]=2 [region/nodes]=3
+    [region/link]=4 [region/overlay]=5 [region/bridge]=4
     [region/offset]=5 [region/corners]=5 [region/boolean]=5
     [drawing]=6 [drawing/contours]=7 [drawing/dxf]=7 [drawing/svg]=8 [drawing/files]=9
     [machining/moves]=10 [machining/runs]=10 [machining/obstacles]=10 [machining/order]=10
@@ -33,6 +34,7 @@ room_of() {
     if [[ $name =~ ^gmkernel/($values)\.h$ ]]; then echo kernel/values; return; fi
     if [[ $name =~ ^gmkernel/($curves)\.h$ ]]; then echo kernel/curves; return; fi
     if [[ $name =~ ^gmkernel/($contour)\.h$ ]]; then echo kernel/contour; return; fi
+    if [[ $name == gmregion/* ]]; then echo region/public; return; fi
     while [[ $name == */* ]]; do
         name=${name%/*}
         if [ -n "${floors[$name]:-}" ]; then echo "$name"; return; fi
@@ -82,7 +84,7 @@ while IFS=: read -r file line; do
         check_foreign "$file" "$header"
         continue
     fi
-    if [[ $header != gmkernel/* && ! -e $header ]]; then
+    if [[ ! $header =~ ^gm(kernel|region)/ && ! -e $header ]]; then
         echo "check-layers: $file includes $header, which is no path from the top" >&2
         failed=1
         continue

@@ -1,8 +1,6 @@
 // SPDX-License-Identifier: MIT
 #include "region/model/Box.h"
 
-#include <algorithm>
-
 namespace gmregion {
 
 namespace {
@@ -18,25 +16,9 @@ void includeArcExtremes(Box& box, const Element& e) {
 
 }  // namespace
 
-void Box::include(Vec2 p) {
-    low = {std::min(low.x, p.x), std::min(low.y, p.y)};
-    high = {std::max(high.x, p.x), std::max(high.y, p.y)};
-}
-
-void Box::include(const Box& other) {
-    if (other.isEmpty()) return;
-    include(other.low);
-    include(other.high);
-}
-
 bool Box::holds(const Box& other) const {
     return other.isEmpty() || (low.x <= other.low.x && low.y <= other.low.y &&
                                high.x >= other.high.x && high.y >= other.high.y);
-}
-
-Box Box::grown(double margin) const {
-    const Vec2 by{margin, margin};
-    return isEmpty() ? *this : Box{low - by, high + by};
 }
 
 Box boundingBox(const Element& e) {

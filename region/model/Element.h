@@ -1,24 +1,14 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include "gmregion/Element.h"
+
 #include "region/model/Vec2.h"
 
 namespace gmregion {
 
 /// Points of the kernel count as equal, and curves as too short, below this length.
 constexpr double kKernelTolerance = 1e-4;
-
-/// One piece of a path: a straight segment or a circular arc.
-///
-/// An arc is held by its ends and its bulge, the tangent of a quarter of the sweep: positive runs
-/// counter-clockwise, 1 is a half circle, 0 a straight segment. So the ends are exact by
-/// construction, and centre and radius follow from them. A full circle has no such form; it is
-/// held as two half circles. Arcs that nearly close are held as two halves too (`appendArc`).
-struct Element {
-    Vec2 sp;
-    Vec2 ep;
-    double bulge = 0.0;
-};
 
 inline bool isArc(const Element& e) {
     return e.bulge != 0.0;

@@ -1,17 +1,15 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include "gmregion/Point.h"
+
 #include <cmath>
 
 namespace gmregion {
 
 constexpr double kPi = 3.14159265358979323846;
 
-/// A point or a vector of the drawing plane, in drawing units.
-struct Vec2 {
-    double x = 0.0;
-    double y = 0.0;
-};
+using Vec2 = Point;
 
 inline Vec2 operator+(Vec2 a, Vec2 b) {
     return {a.x + b.x, a.y + b.y};
@@ -21,12 +19,6 @@ inline Vec2 operator-(Vec2 a, Vec2 b) {
 }
 inline Vec2 operator*(double f, Vec2 v) {
     return {f * v.x, f * v.y};
-}
-inline bool operator==(Vec2 a, Vec2 b) {
-    return a.x == b.x && a.y == b.y;
-}
-inline bool operator!=(Vec2 a, Vec2 b) {
-    return !(a == b);
 }
 
 /// Order by x, then by y.

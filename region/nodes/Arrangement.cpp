@@ -1,153 +1,186 @@
 // SPDX-License-Identifier: MIT
 /// @file
-/// From elements to nodes and edges.
+/// From strands to nodes and runs.
 ///
-/// Each two elements whose boxes come near are asked for the points they have to share: crossings,
-/// ends of the one on the other, and where they come nearest without crossing, if that is within
-/// the tolerance. These points and all ends are drawn together to nodes, and every element becomes
-/// the pieces between its nodes, in the order in which it passes them. A piece of an arc keeps the
-/// curvature of its arc: with s half the curvature times the chord, its bulge is
-/// s / (1 + sqrt(1 - s s)). Pieces between the same nodes whose heights agree within the tolerance
-/// are one edge, lines and arcs alike.
+/// The points where elements meet, and the vertices that something comes near, are drawn together
+/// to nodes, and every strand becomes the runs between its nodes in the order in which it passes
+/// them. A piece of an arc keeps the curvature of its arc: with s half the curvature times the
+/// chord, its bulge is s / (1 + sqrt(1 - s s)).
+///
+/// Whatever was within the tolerance of an element is a node on it now. So two elements that did
+/// not meet were farther apart, and only where one of them was bent by more than half a tolerance
+/// may they meet after all. Pieces that were bent so are compared again with all others, in a
+/// second round and a third; nodes of the round before stay where they are.
 #include "region/nodes/Arrangement.h"
 
 #include <algorithm>
 #include <cmath>
-#include <optional>
 
-#include "region/plane/Crossing.h"
-#include "region/plane/ElementBox.h"
-#include "region/plane/Nearest.h"
+#include "region/plane/Carrier.h"
 
 namespace gmregion {
 
 namespace {
 
-double squaredLength(Vec2 v) {
-    return dot(v, v);
+constexpr int kRounds = 3;
+
+/// The part of an element between two points of it, or of one that was bent a little.
+StrandElement part(const StrandElement& e, Vec2 from, Vec2 to) {
+    StrandElement piece = e;
+    piece.sp = from;
+    piece.ep = to;
+    if (e.bulge == 0.0 || (from == e.sp && to == e.ep)) return piece;
+    const Vec2 chord = to - from;
+    const double s =
+        std::clamp(0.5 * carrierOf(e).curvature * std::sqrt(dot(chord, chord)), -1.0, 1.0);
+    piece.bulge = s / (1.0 + std::sqrt((1.0 - s) * (1.0 + s)));
+    return piece;
 }
 
 }  // namespace
 
-void Arrangement::assign(const std::vector<Element>& elements) {
+bool Arrangement::settle(double tolerance, Index split) {
+    m_tolerance = tolerance;
+    m_settled.clear();
+    m_meetings.find(m_in, tolerance, {split, nullptr});
+    cutRound(true);
+    for (int round = 1; round < kRounds; ++round) {
+        const bool any = std::find(m_moved.begin(), m_moved.end(), 1) != m_moved.end();
+        if (!any) return true;
+        m_meetings.find(m_in, tolerance, {kNone, &m_moved});
+        if (m_meetings.stops().empty()) return true;
+        cutRound(false);
+    }
+    return std::find(m_moved.begin(), m_moved.end(), 1) == m_moved.end();
+}
+
+void Arrangement::cutRound(bool first) {
+    gatherPoints(first);
+    m_runs.clear();
+    m_out.clear();
+    m_movedOut.clear();
+    for (const Strand& strand : m_in.strands)
+        cutStrand(strand);
+    std::swap(m_in, m_out);
+    std::swap(m_moved, m_movedOut);
+    m_settled.assign(m_in.elements.size() + m_in.strands.size(), 0);
+    for (const Run& run : m_runs) {
+        if (run.from != kNone) m_settled[run.first] = 1;
+    }
+}
+
+/// Draws together what is a node now: first the vertices that were nodes before.
+void Arrangement::gatherPoints(bool first) {
+    const std::size_t vertices = m_meetings.vertexCount();
     m_points.clear();
-    m_stops.clear();
-    m_pieces.clear();
-    findStops(elements);
-    m_clusters.assign(m_points);
-    cutPieces(elements);
-    mergePieces();
-}
-
-void Arrangement::findStops(const std::vector<Element>& elements) {
-    std::vector<Box> boxes;
-    boxes.reserve(elements.size());
-    for (std::size_t i = 0; i < elements.size(); ++i) {
-        const Element& e = elements[i];
-        boxes.push_back(boxAbout(e).grown(m_tolerance));
-        m_points.push_back(e.sp);
-        m_stops.push_back({i, -1.0, m_points.size() - 1});
-        m_points.push_back(e.ep);
-        m_stops.push_back({i, 2.0, m_points.size() - 1});
+    m_pointOf.assign(vertices + m_meetings.points().size(), kNone);
+    const auto take = [&](Index v) {
+        m_pointOf[v] = static_cast<Index>(m_points.size());
+        m_points.push_back(m_meetings.vertex(v));
+    };
+    for (Index v = 0; v < vertices; ++v) {
+        if (!first && m_settled[v] != 0) take(v);
     }
-    m_boxes.assign(boxes);
-    m_boxes.visitPairs([&](std::size_t i, std::size_t j) { meet(elements, i, j); });
-}
-
-/// Finds the points that two elements have to share.
-void Arrangement::meet(const std::vector<Element>& elements, std::size_t i, std::size_t j) {
-    const Element& a = elements[i];
-    const Element& b = elements[j];
-    const bool endsOfA = stopAtEnds(elements, i, j);
-    const bool endsOfB = stopAtEnds(elements, j, i);
-    const CrossingPoints crossing = crossings(a, b);
-    for (const Vec2 p : crossing)
-        stopBoth(elements, i, j, p);
-    if (endsOfA || endsOfB || crossing.size() > 0) return;
-    const Carrier onA = carrierOf(a);
-    const Carrier onB = carrierOf(b);
-    const std::optional<Vec2> p = nearestApproach(onA, onB);
-    if (!p) return;
-    const Vec2 gap = nearestOn(a, onA, *p) - nearestOn(b, onB, *p);
-    if (squaredLength(gap) <= m_tolerance * m_tolerance) stopBoth(elements, i, j, *p);
-}
-
-/// Lets one element stop at the ends of another that lie on it; answers whether there are any.
-bool Arrangement::stopAtEnds(const std::vector<Element>& elements, std::size_t ends,
-                             std::size_t on) {
-    const Element& e = elements[on];
-    const Carrier carrier = carrierOf(e);
-    bool any = false;
-    for (const std::size_t point : {2 * ends, 2 * ends + 1}) {
-        const Vec2 end = m_points[point];
-        if (squaredLength(nearestOn(e, carrier, end) - end) > m_tolerance * m_tolerance) continue;
-        stop(e, on, point);
-        any = true;
+    const std::size_t settled = m_points.size();
+    for (Index v = 0; v < vertices; ++v) {
+        if (m_pointOf[v] == kNone && m_meetings.isMet(v)) take(v);
     }
-    return any;
-}
-
-void Arrangement::stopBoth(const std::vector<Element>& elements, std::size_t i, std::size_t j,
-                           Vec2 p) {
-    m_points.push_back(p);
-    stop(elements[i], i, m_points.size() - 1);
-    stop(elements[j], j, m_points.size() - 1);
-}
-
-/// Ends keep their places; what lies beside them comes after the start and before the end.
-void Arrangement::stop(const Element& e, std::size_t element, std::size_t point) {
-    const double place = std::clamp(placeOn(e, m_points[point]), 0.0, 1.0);
-    m_stops.push_back({element, place, point});
-}
-
-void Arrangement::cutPieces(const std::vector<Element>& elements) {
-    std::sort(m_stops.begin(), m_stops.end(), [](const Stop& a, const Stop& b) {
-        if (a.element != b.element) return a.element < b.element;
-        return a.place < b.place || (a.place == b.place && a.point < b.point);
-    });
-    for (std::size_t i = 1; i < m_stops.size(); ++i) {
-        if (m_stops[i].element != m_stops[i - 1].element) continue;
-        const std::size_t from = m_clusters.nodeOf(m_stops[i - 1].point);
-        const std::size_t to = m_clusters.nodeOf(m_stops[i].point);
-        if (from != to) addPiece(elements[m_stops[i].element], m_stops[i].element, from, to);
+    for (std::size_t i = 0; i < m_meetings.points().size(); ++i) {
+        m_pointOf[vertices + i] = static_cast<Index>(m_points.size());
+        m_points.push_back(m_meetings.points()[i]);
     }
+    m_clusters.assign(m_points, m_tolerance, settled);
 }
 
-void Arrangement::addPiece(const Element& e, std::size_t element, std::size_t from,
-                           std::size_t to) {
-    const double chord = std::sqrt(squaredLength(nodes()[to] - nodes()[from]));
-    const double curvature = e.bulge == 0.0 ? 0.0 : carrierOf(e).curvature;
-    const double s = std::clamp(0.5 * curvature * chord, -1.0, 1.0);
-    const double bulge = s / (1.0 + std::sqrt((1.0 - s) * (1.0 + s)));
-    const double height = -0.5 * bulge * chord;
-    if (from < to) {
-        m_pieces.push_back({from, to, bulge, height, 1, element});
+bool Arrangement::meetsNode(Index element) const {
+    return m_pointOf[element] != kNone ||
+           m_meetings.firstStop(element) != m_meetings.firstStop(element + 1);
+}
+
+/// The first element of a strand with a node at its start or within it; kNone when there is none.
+Index Arrangement::findStart(const Strand& strand) const {
+    for (Index i = strand.first; i < strand.last; ++i) {
+        if (meetsNode(i)) return i;
+    }
+    return kNone;
+}
+
+void Arrangement::cutStrand(const Strand& strand) {
+    const std::size_t before = m_out.elements.size();
+    m_weight = strand.weight;
+    m_node = kNone;
+    m_runFirst = static_cast<Index>(before);
+    const Index start = findStart(strand);
+    if (start == kNone) {
+        cutFreeStrand(strand);
     } else {
-        m_pieces.push_back({to, from, -bulge, -height, -1, element});
+        // A closed strand is walked once round from its first node, so that no run is in two parts.
+        const Index firstStop = m_meetings.firstStop(start);
+        const Index lastStop = m_meetings.firstStop(start + 1);
+        const bool atVertex = m_pointOf[start] != kNone;
+        const Index point =
+            atVertex ? m_pointOf[start] : m_pointOf[m_meetings.stops()[firstStop].point];
+        m_node = m_clusters.nodeOf(point);
+        m_at = m_clusters.nodes()[m_node];
+        cutElement(start, atVertex ? firstStop : firstStop + 1, lastStop);
+        for (Index i = start + 1; i < strand.last; ++i)
+            cutElement(i, m_meetings.firstStop(i), m_meetings.firstStop(i + 1));
+        for (Index i = strand.first; i < start; ++i)
+            cutElement(i, m_meetings.firstStop(i), m_meetings.firstStop(i + 1));
+        if (!atVertex)
+            advance(start, m_clusters.nodes()[m_clusters.nodeOf(point)], m_clusters.nodeOf(point));
     }
+    const Index last = static_cast<Index>(m_out.elements.size());
+    if (before < last)
+        m_out.strands.push_back({static_cast<Index>(before), last, strand.closed, strand.weight});
+    m_movedOut.resize(last, 0);
 }
 
-void Arrangement::mergePieces() {
-    m_edges.clear();
-    m_sources.clear();
-    std::sort(m_pieces.begin(), m_pieces.end(), [](const Piece& a, const Piece& b) {
-        if (a.from != b.from) return a.from < b.from;
-        if (a.to != b.to) return a.to < b.to;
-        return a.height < b.height || (a.height == b.height && a.element < b.element);
-    });
-    for (std::size_t i = 0; i < m_pieces.size();) {
-        const Piece& lowest = m_pieces[i];
-        Edge edge{lowest.from, lowest.to, lowest.bulge, 0, m_sources.size(), 0};
-        for (; i < m_pieces.size() && m_pieces[i].from == edge.from && m_pieces[i].to == edge.to &&
-               m_pieces[i].height - lowest.height <= m_tolerance;
-             ++i) {
-            edge.multiplicity += m_pieces[i].sense;
-            m_sources.push_back(m_pieces[i].element);
-        }
-        edge.last = m_sources.size();
-        std::sort(m_sources.begin() + static_cast<std::ptrdiff_t>(edge.first), m_sources.end());
-        m_edges.push_back(edge);
+void Arrangement::cutFreeStrand(const Strand& strand) {
+    const auto first = m_in.elements.begin() + strand.first;
+    m_out.elements.insert(m_out.elements.end(), first, m_in.elements.begin() + strand.last);
+    m_runs.push_back(
+        {kNone, kNone, m_runFirst, static_cast<Index>(m_out.elements.size()), m_weight});
+}
+
+/// Goes on along an element, past some of its stops, to its end.
+void Arrangement::cutElement(Index element, Index firstStop, Index lastStop) {
+    const StrandElement& e = m_in.elements[element];
+    for (Index s = firstStop; s < lastStop; ++s) {
+        const Index node = m_clusters.nodeOf(m_pointOf[m_meetings.stops()[s].point]);
+        advance(element, m_clusters.nodes()[node], node);
     }
+    const Index point = m_pointOf[m_meetings.endVertex(element)];
+    const Index node = point == kNone ? kNone : m_clusters.nodeOf(point);
+    advance(element, node == kNone ? e.ep : m_clusters.nodes()[node], node);
+}
+
+/// Goes on along an element to a point, which is a node or the end of the element.
+void Arrangement::advance(Index element, Vec2 to, Index node) {
+    if (node != kNone && node == m_node && m_out.elements.size() == m_runFirst) return;
+    const StrandElement& e = m_in.elements[element];
+    m_out.elements.push_back(part(e, m_at, to));
+    m_movedOut.resize(m_out.elements.size(), 0);
+    if (hasMoved(e, e.sp, m_at) || hasMoved(e, e.ep, to)) m_movedOut.back() = 1;
+    m_at = to;
+    if (node != kNone) passNode(node);
+}
+
+/// Ends the run in hand and begins the next.
+void Arrangement::passNode(Index node) {
+    const Index last = static_cast<Index>(m_out.elements.size());
+    m_runs.push_back({m_node, node, m_runFirst, last, m_weight});
+    m_runFirst = last;
+    m_node = node;
+}
+
+/// Whether a piece with an end there has been bent away from its element by more than half a
+/// tolerance.
+bool Arrangement::hasMoved(const StrandElement& e, Vec2 was, Vec2 node) const {
+    const double limit = 0.5 * m_tolerance;
+    const Vec2 by = node - was;
+    if (dot(by, by) <= limit * limit) return false;
+    return std::fabs(signedDistance(carrierOf(e), node)) > limit;
 }
 
 }  // namespace gmregion

@@ -1,79 +1,75 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include <cstddef>
 #include <vector>
 
-#include "region/model/Element.h"
+#include "region/nodes/Meetings.h"
 #include "region/nodes/NodeClusters.h"
-#include "region/search/BoxRow.h"
+#include "region/nodes/Strands.h"
 
 namespace gmregion {
 
-/// A piece of one or more elements between two nodes, with nothing else on it.
-struct Edge {
-    std::size_t from;  ///< the node with the lower number, or of a loop the same as `to`
-    std::size_t to;
-    double bulge;       ///< from `from` to `to`
-    int multiplicity;   ///< how many elements run along it that way, less those that run back
-    std::size_t first;  ///< its elements: a range of Arrangement::sources()
-    std::size_t last;
+/// A stretch of a strand between two nodes, with nothing else on it: pieces of its elements.
+struct Run {
+    Index from;  ///< kNone for a strand that meets nothing, as is `to`
+    Index to;
+    Index first;  ///< number of its first piece
+    Index last;   ///< behind its last piece
+    Weight weight;
 };
 
-/// Elements cut at each other: nodes, and edges that meet at nodes alone.
+/// Strands cut at each other: nodes, and runs that meet at nodes alone.
 ///
-/// Wherever elements cross, end on each other or come nearer than the tolerance, they share a node;
-/// where they run alongside within it, they share an edge. Nothing moves by more than twice the
-/// tolerance. Memory is kept from one use to the next.
+/// Wherever elements cross, end on each other or come nearer than the tolerance, they share a node.
+/// Nothing moves by more than the tolerance a round. Memory is kept from one use to the next.
 class Arrangement {
 public:
-    /// @param tolerance in length units, positive, far below the length of common elements
-    explicit Arrangement(double tolerance) : m_tolerance(tolerance), m_clusters(tolerance) {}
+    /// The strands to be cut; to be filled before each use. They hold the pieces afterwards:
+    /// strands as they were, cut at nodes.
+    Strands& strands() { return m_in; }
 
-    /// Takes elements in place of those before; each turns by half a turn at the most, and all
-    /// coordinates are finite. Cost: that of sorting, and the pairs of elements that come near.
-    void assign(const std::vector<Element>& elements);
+    /// Cuts the strands. False when nodes have not come to rest after three rounds.
+    /// @param tolerance in length units, positive
+    /// @param split where it is not kNone, elements before and from that number on are two clean
+    /// sets, and those of one of them are not compared with each other
+    bool settle(double tolerance, Index split = kNone);
 
     const std::vector<Vec2>& nodes() const { return m_clusters.nodes(); }
-    /// In the order of their nodes, then of their heights.
-    const std::vector<Edge>& edges() const { return m_edges; }
-    /// The numbers of the elements along each edge, in increasing order.
-    const std::vector<std::size_t>& sources() const { return m_sources; }
+    /// Along each strand in their order.
+    const std::vector<Run>& runs() const { return m_runs; }
+    const std::vector<StrandElement>& pieces() const { return m_in.elements; }
+    double tolerance() const { return m_tolerance; }
 
 private:
-    /// A point that an element has to pass.
-    struct Stop {
-        std::size_t element;
-        double place;
-        std::size_t point;
-    };
-    /// A piece of one element between nodes, turned to run from the lower node to the higher.
-    struct Piece {
-        std::size_t from;
-        std::size_t to;
-        double bulge;
-        double height;  ///< above the chord, positive on its left
-        int sense;      ///< -1 when it was turned
-        std::size_t element;
-    };
+    void cutRound(bool first);
+    void gatherPoints(bool first);
+    void cutStrand(const Strand& strand);
+    void cutFreeStrand(const Strand& strand);
+    void cutElement(Index element, Index firstStop, Index lastStop);
+    Index findStart(const Strand& strand) const;
+    bool meetsNode(Index element) const;
+    void advance(Index element, Vec2 to, Index node);
+    void passNode(Index node);
+    bool hasMoved(const StrandElement& e, Vec2 was, Vec2 node) const;
 
-    void findStops(const std::vector<Element>& elements);
-    void meet(const std::vector<Element>& elements, std::size_t i, std::size_t j);
-    bool stopAtEnds(const std::vector<Element>& elements, std::size_t ends, std::size_t on);
-    void stopBoth(const std::vector<Element>& elements, std::size_t i, std::size_t j, Vec2 p);
-    void stop(const Element& e, std::size_t element, std::size_t point);
-    void cutPieces(const std::vector<Element>& elements);
-    void addPiece(const Element& e, std::size_t element, std::size_t from, std::size_t to);
-    void mergePieces();
-
-    double m_tolerance;
+    Strands m_in;
+    Strands m_out;
+    double m_tolerance = 0.0;
+    Meetings m_meetings;
     NodeClusters m_clusters;
-    BoxRow m_boxes;
-    std::vector<Vec2> m_points;
-    std::vector<Stop> m_stops;
-    std::vector<Piece> m_pieces;
-    std::vector<Edge> m_edges;
-    std::vector<std::size_t> m_sources;
+    std::vector<Vec2> m_points;    ///< of the vertices that are nodes, then where elements meet
+    std::vector<Index> m_pointOf;  ///< of each vertex, kNone where it is no node
+    std::vector<std::uint8_t> m_settled;  ///< vertices that were nodes in the round before
+    std::vector<std::uint8_t> m_moved;    ///< elements that were bent by more than half a tolerance
+    std::vector<std::uint8_t> m_movedOut;
+    std::vector<Run> m_runs;
+
+    // The strand in hand.
+    Weight m_weight;
+    Vec2 m_at;
+    Index m_node = kNone;
+    Index m_runFirst = 0;
+    bool m_bent = false;
 };
 
 }  // namespace gmregion

@@ -27,35 +27,41 @@ std::uint64_t bitsOf(double value) {
 
 }  // namespace
 
-void NodeClusters::assign(const std::vector<Vec2>& points) {
+void NodeClusters::assign(const std::vector<Vec2>& points, double tolerance, std::size_t settled) {
+    m_tolerance = tolerance;
     m_nodes.clear();
     m_before.clear();
     m_nodeOf.assign(points.size(), kNone);
     m_latest.assign(points.size() + 1, kNone);
-    std::vector<std::size_t> order(points.size());
-    std::iota(order.begin(), order.end(), std::size_t{0});
-    std::sort(order.begin(), order.end(), [&](std::size_t a, std::size_t b) {
+    for (std::size_t i = 0; i < settled; ++i)
+        take(i, points[i]);
+    m_order.resize(points.size() - settled);
+    std::iota(m_order.begin(), m_order.end(), static_cast<Index>(settled));
+    std::sort(m_order.begin(), m_order.end(), [&](Index a, Index b) {
         return points[a] < points[b] || (points[a] == points[b] && a < b);
     });
-    for (const std::size_t index : order) {
-        std::size_t node = findNode(points[index]);
-        if (node == kNone) {
-            node = m_nodes.size();
-            beginNode(points[index]);
-        }
-        m_nodeOf[index] = node;
+    for (const Index index : m_order)
+        take(index, points[index]);
+}
+
+void NodeClusters::take(std::size_t index, Vec2 p) {
+    Index node = findNode(p);
+    if (node == kNone) {
+        node = static_cast<Index>(m_nodes.size());
+        beginNode(p);
     }
+    m_nodeOf[index] = node;
 }
 
 /// The node that was begun first of those within the tolerance.
-std::size_t NodeClusters::findNode(Vec2 p) const {
+Index NodeClusters::findNode(Vec2 p) const {
     const double column = std::floor(p.x / m_tolerance);
     const double row = std::floor(p.y / m_tolerance);
-    std::size_t first = kNone;
+    Index first = kNone;
     for (const double aside : {-1.0, 0.0, 1.0}) {
         for (const double above : {-1.0, 0.0, 1.0}) {
             const std::size_t slot = slotOf(column + aside, row + above);
-            for (std::size_t node = m_latest[slot]; node != kNone; node = m_before[node]) {
+            for (Index node = m_latest[slot]; node != kNone; node = m_before[node]) {
                 const Vec2 away = m_nodes[node] - p;
                 if (dot(away, away) <= m_tolerance * m_tolerance) first = std::min(first, node);
             }
@@ -67,7 +73,7 @@ std::size_t NodeClusters::findNode(Vec2 p) const {
 void NodeClusters::beginNode(Vec2 p) {
     const std::size_t slot = slotOf(std::floor(p.x / m_tolerance), std::floor(p.y / m_tolerance));
     m_before.push_back(m_latest[slot]);
-    m_latest[slot] = m_nodes.size();
+    m_latest[slot] = static_cast<Index>(m_nodes.size());
     m_nodes.push_back(p);
 }
 

@@ -4,6 +4,7 @@
 #include <cstddef>
 #include <vector>
 
+#include "region/model/Index.h"
 #include "region/model/Vec2.h"
 
 namespace gmregion {
@@ -16,31 +17,32 @@ namespace gmregion {
 /// farther apart than the tolerance, and the order in which points are given does not matter.
 class NodeClusters {
 public:
-    /// @param tolerance in length units, positive; points at exactly this distance belong together
-    explicit NodeClusters(double tolerance) : m_tolerance(tolerance) {}
-
     /// Takes the points in place of those before; all must be finite. Cost: that of sorting them.
-    void assign(const std::vector<Vec2>& points);
+    /// @param tolerance in length units, positive; points at exactly this distance belong together
+    /// @param settled so many of the first points, each at the place of another of them or farther
+    /// than the tolerance from it, begin their nodes before the others
+    void assign(const std::vector<Vec2>& points, double tolerance, std::size_t settled = 0);
 
     /// The nodes, in the order in which they were begun.
     const std::vector<Vec2>& nodes() const { return m_nodes; }
     /// The number of the node that a point went to.
-    std::size_t nodeOf(std::size_t point) const { return m_nodeOf[point]; }
+    Index nodeOf(std::size_t point) const { return m_nodeOf[point]; }
 
 private:
-    static constexpr std::size_t kNone = static_cast<std::size_t>(-1);
-
-    std::size_t findNode(Vec2 p) const;
+    Index findNode(Vec2 p) const;
     void beginNode(Vec2 p);
     std::size_t slotOf(double column, double row) const;
 
-    double m_tolerance;
+    void take(std::size_t index, Vec2 p);
+
+    double m_tolerance = 0.0;
     std::vector<Vec2> m_nodes;
-    std::vector<std::size_t> m_nodeOf;
+    std::vector<Index> m_nodeOf;
+    std::vector<Index> m_order;
     // The nodes by the cell of the plane in which they lie: the latest of each slot, and the one
     // before it in the same slot.
-    std::vector<std::size_t> m_latest;
-    std::vector<std::size_t> m_before;
+    std::vector<Index> m_latest;
+    std::vector<Index> m_before;
 };
 
 }  // namespace gmregion

@@ -5,11 +5,21 @@
 
 namespace gmregion {
 
-void BoxRow::assign(const std::vector<Box>& boxes) {
-    m_boxes.assign(boxes.begin(), boxes.end());
+void BoxRow::begin(std::size_t count) {
+    m_boxes.clear();
     m_ends.clear();
-    if (boxes.empty()) return;
-    m_ends.push_back(boxes.size());
+    m_boxes.reserve(count + count / 7 + 8);
+}
+
+void BoxRow::assign(const std::vector<Box>& boxes) {
+    begin(boxes.size());
+    m_boxes.insert(m_boxes.end(), boxes.begin(), boxes.end());
+    finish();
+}
+
+void BoxRow::finish() {
+    if (m_boxes.empty()) return;
+    m_ends.push_back(m_boxes.size());
     while (countOf(top()) > 1) {
         const std::size_t end = m_ends.back();
         for (std::size_t first = beginOf(top()); first < end; first += std::size_t{1} << kBits) {

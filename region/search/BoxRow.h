@@ -16,6 +16,12 @@ namespace gmregion {
 /// is kept from one row to the next.
 class BoxRow {
 public:
+    /// Begins a row in place of the one before, for so many boxes.
+    void begin(std::size_t count);
+    /// Appends a box to the row that was begun.
+    void add(const Box& box) { m_boxes.push_back(box); }
+    /// Ends the row; from here on it can be searched. Cost: linear.
+    void finish();
     /// Takes the boxes of a row in place of those before. Cost: linear.
     void assign(const std::vector<Box>& boxes);
 
@@ -33,6 +39,12 @@ public:
     template <class Visit>
     void visitPairs(const Visit& visit) const {
         if (size() > 0) pairsUnder(top(), 0, visit);
+    }
+
+    /// Calls visit(i, j) for the boxes i of this row and j of another that overlap.
+    template <class Visit>
+    void visitPairsWith(const BoxRow& other, const Visit& visit) const {
+        if (size() > 0 && other.size() > 0) pairsAcross(top(), 0, other, other.top(), 0, visit);
     }
 
 private:
@@ -85,6 +97,22 @@ private:
             if (!boxOf(level - 1, i).overlaps(boxOf(level, b))) continue;
             for (std::size_t j = b << kBits; j < endUnder(level, b); ++j)
                 pairsBetween(level - 1, i, j, visit);
+        }
+    }
+
+    template <class Visit>
+    void pairsAcross(std::size_t level, std::size_t index, const BoxRow& other,
+                     std::size_t otherLevel, std::size_t otherIndex, const Visit& visit) const {
+        if (!boxOf(level, index).overlaps(other.boxOf(otherLevel, otherIndex))) return;
+        if (level == 0 && otherLevel == 0) {
+            visit(index, otherIndex);
+        } else if (level >= otherLevel) {
+            for (std::size_t i = index << kBits; i < endUnder(level, index); ++i)
+                pairsAcross(level - 1, i, other, otherLevel, otherIndex, visit);
+        } else {
+            const std::size_t end = other.endUnder(otherLevel, otherIndex);
+            for (std::size_t i = otherIndex << kBits; i < end; ++i)
+                pairsAcross(level, index, other, otherLevel - 1, i, visit);
         }
     }
 

@@ -36,8 +36,8 @@ TEST(NodeClusters, MoveNoPointFarAndKeepNodesApart) {
         const double tolerance = std::pow(10.0, -double(engine() % 9) - 1);
         const Vec2 about = engine() % 2 == 0 ? Vec2{0, 0} : Vec2{-123.4, 5e4};
         const std::vector<Vec2> points = nearPoints(engine, 400, tolerance, about);
-        NodeClusters clusters(tolerance);
-        clusters.assign(points);
+        NodeClusters clusters;
+        clusters.assign(points, tolerance);
         const double rounding = 1e-11;
         for (std::size_t i = 0; i < points.size(); ++i) {
             const Vec2 node = clusters.nodes()[clusters.nodeOf(i)];
@@ -53,20 +53,20 @@ TEST(NodeClusters, MoveNoPointFarAndKeepNodesApart) {
 TEST(NodeClusters, DoNotDependOnTheOrderOfThePoints) {
     std::mt19937 engine(5);
     const std::vector<Vec2> points = nearPoints(engine, 500, 0.05, {3, -2});
-    NodeClusters clusters(0.05);
-    clusters.assign(points);
+    NodeClusters clusters;
+    clusters.assign(points, 0.05);
     std::vector<std::size_t> order(points.size());
     std::iota(order.begin(), order.end(), std::size_t{0});
     std::shuffle(order.begin(), order.end(), engine);
     std::vector<Vec2> shuffled;
     for (const std::size_t i : order)
         shuffled.push_back(points[i]);
-    NodeClusters again(0.05);
-    again.assign(shuffled);
+    NodeClusters again;
+    again.assign(shuffled, 0.05);
     ASSERT_EQ(again.nodes(), clusters.nodes());
     for (std::size_t i = 0; i < order.size(); ++i)
         EXPECT_EQ(again.nodeOf(i), clusters.nodeOf(order[i]));
-    again.assign({});
+    again.assign({}, 0.05);
     EXPECT_TRUE(again.nodes().empty());
 }
 
@@ -74,8 +74,8 @@ TEST(NodeClusters, AChainOfNearPointsStaysAChain) {
     std::vector<Vec2> chain;
     for (int i = 0; i < 1000; ++i)
         chain.push_back({0.009 * i, 0});
-    NodeClusters clusters(0.01);
-    clusters.assign(chain);
+    NodeClusters clusters;
+    clusters.assign(chain, 0.01);
     EXPECT_EQ(clusters.nodes().size(), 500u) << "two by two";
 }
 

@@ -1,0 +1,48 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "gmregion/RegionSet.h"
+#include "gmregion/export.h"
+
+#include <cstddef>
+#include <cstdint>
+#include <vector>
+
+namespace gmregion {
+
+/// Why something was refused.
+enum class Reason : std::uint8_t {
+    kNone,        ///< it was not
+    kNotFinite,   ///< a number is not finite
+    kOutOfRange,  ///< a coordinate, distance or count beyond what is stated, or a negative limit
+    kTolerance,   ///< the tolerance is not positive, or too fine or too coarse for the drawing
+    kOpenPath,    ///< a path is open where a loop is needed
+    kGap,         ///< an element starts farther from the end of the one before than the tolerance
+    kUnsettled,   ///< nodes did not come to rest: the input is dense in comparison to the tolerance
+    kUncertified,  ///< the result does not hold what every result must
+    kWorkLimit     ///< more work than the caller allows
+};
+
+/// A short text for a reason, in English, without a full stop. Never null.
+GMREGION_EXPORT const char* textOf(Reason reason);
+
+/// What could not be answered, and where.
+struct Refusal {
+    Reason reason = Reason::kNone;
+    Point at;              ///< a point near the cause, where there is one
+    std::size_t path = 0;  ///< number of the input path concerned, where there is one
+
+    explicit operator bool() const { return reason != Reason::kNone; }
+};
+
+/// What an operation gives: a set, or a refusal and an empty set.
+struct Outcome {
+    RegionSet regions;
+    Refusal refusal;
+    /// Points where the result hangs on less than four tolerances: a little more or less, and
+    /// loops would meet or part there. Results are right there, too, but may differ in the number
+    /// of loops from those of the same input moved or turned.
+    std::vector<Point> marginal;
+};
+
+}  // namespace gmregion

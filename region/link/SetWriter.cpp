@@ -1,0 +1,192 @@
+// SPDX-License-Identifier: MIT
+#include "region/link/SetWriter.h"
+
+#include <algorithm>
+#include <cmath>
+#include <numeric>
+
+#include "region/plane/Carrier.h"
+#include "region/plane/Measures.h"
+
+namespace gmregion {
+
+namespace {
+
+/// The largest bulge of an element of a result, that of 300 degrees: beyond it the ends come near
+/// each other in comparison to the radius.
+constexpr double kLargestBulge = 3.7320508075688772;
+
+/// In parts of the tolerance, how far an end between two pieces may lie beside both as one.
+constexpr double kStraight = 1.0 / 1024.0;
+
+/// The bulge of two arcs of one circle that follow each other: the tangents of their quarter
+/// sweeps, added.
+double joinedBulge(double a, double b) {
+    return (a + b) / (1.0 - a * b);
+}
+
+bool sameOrigin(const Origin& a, const Origin& b) {
+    return a.path == b.path && a.element == b.element && a.kind == b.kind;
+}
+
+}  // namespace
+
+void SetWriter::clear(RegionSet& set, double tolerance) {
+    set.m_tolerance = tolerance;
+    set.m_loops.clear();
+    set.m_elements.clear();
+    set.m_originEnds.clear();
+    set.m_origins.clear();
+}
+
+bool SetWriter::write(const Arrangement& arrangement, const Fans& fans, const Loops& loops,
+                      const OriginSource& source, RegionSet& set) {
+    m_arrangement = &arrangement;
+    m_fans = &fans;
+    m_source = &source;
+    m_elements.clear();
+    m_ends.clear();
+    m_areas.clear();
+    m_origins.clear();
+    m_originEnds.clear();
+    clear(set, arrangement.tolerance());
+    for (std::size_t loop = 0; loop < loops.size(); ++loop) {
+        gather(arrangement, loops, loop);
+        emitLoop();
+    }
+    if (m_ends.empty()) return true;
+    if (!m_nesting.find(m_elements, m_ends, m_areas)) return false;
+    arrange(set);
+    return true;
+}
+
+/// Lists the pieces of a loop in their order, and its area.
+void SetWriter::gather(const Arrangement& arrangement, const Loops& loops, std::size_t loop) {
+    m_items.clear();
+    for (const Half* half = loops.begin(loop); half != loops.end(loop); ++half) {
+        const Run& run = arrangement.runs()[runOf(*half)];
+        const bool backward = leavesEnd(*half);
+        for (Index i = 0; i < run.last - run.first; ++i) {
+            const StrandElement& e =
+                arrangement.pieces()[backward ? run.last - 1 - i : run.first + i];
+            const Element turned = backward ? Element{e.ep, e.sp, -e.bulge} : Element(e);
+            m_items.push_back({turned, e.tag, runOf(*half), backward});
+        }
+    }
+    const Vec2 origin = m_items.front().element.sp;
+    double area = 0.0;
+    for (const Item& item : m_items)
+        area += 0.5 * sweptTwice(item.element, origin);
+    m_areas.push_back(area);
+}
+
+/// Whether two pieces that follow each other are parts of one element, with nothing between them.
+bool SetWriter::joins(const Item& a, const Item& b) const {
+    if (a.tag != b.tag || a.backward != b.backward || !sameOrigins(a, b)) return false;
+    if ((a.element.bulge == 0.0) != (b.element.bulge == 0.0)) return false;
+    const double product = a.element.bulge * b.element.bulge;
+    if (product < 0.0 || product >= 1.0) return false;
+    const double bulge = joinedBulge(a.element.bulge, b.element.bulge);
+    if (std::fabs(bulge) > kLargestBulge) return false;
+    const Vec2 chord = b.element.ep - a.element.sp;
+    if (!(dot(chord, chord) > 0.0)) return false;
+    const Element joined{a.element.sp, b.element.ep, bulge};
+    const double beside = std::fabs(signedDistance(carrierOf(joined), a.element.ep));
+    return beside <= kStraight * m_arrangement->tolerance();
+}
+
+bool SetWriter::sameOrigins(const Item& a, const Item& b) const {
+    Index other = m_fans->nextSame(b.run);
+    for (Index run = m_fans->nextSame(a.run); run != kNone; run = m_fans->nextSame(run)) {
+        if (other == kNone) return false;
+        const auto& pieces = m_arrangement->pieces();
+        const auto& runs = m_arrangement->runs();
+        if (pieces[runs[run].first].tag != pieces[runs[other].first].tag) return false;
+        other = m_fans->nextSame(other);
+    }
+    return other == kNone;
+}
+
+/// Appends the pieces of a loop, joined where they are parts of one element.
+void SetWriter::emitLoop() {
+    const std::size_t count = m_items.size();
+    std::size_t start = 0;
+    while (start < count && joins(m_items[(start + count - 1) % count], m_items[start]))
+        ++start;
+    start %= count;
+    Item item = m_items[start];
+    const std::size_t first = m_elements.size();
+    for (std::size_t i = 1; i <= count; ++i) {
+        const Item& next = m_items[(start + i) % count];
+        if (i < count && joins(item, next)) {
+            item.element.bulge = joinedBulge(item.element.bulge, next.element.bulge);
+            item.element.ep = next.element.ep;
+            continue;
+        }
+        m_elements.push_back(item.element);
+        appendOrigins(item);
+        item = next;
+    }
+    if (m_elements.size() - first < 2) {
+        // One element cannot close a loop: what was joined to it stays in parts.
+        m_elements.resize(first);
+        m_originEnds.resize(first);
+        m_origins.resize(m_originEnds.empty() ? 0 : m_originEnds.back());
+        for (const Item& part : m_items) {
+            m_elements.push_back(part.element);
+            appendOrigins(part);
+        }
+    }
+    m_ends.push_back(static_cast<Index>(m_elements.size()));
+}
+
+/// All origins of a piece, each once.
+void SetWriter::appendOrigins(const Item& item) {
+    const std::size_t first = m_origins.size();
+    m_source->append(item.tag, m_origins);
+    for (Index run = m_fans->nextSame(item.run); run != kNone; run = m_fans->nextSame(run))
+        m_source->append(m_arrangement->pieces()[m_arrangement->runs()[run].first].tag, m_origins);
+    std::size_t end = first + 1;
+    for (std::size_t i = first + 1; i < m_origins.size(); ++i) {
+        const auto isSame = [&](const Origin& other) { return sameOrigin(m_origins[i], other); };
+        const auto begin = m_origins.begin();
+        const bool isKnown = std::any_of(begin + static_cast<std::ptrdiff_t>(first),
+                                         begin + static_cast<std::ptrdiff_t>(end), isSame);
+        if (!isKnown) m_origins[end++] = m_origins[i];
+    }
+    m_origins.resize(end);
+    m_originEnds.push_back(static_cast<Index>(end));
+}
+
+/// Puts outlines in their order, each with its holes behind it.
+void SetWriter::arrange(RegionSet& set) {
+    m_order.resize(m_ends.size());
+    std::iota(m_order.begin(), m_order.end(), Index{0});
+    std::sort(m_order.begin(), m_order.end(), [&](Index a, Index b) {
+        const Index outlineOfA = m_nesting.outlineOf(a);
+        const Index outlineOfB = m_nesting.outlineOf(b);
+        if (outlineOfA != outlineOfB) return outlineOfA < outlineOfB;
+        if ((a == outlineOfA) != (b == outlineOfB)) return a == outlineOfA;
+        return a < b;
+    });
+    set.m_elements.reserve(m_elements.size());
+    set.m_originEnds.reserve(m_elements.size());
+    set.m_origins.reserve(m_origins.size());
+    Index region = kNone;
+    for (const Index loop : m_order) {
+        const Index first = loop == 0 ? 0 : m_ends[loop - 1];
+        const bool hole = m_nesting.outlineOf(loop) != loop;
+        if (!hole) ++region;
+        const Index begin = static_cast<Index>(set.m_elements.size());
+        for (Index i = first; i < m_ends[loop]; ++i) {
+            set.m_elements.push_back(m_elements[i]);
+            const Index firstOrigin = i == 0 ? 0 : m_originEnds[i - 1];
+            for (Index k = firstOrigin; k < m_originEnds[i]; ++k)
+                set.m_origins.push_back(m_origins[k]);
+            set.m_originEnds.push_back(static_cast<Index>(set.m_origins.size()));
+        }
+        set.m_loops.push_back({begin, static_cast<Index>(set.m_elements.size()), region, hole});
+    }
+}
+
+}  // namespace gmregion

@@ -1,0 +1,126 @@
+// SPDX-License-Identifier: MIT
+#include "region/link/Windings.h"
+
+#include "region/plane/ElementBox.h"
+#include "region/plane/ElementWinding.h"
+
+namespace gmregion {
+
+namespace {
+
+/// The longest piece of a run, the first of equal ones.
+Index longestPiece(const Arrangement& arrangement, Index run) {
+    const Run& r = arrangement.runs()[run];
+    Index longest = r.first;
+    double length = -1.0;
+    for (Index i = r.first; i < r.last; ++i) {
+        const Vec2 chord = arrangement.pieces()[i].ep - arrangement.pieces()[i].sp;
+        if (!(dot(chord, chord) > length)) continue;
+        length = dot(chord, chord);
+        longest = i;
+    }
+    return longest;
+}
+
+Weight times(Weight w, int n) {
+    return {w.a * n, w.b * n};
+}
+
+}  // namespace
+
+bool Windings::find(const Arrangement& arrangement, Fans& fans) {
+    m_arrangement = &arrangement;
+    m_fans = &fans;
+    m_casts = 0;
+    m_right.assign(arrangement.runs().size(), {});
+    m_isKnown.assign(arrangement.runs().size(), 0);
+    m_isDone.assign(arrangement.nodes().size(), 0);
+    for (Index node = 0; node < fans.nodeCount(); ++node)
+        fans.sort(node);
+    for (Index run = 0; run < arrangement.runs().size(); ++run) {
+        if (m_isKnown[run] != 0 || !fans.stands(run)) continue;
+        m_right[run] = castFrom(run);
+        m_isKnown[run] = 1;
+        if (arrangement.runs()[run].from != kNone && !spreadFrom(run)) return false;
+    }
+    return true;
+}
+
+/// What lies on the right of a run, by a ray from the middle of its longest piece.
+Weight Windings::castFrom(Index run) {
+    if (m_casts++ == 0) raiseBoxes();
+    const Index own = longestPiece(*m_arrangement, run);
+    const StrandElement& e = m_arrangement->pieces()[own];
+    const Vec2 p = middleOf(e);
+    Weight sum = times(m_fans->weight(run), windingRightOf(e));
+    const Box ray{{m_farLeft, p.y}, p};
+    m_boxes.visitOverlapping(ray, [&](std::size_t i) {
+        const Index other = m_runOfPiece[i];
+        if (i == own || !m_fans->stands(other)) return;
+        sum = sum + times(m_fans->weight(other), windingOf(m_arrangement->pieces()[i], p));
+    });
+    return sum;
+}
+
+void Windings::raiseBoxes() {
+    const auto& pieces = m_arrangement->pieces();
+    m_boxes.begin(pieces.size());
+    m_runOfPiece.resize(pieces.size());
+    m_farLeft = 0.0;
+    for (Index run = 0; run < m_arrangement->runs().size(); ++run) {
+        const Run& r = m_arrangement->runs()[run];
+        for (Index i = r.first; i < r.last; ++i) {
+            m_runOfPiece[i] = run;
+            const Box box = boxAbout(pieces[i]).grown(m_arrangement->tolerance());
+            m_farLeft = std::min(m_farLeft, box.low.x);
+            m_boxes.add(box);
+        }
+    }
+    m_boxes.finish();
+}
+
+bool Windings::spreadFrom(Index run) {
+    m_waiting.clear();
+    m_waiting.push_back(leaving(run, false));
+    m_waiting.push_back(leaving(run, true));
+    while (!m_waiting.empty()) {
+        const Half half = m_waiting.back();
+        m_waiting.pop_back();
+        const Index node = m_fans->fromNode(half);
+        if (m_isDone[node] != 0) continue;
+        m_isDone[node] = 1;
+        if (carryRound(node, half)) continue;
+        m_conflict = m_arrangement->nodes()[node];
+        return false;
+    }
+    return true;
+}
+
+/// Goes counter-clockwise once round a node from a half whose numbers are known.
+bool Windings::carryRound(Index node, Half known) {
+    const Fan fan = m_fans->at(node);
+    std::size_t start = 0;
+    while (fan.first[start] != known)
+        ++start;
+    const Index knownRun = runOf(known);
+    // What lies clockwise of a half is on its right as it leaves.
+    Weight between = leavesEnd(known) ? onRight(knownRun) : onLeft(knownRun);
+    for (std::size_t step = 1; step < fan.size(); ++step) {
+        const Half half = fan.first[(start + step) % fan.size()];
+        if (!carryTo(half, between)) return false;
+        between = leavesEnd(half) ? onRight(runOf(half)) : onLeft(runOf(half));
+    }
+    return between == (leavesEnd(known) ? onLeft(knownRun) : onRight(knownRun));
+}
+
+bool Windings::carryTo(Half half, Weight clockwiseOfIt) {
+    const Index run = runOf(half);
+    const Weight right = leavesEnd(half) ? clockwiseOfIt - m_fans->weight(run) : clockwiseOfIt;
+    if (m_isKnown[run] != 0) return m_right[run] == right;
+    m_isKnown[run] = 1;
+    m_right[run] = right;
+    m_waiting.push_back(half ^ 1u);
+    return true;
+}
+
+}  // namespace gmregion

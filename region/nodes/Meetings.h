@@ -1,0 +1,71 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <vector>
+
+#include "region/nodes/Strands.h"
+#include "region/search/BoxRow.h"
+
+namespace gmregion {
+
+/// A point that an element has to pass.
+struct Stop {
+    Index element;
+    Index point;   ///< a vertex, or behind the vertices one of Meetings::points()
+    double place;  ///< along the element, 0..1
+};
+
+/// Finds where elements of strands meet: where they cross, where one ends on another, and where
+/// they come nearest without crossing, if that is within the tolerance.
+///
+/// The start of element i is vertex i; behind them come the ends of open strands. Neighbours in a
+/// strand do not meet in their common end.
+class Meetings {
+public:
+    /// Which elements are compared.
+    struct Scope {
+        Index split = kNone;  ///< see Arrangement::settle
+        const std::vector<std::uint8_t>* moved =
+            nullptr;  ///< if given, of each two one that is set
+    };
+
+    /// Cost: that of the pairs of elements whose boxes come near.
+    void find(const Strands& strands, double tolerance, const Scope& scope);
+
+    Index endVertex(Index element) const { return m_endVertex[element]; }
+    std::size_t vertexCount() const { return m_isMet.size(); }
+    Vec2 vertex(Index v) const;
+    /// True for vertices that something else comes near, and for the ends of open strands.
+    bool isMet(Index v) const { return m_isMet[v] != 0; }
+    const std::vector<Vec2>& points() const { return m_points; }
+    /// The stops of an element, from its start to its end: firstStop(e) up to firstStop(e + 1).
+    Index firstStop(Index element) const { return m_firstStop[element]; }
+    const std::vector<Stop>& stops() const { return m_stops; }
+
+private:
+    void prepare(const Strands& strands);
+    void raiseBoxes(const Scope& scope);
+    void meet(Index i, Index j);
+    bool stopAtEnds(Index ends, Index on);
+    void stopAtVertex(Index v, Index on);
+    void stopBoth(Index i, Index j, Vec2 p);
+    bool isNearCommonEnd(Index i, Index j, Vec2 p) const;
+    bool isVertexOf(Index v, Index element) const {
+        return v == element || v == m_endVertex[element];
+    }
+    void addStop(Index element, Index point, Vec2 p);
+    void sortStops();
+
+    const Strands* m_strands = nullptr;
+    double m_tolerance = 0.0;
+    BoxRow m_boxes;
+    BoxRow m_otherBoxes;
+    std::vector<Index> m_endVertex;
+    std::vector<std::uint8_t> m_isMet;
+    std::vector<Vec2> m_points;
+    std::vector<Stop> m_found;
+    std::vector<Stop> m_stops;
+    std::vector<Index> m_firstStop;
+};
+
+}  // namespace gmregion

@@ -1,0 +1,111 @@
+// SPDX-License-Identifier: MIT
+#include "region/overlay/Intake.h"
+
+#include <algorithm>
+#include <cmath>
+
+#include "region/plane/ElementBox.h"
+#include "region/plane/ElementWinding.h"
+
+namespace gmregion {
+
+namespace {
+
+constexpr double kDefaultShare = 1.0 / 1073741824.0;  // 2^-30
+
+bool isFinite(const Element& e) {
+    return std::isfinite(e.sp.x) && std::isfinite(e.sp.y) && std::isfinite(e.ep.x) &&
+           std::isfinite(e.ep.y) && std::isfinite(e.bulge);
+}
+
+double largestOf(Vec2 p) {
+    return std::max(std::fabs(p.x), std::fabs(p.y));
+}
+
+/// Calls visit for an element, or for its halves when it turns by more than half a turn.
+template <class Visit>
+void visitHalves(const Element& e, const Visit& visit) {
+    if (std::fabs(e.bulge) <= 1.0) {
+        visit(e);
+        return;
+    }
+    const Vec2 m = middleOf(e);
+    const double half = e.bulge / (1.0 + std::sqrt(1.0 + e.bulge * e.bulge));
+    visit(Element{e.sp, m, half});
+    visit(Element{m, e.ep, half});
+}
+
+}  // namespace
+
+Extent extentOf(const Paths& paths) {
+    Extent extent;
+    Box box;
+    for (std::size_t i = 0; i < paths.size(); ++i) {
+        for (const Element& e : paths[i]) {
+            const bool inRange = std::max(largestOf(e.sp), largestOf(e.ep)) <= kLargestCoordinate;
+            if (!isFinite(e) || !inRange) {
+                const Reason reason = isFinite(e) ? Reason::kOutOfRange : Reason::kNotFinite;
+                extent.refusal = {reason, isFinite(e) ? e.sp : Point{}, i};
+                return extent;
+            }
+            if (e.sp != e.ep)
+                visitHalves(e, [&](const Element& half) { box.include(boxAbout(half)); });
+        }
+    }
+    if (box.isEmpty()) return extent;
+    extent.size = std::max(box.size().x, box.size().y);
+    extent.largest = std::max(largestOf(box.low), largestOf(box.high));
+    if (!(extent.largest <= 4.0 * kLargestCoordinate))
+        extent.refusal = {Reason::kOutOfRange, {}, 0};
+    return extent;
+}
+
+double toleranceFor(const Extent& extent, double asked) {
+    if (asked != 0.0) return asked;
+    return std::max(extent.size * kDefaultShare, extent.largest * kFinestTolerance);
+}
+
+void appendElement(std::vector<StrandElement>& elements, const Element& e, Index tag) {
+    if (e.sp == e.ep) return;
+    visitHalves(e, [&](const Element& half) {
+        StrandElement piece;
+        static_cast<Element&>(piece) = half;
+        piece.tag = tag;
+        if (piece.sp != piece.ep) elements.push_back(piece);
+    });
+}
+
+Refusal takePaths(const Paths& paths, double tolerance, bool wantClosed, Strands& strands,
+                  std::vector<Origin>& origins) {
+    auto& elements = strands.elements;
+    for (std::size_t i = 0; i < paths.size(); ++i) {
+        const PathView path = paths[i];
+        if (path.size() == 0) continue;
+        if (wantClosed && !path.closed) return {Reason::kOpenPath, path.first->sp, i};
+        const std::size_t count = path.size();
+        for (std::size_t k = 0; k < count; ++k) {
+            const Element& e = path.first[k];
+            const Index tag = static_cast<Index>(origins.size());
+            origins.push_back({path.id, static_cast<std::uint32_t>(k), OriginKind::kElement});
+            appendElement(elements, e, tag);
+            if (k + 1 == count && !path.closed) break;
+            const Vec2 next = path.first[(k + 1) % count].sp;
+            if (next == e.ep) continue;
+            const Vec2 gap = next - e.ep;
+            if (!(dot(gap, gap) <= tolerance * tolerance)) return {Reason::kGap, e.ep, i};
+            appendElement(elements, {e.ep, next, 0.0}, tag);
+        }
+        strands.endStrand(path.closed, {1, 0});
+    }
+    return {};
+}
+
+void takeSet(const RegionSet& set, Weight weight, Index firstTag, Strands& strands) {
+    for (const Loop& loop : set.loops()) {
+        for (Index i = loop.first; i < loop.last; ++i)
+            appendElement(strands.elements, set.elements()[i], firstTag + i);
+        strands.endStrand(true, weight);
+    }
+}
+
+}  // namespace gmregion

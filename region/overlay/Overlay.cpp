@@ -1,0 +1,46 @@
+// SPDX-License-Identifier: MIT
+/// @file
+/// Strands laid over each other.
+///
+/// They are cut at each other, the winding numbers on both sides of every run are found, and those
+/// runs that are covered on one side only bound the result.
+#include "region/overlay/Overlay.h"
+
+namespace gmregion {
+
+bool refuse(Outcome& outcome, const Refusal& refusal) {
+    SetWriter::clear(outcome.regions, 0.0);
+    outcome.marginal.clear();
+    outcome.refusal = refusal;
+    return false;
+}
+
+void beginOutcome(Outcome& outcome, double tolerance) {
+    SetWriter::clear(outcome.regions, tolerance);
+    outcome.marginal.clear();
+    outcome.refusal = {};
+}
+
+bool overlay(Scratch& scratch, double tolerance, Index split, const OriginSource& source,
+             Covers covers, Outcome& outcome) {
+    Arrangement& arrangement = scratch.arrangement;
+    if (!arrangement.settle(tolerance, split)) return refuse(outcome, {Reason::kUnsettled, {}, 0});
+    scratch.fans.build(arrangement);
+    if (!scratch.windings.find(arrangement, scratch.fans))
+        return refuse(outcome, {Reason::kUncertified, scratch.windings.conflict(), 0});
+    scratch.loops.begin(arrangement, scratch.fans);
+    for (Index run = 0; run < arrangement.runs().size(); ++run) {
+        if (!scratch.fans.stands(run)) continue;
+        const bool onLeft = covers(scratch.windings.onLeft(run));
+        const bool onRight = covers(scratch.windings.onRight(run));
+        if (onLeft != onRight) scratch.loops.choose(run, onRight);
+    }
+    if (!scratch.loops.link())
+        return refuse(outcome, {Reason::kUncertified, scratch.loops.conflict(), 0});
+    beginOutcome(outcome, tolerance);
+    if (scratch.writer.write(arrangement, scratch.fans, scratch.loops, source, outcome.regions))
+        return true;
+    return refuse(outcome, {Reason::kUncertified, scratch.writer.conflict(), 0});
+}
+
+}  // namespace gmregion
