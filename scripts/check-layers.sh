@@ -18,12 +18,13 @@ contour='GmApprDepData|GmContour|GmContElement|KxArray'
 declare -A floors=(
     [kernel/values]=1 [kernel/curves]=2 [kernel/contour]=3
     [region/public]=0 [region/model]=1 [region/plane]=2 [region/search]=2 [region/nodes]=3
-    [region/link]=4 [region/overlay]=5 [region/bridge]=4
-    [region/offset]=5 [region/corners]=5 [region/boolean]=5
-    [drawing]=6 [drawing/contours]=7 [drawing/dxf]=7 [drawing/svg]=8 [drawing/files]=9
-    [machining/moves]=10 [machining/runs]=10 [machining/obstacles]=10 [machining/order]=10
-    [machining/gcode]=11 [machining/leads]=11 [machining]=12 [machining/picture]=13
-    [apps/gmpath]=14
+    [region/link]=4 [region/overlay]=5 [region/offset]=6 [region/operations]=7
+    [region/locate]=5 [region/simplify]=5 [region/verify]=8
+    [region/bridge]=4 [region/corners]=7 [region/boolean]=7
+    [drawing]=10 [drawing/contours]=11 [drawing/dxf]=11 [drawing/svg]=12 [drawing/files]=13
+    [machining/moves]=14 [machining/runs]=14 [machining/obstacles]=14 [machining/order]=14
+    [machining/gcode]=15 [machining/leads]=15 [machining]=16 [machining/picture]=17
+    [apps/gmpath]=18
 )
 # Besides the kernel itself these rooms may include its public headers.
 kernel_users='^(region/bridge|machining/leads)$'

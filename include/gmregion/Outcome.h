@@ -39,9 +39,9 @@ struct Refusal {
 struct Outcome {
     RegionSet regions;
     Refusal refusal;
-    /// Points where the result hangs on less than four tolerances: a little more or less, and
-    /// loops would meet or part there. Results are right there, too, but may differ in the number
-    /// of loops from those of the same input moved or turned.
+    /// Points where an offset hangs on some tolerances: necks, gaps and slots that are twice the
+    /// distance wide within the tolerance, and places where boundaries cross by less than four.
+    /// Results are right there, too, but a little more or less would make another number of loops.
     std::vector<Point> marginal;
 };
 

@@ -4,14 +4,16 @@
 ///
 /// The order round a node is that of directions, by a measure that grows with the angle and needs a
 /// division only. Where two directions nearly agree they say nothing, since nodes have moved
-/// elements by up to the tolerance; there the far end of the shorter piece decides, by its side of
-/// the longer one: it lies farther off than the tolerance, or it would be a node of the longer.
+/// elements by up to the tolerance; there the far end of the shorter piece decides, or its middle,
+/// by the side of the longer one: the end lies farther off than the tolerance, or it would be a
+/// node of the longer.
 #include "region/link/Fans.h"
 
 #include <algorithm>
 #include <cmath>
 
 #include "region/plane/Carrier.h"
+#include "region/plane/ElementWinding.h"
 
 namespace gmregion {
 
@@ -52,14 +54,23 @@ Vec2 startDirection(const Element& e) {
     return ((1.0 - b) * (1.0 + b)) * chord + (2.0 * b) * rightNormal(chord);
 }
 
+/// On which side of an element another one from the same point lies that is not longer: by its
+/// middle or its end, whichever is farther aside.
+double sideOfShorter(const Element& longer, const Element& shorter) {
+    const Carrier carrier = carrierOf(longer);
+    const double byEnd = sideOf(carrier, shorter.ep).value;
+    const double byMiddle = sideOf(carrier, middleOf(shorter)).value;
+    return std::fabs(byEnd) > std::fabs(byMiddle) ? byEnd : byMiddle;
+}
+
 /// Whether the one of two elements from the same point, in nearly the same direction, is left of
 /// the other.
 bool isLeft(const Element& a, const Element& b) {
     const Vec2 chordA = a.ep - a.sp;
     const Vec2 chordB = b.ep - b.sp;
     if (a.ep == b.ep) return a.bulge < b.bulge;
-    if (dot(chordA, chordA) <= dot(chordB, chordB)) return sideOf(carrierOf(b), a.ep).value > 0.0;
-    return sideOf(carrierOf(a), b.ep).value < 0.0;
+    if (dot(chordA, chordA) <= dot(chordB, chordB)) return sideOfShorter(b, a) > 0.0;
+    return sideOfShorter(a, b) < 0.0;
 }
 
 }  // namespace

@@ -15,28 +15,43 @@ public:
     /// @param elements of all loops, one after the other
     /// @param ends of each loop, behind its last element
     /// @param areas of each loop, positive for outlines, negative for holes
+    /// @param tolerance loops are farther apart, but where they touch
     /// False when loops do not nest as outlines and holes have to: no outline where something is
-    /// covered, no hole where nothing is; `conflict()` is a point of such a loop.
+    /// covered, no hole where nothing is; `conflict()` is a point of such a loop. Cost: mostly the
+    /// number of loops times a logarithm.
     bool find(const std::vector<Element>& elements, const std::vector<Index>& ends,
-              const std::vector<double>& areas);
+              const std::vector<double>& areas, double tolerance);
 
     /// The outline about a hole; an outline itself.
     Index outlineOf(std::size_t loop) const { return m_outlineOf[loop]; }
     Vec2 conflict() const { return m_conflict; }
 
 private:
-    bool place(std::size_t loop);
-    void castFrom(std::size_t loop);
+    /// The first element that a look to the left finds, kNone when there is none.
+    struct Sight {
+        Index element = kNone;
+        double x = -HUGE_VAL;
+        bool coveredToEast = false;
+    };
+
+    void raiseBoxes();
+    bool isHole(Index loop) const { return !((*m_areas)[loop] > 0.0); }
+    Sight lookLeft(Vec2 from) const;
+    bool place(Index loop);
+    double riseOf(Index element) const;
+    Vec2 startBeside(Index loop) const;
+    bool resolve(Index loop);
+    Index outlineAbout(Index loop);
 
     const std::vector<Element>* m_elements = nullptr;
     const std::vector<Index>* m_ends = nullptr;
     const std::vector<double>* m_areas = nullptr;
+    double m_tolerance = 0.0;
     std::vector<Index> m_loopOf;
+    std::vector<Index> m_beside;  ///< of each hole, a loop that bounds the same region
     std::vector<Index> m_outlineOf;
-    std::vector<int> m_winding;    ///< of each loop about the point in hand
-    std::vector<Index> m_touched;  ///< loops whose elements the ray passed
+    std::vector<int> m_winding;  ///< of each loop about a point
     BoxRow m_boxes;
-    double m_farLeft = 0.0;
     Vec2 m_conflict;
 };
 

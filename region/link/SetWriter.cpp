@@ -6,6 +6,7 @@
 #include <numeric>
 
 #include "region/plane/Carrier.h"
+#include "region/plane/ElementHalves.h"
 #include "region/plane/Measures.h"
 
 namespace gmregion {
@@ -55,9 +56,13 @@ bool SetWriter::write(const Arrangement& arrangement, const Fans& fans, const Lo
         emitLoop();
     }
     if (m_ends.empty()) return true;
-    if (!m_nesting.find(m_elements, m_ends, m_areas)) return false;
+    if (!nest()) return false;
     arrange(set);
     return true;
+}
+
+double SetWriter::area() const {
+    return std::accumulate(m_areas.begin(), m_areas.end(), 0.0);
 }
 
 /// Lists the pieces of a loop in their order, and its area.
@@ -110,6 +115,7 @@ bool SetWriter::sameOrigins(const Item& a, const Item& b) const {
 /// Appends the pieces of a loop, joined where they are parts of one element.
 void SetWriter::emitLoop() {
     const std::size_t count = m_items.size();
+    if (count == 0) return;
     std::size_t start = 0;
     while (start < count && joins(m_items[(start + count - 1) % count], m_items[start]))
         ++start;
@@ -127,17 +133,20 @@ void SetWriter::emitLoop() {
         appendOrigins(item);
         item = next;
     }
-    if (m_elements.size() - first < 2) {
-        // One element cannot close a loop: what was joined to it stays in parts.
-        m_elements.resize(first);
-        m_originEnds.resize(first);
-        m_origins.resize(m_originEnds.empty() ? 0 : m_originEnds.back());
-        for (const Item& part : m_items) {
-            m_elements.push_back(part.element);
-            appendOrigins(part);
-        }
-    }
+    // One element cannot close a loop: what was joined to it stays in parts then.
+    if (m_elements.size() - first < 2) emitParts(first);
     m_ends.push_back(static_cast<Index>(m_elements.size()));
+}
+
+/// Appends the pieces of a loop as they are, in place of what was appended from an element on.
+void SetWriter::emitParts(std::size_t first) {
+    m_elements.resize(first);
+    m_originEnds.resize(first);
+    m_origins.resize(m_originEnds.empty() ? 0 : m_originEnds.back());
+    for (const Item& part : m_items) {
+        m_elements.push_back(part.element);
+        appendOrigins(part);
+    }
 }
 
 /// All origins of a piece, each once.
@@ -156,6 +165,19 @@ void SetWriter::appendOrigins(const Item& item) {
     }
     m_origins.resize(end);
     m_originEnds.push_back(static_cast<Index>(end));
+}
+
+/// Finds which loop lies in which, on elements of half a turn at the most.
+bool SetWriter::nest() {
+    m_halves.clear();
+    m_halfEnds.clear();
+    std::size_t i = 0;
+    for (const Index end : m_ends) {
+        for (; i < end; ++i)
+            visitHalves(m_elements[i], [&](const Element& half) { m_halves.push_back(half); });
+        m_halfEnds.push_back(static_cast<Index>(m_halves.size()));
+    }
+    return m_nesting.find(m_halves, m_halfEnds, m_areas, m_arrangement->tolerance());
 }
 
 /// Puts outlines in their order, each with its holes behind it.

@@ -17,10 +17,14 @@ public:
     /// point near the cause then.
     bool write(const Arrangement& arrangement, const Fans& fans, const Loops& loops,
                const OriginSource& source, RegionSet& set);
+    /// The area of the set written last.
+    double area() const;
     Vec2 conflict() const { return m_nesting.conflict(); }
 
     /// Makes a set empty.
     static void clear(RegionSet& set, double tolerance);
+    /// Lets a set have another tolerance than it was made with.
+    static void setTolerance(RegionSet& set, double tolerance) { set.m_tolerance = tolerance; }
 
 private:
     /// An element on its way into the set.
@@ -35,7 +39,9 @@ private:
     bool joins(const Item& a, const Item& b) const;
     bool sameOrigins(const Item& a, const Item& b) const;
     void emitLoop();
+    void emitParts(std::size_t first);
     void appendOrigins(const Item& item);
+    bool nest();
     void arrange(RegionSet& set);
 
     const Arrangement* m_arrangement = nullptr;
@@ -47,6 +53,8 @@ private:
     std::vector<double> m_areas;
     std::vector<Origin> m_origins;
     std::vector<Index> m_originEnds;
+    std::vector<Element> m_halves;
+    std::vector<Index> m_halfEnds;
     std::vector<Index> m_order;
     Nesting m_nesting;
 };

@@ -8,18 +8,25 @@ namespace gmregion {
 
 namespace {
 
+/// In tolerances: pieces that are long beside what nodes move.
+constexpr double kLong = 1024.0;
+
+double squaredChord(const Element& e) {
+    return dot(e.ep - e.sp, e.ep - e.sp);
+}
+
 /// The longest piece of a run, the first of equal ones.
-Index longestPiece(const Arrangement& arrangement, Index run) {
+const StrandElement& longestPiece(const Arrangement& arrangement, Index run) {
     const Run& r = arrangement.runs()[run];
     Index longest = r.first;
     double length = -1.0;
     for (Index i = r.first; i < r.last; ++i) {
-        const Vec2 chord = arrangement.pieces()[i].ep - arrangement.pieces()[i].sp;
-        if (!(dot(chord, chord) > length)) continue;
-        length = dot(chord, chord);
+        const double squared = squaredChord(arrangement.pieces()[i]);
+        if (!(squared > length)) continue;
+        length = squared;
         longest = i;
     }
-    return longest;
+    return arrangement.pieces()[longest];
 }
 
 Weight times(Weight w, int n) {
@@ -37,20 +44,36 @@ bool Windings::find(const Arrangement& arrangement, Fans& fans) {
     m_isDone.assign(arrangement.nodes().size(), 0);
     for (Index node = 0; node < fans.nodeCount(); ++node)
         fans.sort(node);
-    for (Index run = 0; run < arrangement.runs().size(); ++run) {
-        if (m_isKnown[run] != 0 || !fans.stands(run)) continue;
-        m_right[run] = castFrom(run);
-        m_isKnown[run] = 1;
-        if (arrangement.runs()[run].from != kNone && !spreadFrom(run)) return false;
+    // Parts are begun from runs that are long in comparison to the tolerance, where there are any.
+    const double shortest = kLong * arrangement.tolerance();
+    for (const double squared : {shortest * shortest, -1.0}) {
+        for (Index run = 0; run < arrangement.runs().size(); ++run) {
+            if (m_isKnown[run] != 0 || !fans.stands(run)) continue;
+            if (squaredChord(longestPiece(arrangement, run)) <= squared) continue;
+            if (!findPart(run)) return false;
+        }
     }
     return true;
+}
+
+/// Finds the numbers of the part of the arrangement that a run belongs to.
+bool Windings::findPart(Index run) {
+    m_right[run] = castFrom(run);
+    m_isKnown[run] = 1;
+    if (m_arrangement->runs()[run].from == kNone) return true;
+    m_longest = kNone;
+    m_longestSquared = 0.0;
+    if (!spreadFrom(run)) return false;
+    if (m_longest == kNone || castFrom(m_longest) == m_right[m_longest]) return true;
+    m_conflict = longestPiece(*m_arrangement, m_longest).sp;
+    return false;
 }
 
 /// What lies on the right of a run, by a ray from the middle of its longest piece.
 Weight Windings::castFrom(Index run) {
     if (m_casts++ == 0) raiseBoxes();
-    const Index own = longestPiece(*m_arrangement, run);
-    const StrandElement& e = m_arrangement->pieces()[own];
+    const StrandElement& e = longestPiece(*m_arrangement, run);
+    const std::size_t own = static_cast<std::size_t>(&e - m_arrangement->pieces().data());
     const Vec2 p = middleOf(e);
     Weight sum = times(m_fans->weight(run), windingRightOf(e));
     const Box ray{{m_farLeft, p.y}, p};
@@ -119,6 +142,11 @@ bool Windings::carryTo(Half half, Weight clockwiseOfIt) {
     if (m_isKnown[run] != 0) return m_right[run] == right;
     m_isKnown[run] = 1;
     m_right[run] = right;
+    const double squared = squaredChord(m_fans->firstPiece(half));
+    if (squared > m_longestSquared) {
+        m_longestSquared = squared;
+        m_longest = run;
+    }
     m_waiting.push_back(half ^ 1u);
     return true;
 }

@@ -11,7 +11,7 @@ namespace gmregion {
 /// How often two sets run round what lies on either side of each run.
 ///
 /// One ray for each connected part of the arrangement; from there the numbers are carried from run
-/// to run about the nodes.
+/// to run about the nodes. A second ray from elsewhere has to give the same.
 class Windings {
 public:
     /// False when numbers that come by two ways to the same place differ, which tells that the
@@ -25,6 +25,7 @@ public:
     Vec2 conflict() const { return m_conflict; }
 
 private:
+    bool findPart(Index run);
     Weight castFrom(Index run);
     bool spreadFrom(Index run);
     bool carryRound(Index node, Half known);
@@ -40,6 +41,8 @@ private:
     std::vector<Index> m_runOfPiece;
     BoxRow m_boxes;
     std::size_t m_casts = 0;
+    Index m_longest = kNone;  ///< of the part in hand, the run with the longest piece
+    double m_longestSquared = 0.0;
     double m_farLeft = 0.0;
     Vec2 m_conflict;
 };

@@ -4,8 +4,7 @@
 ///
 /// The points where elements meet, and the vertices that something comes near, are drawn together
 /// to nodes, and every strand becomes the runs between its nodes in the order in which it passes
-/// them. A piece of an arc keeps the curvature of its arc: with s half the curvature times the
-/// chord, its bulge is s / (1 + sqrt(1 - s s)).
+/// them. A piece of an arc turns as its arc does between the piece's ends.
 ///
 /// Whatever was within the tolerance of an element is a node on it now. So two elements that did
 /// not meet were farther apart, and only where one of them was bent by more than half a tolerance
@@ -30,10 +29,7 @@ StrandElement part(const StrandElement& e, Vec2 from, Vec2 to) {
     piece.sp = from;
     piece.ep = to;
     if (e.bulge == 0.0 || (from == e.sp && to == e.ep)) return piece;
-    const Vec2 chord = to - from;
-    const double s =
-        std::clamp(0.5 * carrierOf(e).curvature * std::sqrt(dot(chord, chord)), -1.0, 1.0);
-    piece.bulge = s / (1.0 + std::sqrt((1.0 - s) * (1.0 + s)));
+    piece.bulge = bulgeBetween(carrierOf(e), from, to);
     return piece;
 }
 
@@ -44,14 +40,17 @@ bool Arrangement::settle(double tolerance, Index split) {
     m_settled.clear();
     m_meetings.find(m_in, tolerance, {split, nullptr});
     cutRound(true);
-    for (int round = 1; round < kRounds; ++round) {
+    for (int round = 1;; ++round) {
         const bool any = std::find(m_moved.begin(), m_moved.end(), 1) != m_moved.end();
         if (!any) return true;
         m_meetings.find(m_in, tolerance, {kNone, &m_moved});
-        if (m_meetings.stops().empty()) return true;
+        if (!m_meetings.foundAny()) return true;
+        if (round == kRounds) return false;
+        const std::size_t before = m_in.elements.size();
+        const std::size_t runs = m_runs.size();
         cutRound(false);
+        if (m_in.elements.size() == before && m_runs.size() == runs) return true;
     }
-    return std::find(m_moved.begin(), m_moved.end(), 1) == m_moved.end();
 }
 
 void Arrangement::cutRound(bool first) {

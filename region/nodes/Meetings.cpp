@@ -2,7 +2,7 @@
 /// @file
 /// Where elements meet.
 ///
-/// Every two elements whose boxes, grown by half the tolerance each, have a point in common are
+/// Every two elements whose boxes, grown by the tolerance, have a point in common are
 /// asked. Ends of the one within the tolerance of the other come first; then crossings; then the
 /// place where the carriers come nearest, for elements that do not cross. Lines have no such place
 /// between ends, so an end finds it.
@@ -20,8 +20,15 @@ namespace gmregion {
 
 namespace {
 
+/// Crossings at a smaller sine lie where rounding lets them along the elements.
+constexpr double kShallow = 1e-4;
+
 double squaredLength(Vec2 v) {
     return dot(v, v);
+}
+
+bool isShallow(const Carrier& a, const Carrier& b, Vec2 p) {
+    return std::fabs(cross(sideOf(a, p).gradient, sideOf(b, p).gradient)) < kShallow;
 }
 
 }  // namespace
@@ -31,6 +38,8 @@ void Meetings::find(const Strands& strands, double tolerance, const Scope& scope
     m_tolerance = tolerance;
     m_points.clear();
     m_found.clear();
+    m_shallow.clear();
+    m_turnsBack = false;
     prepare(strands);
     raiseBoxes(scope);
     if (scope.split != kNone) {
@@ -43,6 +52,7 @@ void Meetings::find(const Strands& strands, double tolerance, const Scope& scope
             meet(static_cast<Index>(i), static_cast<Index>(j));
         });
     }
+    stopAtShallow(scope.split);
     sortStops();
 }
 
@@ -57,6 +67,8 @@ Vec2 Meetings::vertex(Index v) const {
 void Meetings::prepare(const Strands& strands) {
     const std::size_t count = strands.elements.size();
     m_endVertex.resize(count);
+    m_carriers.resize(count);
+    m_hasCarrier.assign(count, 0);
     m_isMet.assign(count + strands.strands.size(), 0);
     for (std::size_t s = 0; s < strands.strands.size(); ++s) {
         const Strand& strand = strands.strands[s];
@@ -81,9 +93,22 @@ void Meetings::raiseBoxes(const Scope& scope) {
     m_boxes.begin(split);
     m_otherBoxes.begin(elements.size() - split);
     for (std::size_t i = 0; i < elements.size(); ++i)
-        (i < split ? m_boxes : m_otherBoxes).add(boxAbout(elements[i]).grown(0.5 * m_tolerance));
+        (i < split ? m_boxes : m_otherBoxes).add(boxAbout(elements[i]).grown(m_tolerance));
     m_boxes.finish();
     m_otherBoxes.finish();
+}
+
+const Carrier& Meetings::carrier(Index element) {
+    if (m_hasCarrier[element] == 0) {
+        m_carriers[element] = carrierOf(m_strands->elements[element]);
+        m_hasCarrier[element] = 1;
+    }
+    return m_carriers[element];
+}
+
+const Box& Meetings::boxOf(Index element) const {
+    const std::size_t split = m_boxes.size();
+    return element < split ? m_boxes[element] : m_otherBoxes[element - split];
 }
 
 void Meetings::meet(Index i, Index j) {
@@ -92,46 +117,89 @@ void Meetings::meet(Index i, Index j) {
     const bool thenB = m_endVertex[i] == j;
     const bool thenA = m_endVertex[j] == i;
     if ((thenB && a.joined) || (thenA && b.joined)) return;
+    const std::size_t before = m_found.size();
     const bool endsOfA = stopAtEnds(i, j);
     const bool endsOfB = stopAtEnds(j, i);
-    if (a.bulge == 0.0 && b.bulge == 0.0 && (thenA || thenB || (endsOfA && endsOfB))) return;
-    const Carrier onA = carrierOf(a);
-    const Carrier onB = carrierOf(b);
+    const bool straight = a.bulge == 0.0 && b.bulge == 0.0;
+    const bool backAndForth = a.sp == b.ep && a.ep == b.sp;
+    if (backAndForth && (thenA || thenB)) meetBackAndForth(i, j);
+    if (backAndForth || (a.sp == b.sp && a.ep == b.ep)) return;
+    if (!straight || !(thenA || thenB || (endsOfA && endsOfB))) meetBetween(i, j, thenA || thenB);
+    if (m_found.size() == before) return;
+    // Neighbours that meet again lie side by side from there to their common end, which is where
+    // they turn back.
+    if (thenB) m_isMet[j] = 1;
+    if (thenA) m_isMet[i] = 1;
+}
+
+/// Neighbours with both ends in common that lie side by side need both as nodes.
+void Meetings::meetBackAndForth(Index i, Index j) {
+    const StrandElement& a = m_strands->elements[i];
+    const Vec2 chord = a.ep - a.sp;
+    const double apart = 0.5 * std::fabs(a.bulge + m_strands->elements[j].bulge);
+    if (apart * apart * squaredLength(chord) > m_tolerance * m_tolerance) return;
+    m_turnsBack = m_turnsBack || m_isMet[i] == 0 || m_isMet[j] == 0;
+    m_isMet[i] = 1;
+    m_isMet[j] = 1;
+}
+
+/// Lets elements stop where they cross, or where they come nearest.
+void Meetings::meetBetween(Index i, Index j, bool areNeighbours) {
+    const StrandElement& a = m_strands->elements[i];
+    const StrandElement& b = m_strands->elements[j];
+    const Carrier& onA = carrier(i);
+    const Carrier& onB = carrier(j);
     bool crossed = false;
     for (const Vec2 p : crossings(onA, onB)) {
         const double placeOnA = placeOn(a, p);
         const double placeOnB = placeOn(b, p);
         if (placeOnA < 0.0 || placeOnA > 1.0 || placeOnB < 0.0 || placeOnB > 1.0) continue;
+        if (!isNear(onA, p) || !isNear(onB, p)) continue;
         crossed = true;
-        if (!isNearCommonEnd(i, j, p)) stopBoth(i, j, p);
+        if (isNearCommonEnd(a, b, p)) continue;
+        if (isShallow(onA, onB, p)) m_shallow.push_back(static_cast<Index>(m_points.size()));
+        stopBoth(i, j, p);
     }
-    if (crossed || thenA || thenB) return;
+    if (crossed || areNeighbours) return;
     const std::optional<Vec2> p = nearestApproach(onA, onB);
-    if (!p) return;
+    if (!p || !isNear(onA, *p) || !isNear(onB, *p)) return;
     const Vec2 gap = nearestOn(a, onA, *p) - nearestOn(b, onB, *p);
     const bool near = squaredLength(gap) <= m_tolerance * m_tolerance;
     if (near && squaredLength(nearestOn(a, onA, *p) - *p) <= m_tolerance * m_tolerance)
         stopBoth(i, j, *p);
 }
 
-bool Meetings::isNearCommonEnd(Index i, Index j, Vec2 p) const {
+/// Crossings of carriers that are nearly the same may lie anywhere.
+bool Meetings::isNear(const Carrier& c, Vec2 p) const {
+    return std::fabs(signedDistance(c, p)) <= m_tolerance;
+}
+
+/// Whether a point is an end that both elements have in common, bit by bit, but for the tolerance.
+bool Meetings::isNearCommonEnd(const Element& a, const Element& b, Vec2 p) const {
     const double squared = m_tolerance * m_tolerance;
-    if (m_endVertex[i] == j && squaredLength(vertex(j) - p) <= squared) return true;
-    return m_endVertex[j] == i && squaredLength(vertex(i) - p) <= squared;
+    if ((a.sp == b.sp || a.sp == b.ep) && squaredLength(a.sp - p) <= squared) return true;
+    return (a.ep == b.sp || a.ep == b.ep) && squaredLength(a.ep - p) <= squared;
 }
 
 /// Lets one element stop at the ends of another that lie on it; answers whether there are any.
 bool Meetings::stopAtEnds(Index ends, Index on) {
     const Element& e = m_strands->elements[on];
     const Element& other = m_strands->elements[ends];
-    const Box box = boxAbout(e).grown(m_tolerance);
+    const Box& box = boxOf(on);
     bool any = false;
     for (const bool atEnd : {false, true}) {
         const Vec2 p = atEnd ? other.ep : other.sp;
         if (!box.holds(p)) continue;
         const Index v = atEnd ? m_endVertex[ends] : ends;
         if (isVertexOf(v, on)) continue;
-        if (squaredLength(nearestOn(e, carrierOf(e), p) - p) > m_tolerance * m_tolerance) continue;
+        if (p == e.sp || p == e.ep) {
+            m_isMet[v] = 1;
+            m_isMet[p == e.sp ? on : m_endVertex[on]] = 1;
+            any = true;
+            continue;
+        }
+        if (!isNear(carrier(on), p)) continue;
+        if (squaredLength(nearestOn(e, carrier(on), p) - p) > m_tolerance * m_tolerance) continue;
         m_isMet[v] = 1;
         addStop(on, v, p);
         any = true;
@@ -144,6 +212,23 @@ void Meetings::stopBoth(Index i, Index j, Vec2 p) {
     m_points.push_back(p);
     addStop(i, point, p);
     addStop(j, point, p);
+}
+
+/// Lets whatever comes near a shallow crossing stop there: what runs along one of the two elements
+/// may cross the other one far from there, or not at all.
+void Meetings::stopAtShallow(Index split) {
+    for (const Index number : m_shallow) {
+        const Vec2 p = m_points[number];
+        const Index point = static_cast<Index>(m_isMet.size()) + number;
+        const auto stopHere = [&](std::size_t i) {
+            const Element& e = m_strands->elements[i];
+            const Vec2 away = nearestOn(e, carrier(static_cast<Index>(i)), p) - p;
+            if (squaredLength(away) <= m_tolerance * m_tolerance)
+                addStop(static_cast<Index>(i), point, p);
+        };
+        m_boxes.visitOverlapping({p, p}, stopHere);
+        m_otherBoxes.visitOverlapping({p, p}, [&](std::size_t i) { stopHere(i + split); });
+    }
 }
 
 /// A point beside an end comes between the start and the end, too.

@@ -4,6 +4,7 @@
 #include <vector>
 
 #include "region/nodes/Strands.h"
+#include "region/plane/Carrier.h"
 #include "region/search/BoxRow.h"
 
 namespace gmregion {
@@ -32,6 +33,8 @@ public:
     /// Cost: that of the pairs of elements whose boxes come near.
     void find(const Strands& strands, double tolerance, const Scope& scope);
 
+    /// Whether anything was found but that elements end at common points.
+    bool foundAny() const { return !m_stops.empty() || m_turnsBack; }
     Index endVertex(Index element) const { return m_endVertex[element]; }
     std::size_t vertexCount() const { return m_isMet.size(); }
     Vec2 vertex(Index v) const;
@@ -45,24 +48,34 @@ public:
 private:
     void prepare(const Strands& strands);
     void raiseBoxes(const Scope& scope);
+    const Box& boxOf(Index element) const;
+    const Carrier& carrier(Index element);
     void meet(Index i, Index j);
+    void meetBackAndForth(Index i, Index j);
+    void meetBetween(Index i, Index j, bool areNeighbours);
     bool stopAtEnds(Index ends, Index on);
     void stopAtVertex(Index v, Index on);
     void stopBoth(Index i, Index j, Vec2 p);
-    bool isNearCommonEnd(Index i, Index j, Vec2 p) const;
+    bool isNear(const Carrier& c, Vec2 p) const;
+    bool isNearCommonEnd(const Element& a, const Element& b, Vec2 p) const;
     bool isVertexOf(Index v, Index element) const {
         return v == element || v == m_endVertex[element];
     }
+    void stopAtShallow(Index split);
     void addStop(Index element, Index point, Vec2 p);
     void sortStops();
 
     const Strands* m_strands = nullptr;
     double m_tolerance = 0.0;
+    bool m_turnsBack = false;
     BoxRow m_boxes;
     BoxRow m_otherBoxes;
+    std::vector<Carrier> m_carriers;  ///< of elements that were asked for it
+    std::vector<std::uint8_t> m_hasCarrier;
     std::vector<Index> m_endVertex;
     std::vector<std::uint8_t> m_isMet;
     std::vector<Vec2> m_points;
+    std::vector<Index> m_shallow;  ///< points where elements cross at a small angle
     std::vector<Stop> m_found;
     std::vector<Stop> m_stops;
     std::vector<Index> m_firstStop;

@@ -3,9 +3,9 @@
 /// Clusters with a bounded diameter.
 ///
 /// Uniting whatever is near would let a chain of near points collapse into one node far from most
-/// of them; so a node keeps its place. Nodes are found by cells of the width of the tolerance,
+/// of them; so a node keeps its place. Nodes are found by cells some tolerances wide,
 /// hashed into as many slots as there are points: what is within the tolerance lies in the cell of
-/// a point or in one of the eight about it, and as nodes lie apart, a cell holds few of them.
+/// a point or in one beside it, and as nodes lie apart, a cell holds few of them.
 #include "region/nodes/NodeClusters.h"
 
 #include <algorithm>
@@ -55,12 +55,14 @@ void NodeClusters::take(std::size_t index, Vec2 p) {
 
 /// The node that was begun first of those within the tolerance.
 Index NodeClusters::findNode(Vec2 p) const {
-    const double column = std::floor(p.x / m_tolerance);
-    const double row = std::floor(p.y / m_tolerance);
+    const double firstColumn = columnOf(p.x - m_tolerance);
+    const double firstRow = columnOf(p.y - m_tolerance);
+    const int columns = columnOf(p.x + m_tolerance) > firstColumn ? 2 : 1;
+    const int rows = columnOf(p.y + m_tolerance) > firstRow ? 2 : 1;
     Index first = kNone;
-    for (const double aside : {-1.0, 0.0, 1.0}) {
-        for (const double above : {-1.0, 0.0, 1.0}) {
-            const std::size_t slot = slotOf(column + aside, row + above);
+    for (int i = 0; i < columns; ++i) {
+        for (int j = 0; j < rows; ++j) {
+            const std::size_t slot = slotOf(firstColumn + i, firstRow + j);
             for (Index node = m_latest[slot]; node != kNone; node = m_before[node]) {
                 const Vec2 away = m_nodes[node] - p;
                 if (dot(away, away) <= m_tolerance * m_tolerance) first = std::min(first, node);
@@ -70,8 +72,13 @@ Index NodeClusters::findNode(Vec2 p) const {
     return first;
 }
 
+/// Cells are eight tolerances wide: few points are near the border of one.
+double NodeClusters::columnOf(double coordinate) const {
+    return std::floor(coordinate * (0.125 / m_tolerance));
+}
+
 void NodeClusters::beginNode(Vec2 p) {
-    const std::size_t slot = slotOf(std::floor(p.x / m_tolerance), std::floor(p.y / m_tolerance));
+    const std::size_t slot = slotOf(columnOf(p.x), columnOf(p.y));
     m_before.push_back(m_latest[slot]);
     m_latest[slot] = static_cast<Index>(m_nodes.size());
     m_nodes.push_back(p);

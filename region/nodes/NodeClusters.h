@@ -30,6 +30,7 @@ public:
 
 private:
     Index findNode(Vec2 p) const;
+    double columnOf(double coordinate) const;
     void beginNode(Vec2 p);
     std::size_t slotOf(double column, double row) const;
 

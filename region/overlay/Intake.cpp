@@ -5,7 +5,7 @@
 #include <cmath>
 
 #include "region/plane/ElementBox.h"
-#include "region/plane/ElementWinding.h"
+#include "region/plane/ElementHalves.h"
 
 namespace gmregion {
 
@@ -20,19 +20,6 @@ bool isFinite(const Element& e) {
 
 double largestOf(Vec2 p) {
     return std::max(std::fabs(p.x), std::fabs(p.y));
-}
-
-/// Calls visit for an element, or for its halves when it turns by more than half a turn.
-template <class Visit>
-void visitHalves(const Element& e, const Visit& visit) {
-    if (std::fabs(e.bulge) <= 1.0) {
-        visit(e);
-        return;
-    }
-    const Vec2 m = middleOf(e);
-    const double half = e.bulge / (1.0 + std::sqrt(1.0 + e.bulge * e.bulge));
-    visit(Element{e.sp, m, half});
-    visit(Element{m, e.ep, half});
 }
 
 }  // namespace
@@ -63,6 +50,12 @@ Extent extentOf(const Paths& paths) {
 double toleranceFor(const Extent& extent, double asked) {
     if (asked != 0.0) return asked;
     return std::max(extent.size * kDefaultShare, extent.largest * kFinestTolerance);
+}
+
+Refusal checkedTolerance(const Extent& extent, double tolerance) {
+    const bool isFineEnough = tolerance >= 0.0 && tolerance <= kLargestCoordinate;
+    if (isFineEnough && tolerance >= extent.largest * kFinestTolerance) return {};
+    return {Reason::kTolerance, {}, 0};
 }
 
 void appendElement(std::vector<StrandElement>& elements, const Element& e, Index tag) {

@@ -25,6 +25,10 @@ Extent extentOf(const Paths& paths);
 /// The tolerance to work with: the one asked for, or the default when that is 0.
 double toleranceFor(const Extent& extent, double asked);
 
+/// A refusal where a tolerance is not positive or too fine for the drawing. An empty drawing takes
+/// any that is not negative.
+Refusal checkedTolerance(const Extent& extent, double tolerance);
+
 /// Appends an element, in halves when it turns by more than half a turn; nothing when it has no
 /// length.
 void appendElement(std::vector<StrandElement>& elements, const Element& e, Index tag);

@@ -21,9 +21,11 @@ void beginOutcome(Outcome& outcome, double tolerance) {
     outcome.refusal = {};
 }
 
-bool overlay(Scratch& scratch, double tolerance, Index split, const OriginSource& source,
+bool overlay(OverlayScratch& scratch, double tolerance, Index split, const OriginSource& source,
              Covers covers, Outcome& outcome) {
     Arrangement& arrangement = scratch.arrangement;
+    beginOutcome(outcome, tolerance);
+    if (arrangement.strands().elements.empty()) return true;
     if (!arrangement.settle(tolerance, split)) return refuse(outcome, {Reason::kUnsettled, {}, 0});
     scratch.fans.build(arrangement);
     if (!scratch.windings.find(arrangement, scratch.fans))
@@ -37,7 +39,6 @@ bool overlay(Scratch& scratch, double tolerance, Index split, const OriginSource
     }
     if (!scratch.loops.link())
         return refuse(outcome, {Reason::kUncertified, scratch.loops.conflict(), 0});
-    beginOutcome(outcome, tolerance);
     if (scratch.writer.write(arrangement, scratch.fans, scratch.loops, source, outcome.regions))
         return true;
     return refuse(outcome, {Reason::kUncertified, scratch.writer.conflict(), 0});

@@ -56,4 +56,22 @@ Vec2 footOn(const Carrier& c, Vec2 p) {
     return p - (distance / steepness) * side.gradient;
 }
 
+// The tangent of a quarter of the angle a between two vectors of which the product of the lengths
+// is m: of tan(a/4) = tan(a/2) / (1 + sqrt(1 + tan(a/2)^2)) with tan(a/2) = cross / (m + dot) below
+// a quarter-turn, and with tan(a/2) = (m - dot) / cross above, where that has the digits.
+double bulgeOfTurn(Vec2 from, Vec2 to, bool counterClockwise) {
+    const double m = std::sqrt(dot(from, from) * dot(to, to));
+    const double along = dot(from, to);
+    const double aside = cross(from, to);
+    if (!(m > 0.0)) return 0.0;
+    if (along >= 0.0) return aside / (m + along + std::sqrt(2.0 * m * (m + along)));
+    const double sense = counterClockwise ? 1.0 : -1.0;
+    return sense * (std::sqrt(2.0 * m * (m - along)) - sense * aside) / (m - along);
+}
+
+double bulgeBetween(const Carrier& c, Vec2 from, Vec2 to) {
+    if (c.curvature == 0.0) return 0.0;
+    return bulgeOfTurn(sideOf(c, from).gradient, sideOf(c, to).gradient, c.curvature > 0.0);
+}
+
 }  // namespace gmregion

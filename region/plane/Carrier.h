@@ -35,6 +35,15 @@ double signedDistance(const Carrier& c, Vec2 p);
 /// The point of the carrier nearest to p. For the centre of a circle any of its points.
 Vec2 footOn(const Carrier& c, Vec2 p);
 
+/// The bulge of the arc of a carrier between two points of it, or a little beside it, that turns by
+/// half a turn at the most; against its direction of travel where that is the shorter way.
+double bulgeBetween(const Carrier& c, Vec2 from, Vec2 to);
+
+/// The bulge of an arc that turns from one direction to another, given by vectors of any length
+/// from its centre.
+/// @param counterClockwise decides for directions that are opposite within rounding
+double bulgeOfTurn(Vec2 from, Vec2 to, bool counterClockwise);
+
 /// The value whose sign tells the side of a point, and its gradient: near the carrier the value is
 /// the signed distance and the gradient has length 1.
 struct Side {

@@ -22,6 +22,9 @@ namespace gmregion {
 
 namespace {
 
+/// Arcs of a larger bulge leave their chord far enough to be told by its sides.
+constexpr double kBent = 0.5;
+
 /// The form of a carrier written from another origin: value + gradient x - k/2 x x.
 struct Form {
     double value;
@@ -128,8 +131,14 @@ double placeOn(const Element& e, Vec2 p) {
     const double a = std::sqrt(dot(fromStart, fromStart));
     const double b = std::sqrt(dot(toEnd, toEnd));
     const double place = a + b > 0.0 ? a / (a + b) : 0.0;
-    // Of the circle's points beside the chord, those beyond the centre are not on the arc, which
-    // turns by half a turn at the most. The centre lies at the height L (1 - b^2) / (4 b).
+    if (std::fabs(e.bulge) > kBent) {
+        // Of a circle, the arc is what lies on its own side of the chord.
+        const bool onArc = (cross(chord, fromStart) > 0.0) != (e.bulge > 0.0);
+        if (onArc) return place;
+        return a < b ? -place : 2.0 - place;
+    }
+    // Of the circle's points beside the chord, those beyond the centre are not on the arc. The
+    // centre lies at the height L (1 - b^2) / (4 b).
     const double heights = 4.0 * e.bulge * cross(chord, fromStart);
     const bool beyond = heights > dot(chord, chord) * (1.0 - e.bulge) * (1.0 + e.bulge);
     if (dot(chord, fromStart) < 0.0 || (beyond && a < b)) return -place;

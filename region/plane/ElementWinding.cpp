@@ -8,6 +8,8 @@
 /// halves alike, so that no rounding can count one and miss the other.
 #include "region/plane/ElementWinding.h"
 
+#include <algorithm>
+
 #include "region/plane/Carrier.h"
 
 namespace gmregion {
@@ -43,11 +45,12 @@ int windingOf(const Element& e, Vec2 p) {
 
 int windingRightOf(const Element& e) {
     const Vec2 p = middleOf(e);
-    if (e.bulge > 0.0) return ofChord(e, p, true);
-    if (e.bulge < 0.0) return ofChord(e, p, false) - 1;
+    // Where the middle is no higher than the upper end, by rounding or because the element is
+    // level, the ray runs just above the whole element.
     const bool passes = (e.sp.y > p.y) != (e.ep.y > p.y);
-    if (passes) return ofChord(e, p, true);
-    return e.ep.x > e.sp.x ? -1 : 0;  // the ray runs above a level segment
+    if (!passes && p.y == std::max(e.sp.y, e.ep.y)) return e.ep.x > e.sp.x ? -1 : 0;
+    if (e.bulge < 0.0) return ofChord(e, p, false) - 1;
+    return ofChord(e, p, true);
 }
 
 Vec2 middleOf(const Element& e) {

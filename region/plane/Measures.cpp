@@ -9,7 +9,9 @@
 /// halved down by atan x = 2 atan(x / (1 + sqrt(1 + x x))) until its own series is short.
 #include "region/plane/Measures.h"
 
+#include <array>
 #include <cmath>
+#include <cstddef>
 
 namespace gmregion {
 
@@ -18,17 +20,28 @@ namespace {
 /// Up to this bulge the series of the segment is used; there its last term is below rounding.
 constexpr double kSeriesBulge = 0.25;
 
-double segmentSeries(double b) {
-    const double squared = b * b;
-    double power = b;
-    double sum = b / 3.0;
+/// The coefficients of b (b b)^k, k from 0, of the area of the segment in squares of the chord.
+constexpr auto kSegmentSeries = [] {
+    std::array<double, 15> series{1.0 / 3.0};
     double sign = 1.0;
-    for (int k = 2; k < 16; ++k) {
-        power *= squared;
-        sum += sign * power / ((2.0 * k + 1.0) * (2.0 * k - 1.0) * (2.0 * k - 3.0));
+    for (std::size_t i = 1; i < series.size(); ++i) {
+        const double k = static_cast<double>(i) + 1.0;
+        series[i] = sign / ((2.0 * k + 1.0) * (2.0 * k - 1.0) * (2.0 * k - 3.0));
         sign = -sign;
     }
-    return sum;
+    return series;
+}();
+
+/// The coefficients of x (x x)^k with changing signs of the arc tangent.
+constexpr std::array<double, 11> kArcTangentSeries{1.0,        1.0 / 3.0,  1.0 / 5.0,  1.0 / 7.0,
+                                                   1.0 / 9.0,  1.0 / 11.0, 1.0 / 13.0, 1.0 / 15.0,
+                                                   1.0 / 17.0, 1.0 / 19.0, 1.0 / 21.0};
+
+double segmentSeries(double b) {
+    double sum = 0.0;
+    for (std::size_t i = kSegmentSeries.size(); i-- > 0;)
+        sum = kSegmentSeries[i] + b * b * sum;
+    return b * sum;
 }
 
 /// The area of the segment in squares of the chord, b >= 0.
@@ -48,8 +61,8 @@ double arcTangent(double x) {
     }
     const double squared = x * x;
     double sum = 0.0;
-    for (int k = 10; k >= 0; --k)
-        sum = 1.0 / (2.0 * k + 1.0) - squared * sum;
+    for (std::size_t i = kArcTangentSeries.size(); i-- > 0;)
+        sum = kArcTangentSeries[i] - squared * sum;
     return factor * x * sum;
 }
 

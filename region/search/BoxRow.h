@@ -2,7 +2,10 @@
 #pragma once
 
 #include <algorithm>
+#include <array>
+#include <cmath>
 #include <cstddef>
+#include <utility>
 #include <vector>
 
 #include "region/model/Box.h"
@@ -32,6 +35,30 @@ public:
     template <class Visit>
     void visitOverlapping(const Box& box, const Visit& visit) const {
         if (size() > 0) visitUnder(top(), 0, box, visit);
+    }
+
+    /// Whether isWanted(index) holds for one of the boxes that overlap a box; asked in the order of
+    /// the row until one does.
+    template <class IsWanted>
+    bool anyOverlapping(const Box& box, const IsWanted& isWanted) const {
+        return size() > 0 && anyUnder(top(), 0, box, isWanted);
+    }
+
+    /// Looks from a point to the left, x falling: calls hitAt(index), which answers the x of a hit
+    /// or -infinity, for boxes at the height of the point, rightmost first, as long as they reach
+    /// farther right than the rightmost hit so far. Cost: mostly logarithmic.
+    template <class HitAt>
+    void lookLeft(Vec2 from, const HitAt& hitAt) const {
+        double rightmost = -HUGE_VAL;
+        if (size() > 0) leftUnder(top(), 0, from, rightmost, hitAt);
+    }
+
+    /// Calls visit(index) for boxes near a point, nearer ones first where that costs nothing, until
+    /// all others are farther off than the limit. Distances are squared; visit returns the limit
+    /// from there on, which must not grow.
+    template <class Visit>
+    void visitNear(Vec2 p, double limit, const Visit& visit) const {
+        if (size() > 0) nearUnder(top(), 0, p, limit, visit);
     }
 
     /// Calls visit(i, j) once for every two boxes of the row that overlap, i < j, in an order that
@@ -71,6 +98,65 @@ private:
         }
         for (std::size_t i = index << kBits; i < endUnder(level, index); ++i)
             visitUnder(level - 1, i, box, visit);
+    }
+
+    template <class IsWanted>
+    bool anyUnder(std::size_t level, std::size_t index, const Box& box,
+                  const IsWanted& isWanted) const {
+        if (!boxOf(level, index).overlaps(box)) return false;
+        if (level == 0) return isWanted(index);
+        for (std::size_t i = index << kBits; i < endUnder(level, index); ++i) {
+            if (anyUnder(level - 1, i, box, isWanted)) return true;
+        }
+        return false;
+    }
+
+    template <class HitAt>
+    void leftUnder(std::size_t level, std::size_t index, Vec2 from, double& rightmost,
+                   const HitAt& hitAt) const {
+        if (level == 0) {
+            rightmost = std::max(rightmost, hitAt(index));
+            return;
+        }
+        std::array<std::size_t, std::size_t{1} << kBits> order{};
+        std::size_t count = 0;
+        for (std::size_t i = index << kBits; i < endUnder(level, index); ++i) {
+            const Box& box = boxOf(level - 1, i);
+            if (box.low.y > from.y || box.high.y < from.y || box.low.x > from.x) continue;
+            std::size_t at = count++;
+            for (; at > 0 && boxOf(level - 1, order[at - 1]).high.x < box.high.x; --at)
+                order[at] = order[at - 1];
+            order[at] = i;
+        }
+        for (std::size_t k = 0; k < count; ++k) {
+            if (boxOf(level - 1, order[k]).high.x < rightmost) return;
+            leftUnder(level - 1, order[k], from, rightmost, hitAt);
+        }
+    }
+
+    static double squaredDistance(const Box& box, Vec2 p) {
+        const double dx = std::max({box.low.x - p.x, p.x - box.high.x, 0.0});
+        const double dy = std::max({box.low.y - p.y, p.y - box.high.y, 0.0});
+        return dx * dx + dy * dy;
+    }
+
+    template <class Visit>
+    void nearUnder(std::size_t level, std::size_t index, Vec2 p, double& limit,
+                   const Visit& visit) const {
+        if (level == 0) {
+            limit = visit(index);
+            return;
+        }
+        std::array<std::pair<double, std::size_t>, std::size_t{1} << kBits> under;
+        std::size_t count = 0;
+        for (std::size_t i = index << kBits; i < endUnder(level, index); ++i) {
+            const double distance = squaredDistance(boxOf(level - 1, i), p);
+            if (distance <= limit) under[count++] = {distance, i};
+        }
+        std::sort(under.begin(), under.begin() + count);
+        for (std::size_t i = 0; i < count; ++i) {
+            if (under[i].first <= limit) nearUnder(level - 1, under[i].second, p, limit, visit);
+        }
     }
 
     /// The pairs of which both are under one box.

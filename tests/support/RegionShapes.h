@@ -61,6 +61,18 @@ inline Elements star(std::mt19937& engine, std::size_t count, Vec2 m, double r) 
     return loop;
 }
 
+/// A path turned about the origin, by radians, then moved.
+inline Elements placed(Elements path, Vec2 by, double angle) {
+    const double c = std::cos(angle);
+    const double s = std::sin(angle);
+    const auto place = [&](Vec2 p) {
+        return Vec2{c * p.x - s * p.y + by.x, s * p.x + c * p.y + by.y};
+    };
+    for (Element& e : path)
+        e = {place(e.sp), place(e.ep), e.bulge};
+    return path;
+}
+
 inline double area(const RegionSet& set) {
     double sum = 0.0;
     const Vec2 about = set.empty() ? Vec2{} : set.elements().front().sp;

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "gmregion/Workspace.h"
 
-#include "region/overlay/Scratch.h"
+#include "region/operations/Scratch.h"
 
 namespace gmregion {
 

@@ -11,14 +11,15 @@
 
 namespace gmregion {
 
-/// What a workspace holds.
-struct Scratch {
+/// Working memory of laying strands over each other.
+struct OverlayScratch {
     Arrangement arrangement;
     Fans fans;
     Windings windings;
     Loops loops;
     SetWriter writer;
-    std::vector<Origin> origins;
+    std::vector<Origin> origins;    ///< of the operands, where they are listed
+    std::vector<Index> originEnds;  ///< behind the last origin of each tag
 };
 
 }  // namespace gmregion

@@ -3,6 +3,7 @@
 
 #include <algorithm>
 
+#include "region/operations/Scratch.h"
 #include "region/overlay/Intake.h"
 #include "region/overlay/Overlay.h"
 
@@ -27,23 +28,20 @@ Covers coveredBy(Combination combination) {
 
 bool combine(const RegionSet& first, const RegionSet& second, Combination combination,
              Workspace& workspace, Outcome& outcome) {
-    Scratch& scratch = workspace.scratch();
+    OverlayScratch& scratch = workspace.scratch().overlay;
     const double tolerance = std::max(first.tolerance(), second.tolerance());
-    Strands& strands = scratch.arrangement.strands();
-    strands.clear();
     const Index split = static_cast<Index>(first.elements().size());
-    takeSet(first, {1, 0}, 0, strands);
-    const Index firstOfSecond = static_cast<Index>(strands.elements.size());
-    takeSet(second, {0, 1}, split, strands);
-    if (strands.elements.empty()) {
-        beginOutcome(outcome, tolerance);
-        return true;
-    }
     OriginSource source;
     source.first = &first;
     source.second = &second;
     source.split = split;
-    return overlay(scratch, tolerance, firstOfSecond, source, coveredBy(combination), outcome);
+    const auto fill = [&](Strands& strands) {
+        takeSet(first, {1, 0}, 0, strands);
+        const Index firstOfSecond = static_cast<Index>(strands.elements.size());
+        takeSet(second, {0, 1}, split, strands);
+        return firstOfSecond;
+    };
+    return overlayTwice(scratch, tolerance, fill, source, coveredBy(combination), outcome);
 }
 
 Outcome combine(const RegionSet& first, const RegionSet& second, Combination combination) {
@@ -54,26 +52,31 @@ Outcome combine(const RegionSet& first, const RegionSet& second, Combination com
 }
 
 bool uniteAll(const RegionSet* sets, std::size_t count, Workspace& workspace, Outcome& outcome) {
-    Scratch& scratch = workspace.scratch();
-    Strands& strands = scratch.arrangement.strands();
-    strands.clear();
+    OverlayScratch& scratch = workspace.scratch().overlay;
     scratch.origins.clear();
+    scratch.originEnds.clear();
     double tolerance = 0.0;
     for (std::size_t i = 0; i < count; ++i) {
-        const RegionSet& set = sets[i];
-        tolerance = std::max(tolerance, set.tolerance());
-        takeSet(set, {1, 0}, static_cast<Index>(scratch.origins.size()), strands);
-        for (std::size_t k = 0; k < set.elements().size(); ++k)
-            scratch.origins.push_back(*set.origins(k).begin());
-    }
-    if (strands.elements.empty()) {
-        beginOutcome(outcome, tolerance);
-        return true;
+        tolerance = std::max(tolerance, sets[i].tolerance());
+        for (std::size_t k = 0; k < sets[i].elements().size(); ++k) {
+            const Origins origins = sets[i].origins(k);
+            scratch.origins.insert(scratch.origins.end(), origins.begin(), origins.end());
+            scratch.originEnds.push_back(static_cast<Index>(scratch.origins.size()));
+        }
     }
     OriginSource source;
     source.list = &scratch.origins;
-    return overlay(
-        scratch, tolerance, kNone, source, [](Weight w) { return w.a > 0; }, outcome);
+    source.ends = &scratch.originEnds;
+    const auto fill = [&](Strands& strands) {
+        Index firstTag = 0;
+        for (std::size_t i = 0; i < count; ++i) {
+            takeSet(sets[i], {1, 0}, firstTag, strands);
+            firstTag += static_cast<Index>(sets[i].elements().size());
+        }
+        return kNone;
+    };
+    const Covers covers = [](Weight w) { return w.a > 0; };
+    return overlayTwice(scratch, tolerance, fill, source, covers, outcome);
 }
 
 }  // namespace gmregion

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "gmregion/CleanUp.h"
 
+#include "region/operations/Scratch.h"
 #include "region/overlay/Intake.h"
 #include "region/overlay/Overlay.h"
 
@@ -27,25 +28,23 @@ double defaultTolerance(const Paths& paths) {
 
 bool cleanUp(const Paths& paths, const CleanUpOptions& options, Workspace& workspace,
              Outcome& outcome) {
-    Scratch& scratch = workspace.scratch();
+    OverlayScratch& scratch = workspace.scratch().overlay;
     const Extent extent = extentOf(paths);
     if (extent.refusal) return refuse(outcome, extent.refusal);
     const double tolerance = toleranceFor(extent, options.tolerance);
-    const bool isFine = !(tolerance >= extent.largest * kFinestTolerance) || tolerance < 0.0;
-    if (isFine || !(tolerance <= kLargestCoordinate))
-        return refuse(outcome, {Reason::kTolerance, {}, 0});
-    Strands& strands = scratch.arrangement.strands();
-    strands.clear();
-    scratch.origins.clear();
-    const Refusal refusal = takePaths(paths, tolerance, true, strands, scratch.origins);
+    Refusal refusal = checkedTolerance(extent, tolerance);
     if (refusal) return refuse(outcome, refusal);
-    if (strands.elements.empty()) {
-        beginOutcome(outcome, tolerance);
-        return true;
-    }
     OriginSource source;
     source.list = &scratch.origins;
-    return overlay(scratch, tolerance, kNone, source, coveredBy(options.rule), outcome);
+    const auto fill = [&](Strands& strands) {
+        scratch.origins.clear();
+        refusal = takePaths(paths, tolerance, true, strands, scratch.origins);
+        if (refusal) strands.clear();
+        return kNone;
+    };
+    const bool found =
+        overlayTwice(scratch, tolerance, fill, source, coveredBy(options.rule), outcome);
+    return refusal ? refuse(outcome, refusal) : found;
 }
 
 Outcome cleanUp(const Paths& paths, const CleanUpOptions& options) {
