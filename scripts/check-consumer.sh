@@ -16,6 +16,7 @@ echo "-- by CMake"
 cmake -S tests/consumer -B "$work/build" -G Ninja -DCMAKE_PREFIX_PATH="$prefix" >/dev/null
 cmake --build "$work/build"
 "$work/build/consumer"
+"$work/build/regions"
 
 echo "-- by pkg-config"
 PKG_CONFIG_PATH=$(dirname "$(find "$prefix" -name gmkernel.pc)")
@@ -25,6 +26,10 @@ read -ra flags <<<"$(pkg-config --cflags --libs gmkernel)"
 flags+=("-Wl,-rpath,$libdir")
 g++ -std=c++20 -Wall -Wextra -Werror tests/consumer/main.cpp "${flags[@]}" -o "$work/consumer"
 "$work/consumer"
+read -ra region_flags <<<"$(pkg-config --cflags --libs gmregion)"
+g++ -std=c++20 -Wall -Wextra -Werror tests/consumer/regions.cpp "${region_flags[@]}" \
+    "-Wl,-rpath,$libdir" -o "$work/regions"
+"$work/regions"
 
 echo "-- the example of the README"
 awk '/^```cpp$/ { inside = 1; next } /^```$/ { inside = 0 } inside' README.md >"$work/readme.cpp"

@@ -1,11 +1,11 @@
 #!/usr/bin/env bash
-# Compares the symbols that the shared library shows with the list kept in the project.
+# Compares the symbols that a shared library shows with its list kept in the project.
 #   scripts/exported-symbols.sh LIBRARY            shows the differences and fails if there are any
 #   scripts/exported-symbols.sh LIBRARY --update   writes the list anew
 set -euo pipefail
 library=$(realpath "${1:?usage: $0 LIBRARY [--update]}")
 cd "$(dirname "$0")/.."
-list=tests/abi/exported-symbols.txt
+list=tests/abi/$(basename "${library%.so*}").txt
 
 # Address and kind go: the kind of a symbol differs between compilers, the name does not. The
 # variants of one constructor or destructor share a readable name, hence -u.

@@ -120,7 +120,7 @@ public:
     std::vector<std::size_t> regionsIn(std::size_t region) const;
 
 private:
-    struct Store;
+    struct GMREGION_NO_EXPORT Store;
     std::unique_ptr<Store> m_store;
 };
 
