@@ -24,6 +24,10 @@ enum class Combination : std::uint8_t {
 /// The tolerance of the result is the larger of both. Origins are those of the elements; where
 /// elements of both sets coincide, of both. Empty sets are allowed. Cost: near-linear in the number
 /// of elements and of places where the sets meet.
+/// @param first the one set
+/// @param second the other one
+/// @param combination what to make of them
+/// @param workspace working memory of the call
 /// @param outcome gets the result; must not hold one of the operands
 /// @return whether there is a result
 GMREGION_EXPORT bool combine(const RegionSet& first, const RegionSet& second,
@@ -34,7 +38,11 @@ GMREGION_EXPORT Outcome combine(const RegionSet& first, const RegionSet& second,
                                 Combination combination);
 
 /// The union of any number of sets, in one go.
-/// @param sets the first of `count` sets; not looked at when there are none
+/// @param sets the first of the sets; not looked at when there are none
+/// @param count how many there are
+/// @param workspace working memory of the call
+/// @param outcome gets the result; must not hold one of the sets
+/// @return whether there is a result
 GMREGION_EXPORT bool uniteAll(const RegionSet* sets, std::size_t count, Workspace& workspace,
                               Outcome& outcome);
 

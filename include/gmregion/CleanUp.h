@@ -38,6 +38,9 @@ GMREGION_EXPORT double defaultTolerance(const Paths& paths);
 /// the tolerance, and a tolerance that is negative or below a 2^-44th of the largest coordinate.
 /// Elements without length are passed over, whatever their bulge. Cost: near-linear in the number
 /// of elements and of places where they meet.
+/// @param paths the loops
+/// @param options fill rule and tolerance
+/// @param workspace working memory of the call
 /// @param outcome gets the result; its memory is used again
 /// @return whether there is a result
 GMREGION_EXPORT bool cleanUp(const Paths& paths, const CleanUpOptions& options,

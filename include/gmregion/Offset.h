@@ -41,7 +41,10 @@ struct OffsetOptions {
 /// the distance wide, nothing of zero width is left. Arcs stay true arcs. The result is within the
 /// tolerance of the exact one. Cost: near-linear in the number of elements and of places where raw
 /// parallels meet.
+/// @param source the set to be offset
 /// @param distance in length units, positive outward, negative inward; 0 copies the source
+/// @param options joins; ends do not matter
+/// @param workspace working memory of the call
 /// @param outcome gets the result; must not hold the source
 /// @return whether there is a result
 GMREGION_EXPORT bool offset(const RegionSet& source, double distance, const OffsetOptions& options,
@@ -52,7 +55,11 @@ GMREGION_EXPORT Outcome offset(const RegionSet& source, double distance,
                                const OffsetOptions& options = {});
 
 /// Several offsets of one set, each measured from the source. Stops at the first refusal.
-/// @param distances `count` of them
+/// @param source the set to be offset
+/// @param distances in length units, positive outward
+/// @param count how many there are
+/// @param options joins; ends do not matter
+/// @param workspace working memory of the call
 /// @param outcomes as many, which get the results
 /// @return whether all of them have a result
 GMREGION_EXPORT bool offsetSeries(const RegionSet& source, const double* distances,
@@ -61,14 +68,23 @@ GMREGION_EXPORT bool offsetSeries(const RegionSet& source, const double* distanc
 
 /// What open paths cover when they are drawn with a pen: all points within half the width of a
 /// path, with ends as the options say.
+/// @param paths open ones; a closed one covers both its sides
 /// @param halfWidth in length units, positive
 /// @param tolerance as for cleanUp(); 0 for the default
+/// @param options joins and ends
+/// @param workspace working memory of the call
+/// @param outcome gets the result
+/// @return whether there is a result
 GMREGION_EXPORT bool thicken(const Paths& paths, double halfWidth, double tolerance,
                              const OffsetOptions& options, Workspace& workspace, Outcome& outcome);
 
 /// What a disc of that radius covers when it moves within the set: an inward offset, then the same
 /// outward. Corners that open are rounded, necks and tips narrower than the disc vanish.
-/// @param radius in length units, positive
+/// @param source the set to be opened
+/// @param radius in length units, 0 or more
+/// @param workspace working memory of the call
+/// @param outcome gets the result; must not hold the source
+/// @return whether there is a result
 GMREGION_EXPORT bool opened(const RegionSet& source, double radius, Workspace& workspace,
                             Outcome& outcome);
 

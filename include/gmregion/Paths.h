@@ -28,6 +28,8 @@ class Paths {
 public:
     /// Appends a path. Its elements follow each other; where one starts beside the end of the one
     /// before, operations close the gap if it is within the tolerance, and refuse it otherwise.
+    /// @param first its first element
+    /// @param last behind its last element
     /// @param closed whether the last element ends where the first starts
     /// @param id a number of the caller's, found again in the origins of results
     void add(const Element* first, const Element* last, bool closed, std::int64_t id) {

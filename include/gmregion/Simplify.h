@@ -70,6 +70,8 @@ struct Simplified {
 ///
 /// Cost: n log n. Method: greedy, the longest run that one arc stands for, or two where tangents
 /// are given, by doubling and halving.
+/// @param paths what is to be replaced
+/// @param options tolerance and angles
 /// @param result gets the result; its memory is used again; must not hold the source
 /// @return whether there is a result
 GMREGION_EXPORT bool simplify(const Paths& paths, const SimplifyOptions& options,
@@ -97,8 +99,12 @@ struct TangentPoint {
 /// Two points of the same place with different tangents make a corner where `corner` says so.
 /// Other options, refusals and cost as for paths; the one path of the result has the number 0, and
 /// element i of the source is the piece of the curve from point i to the next.
-/// @param points the first of `count` points, two at least
+/// @param points the first of the points
+/// @param count how many there are, two at least
 /// @param closed whether the curve goes on from the last point to the first
+/// @param options tolerance and angles
+/// @param result gets the result; its memory is used again
+/// @return whether there is a result
 GMREGION_EXPORT bool simplifyCurve(const TangentPoint* points, std::size_t count, bool closed,
                                    const SimplifyOptions& options, Simplified& result);
 
