@@ -8,6 +8,8 @@
 /// a hole.
 #include "region/link/Loops.h"
 
+#include <algorithm>
+
 namespace gmregion {
 
 void Loops::begin(const Arrangement& arrangement, Fans& fans) {

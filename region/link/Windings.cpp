@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: MIT
 #include "region/link/Windings.h"
 
+#include <algorithm>
+
 #include "region/plane/ElementBox.h"
 #include "region/plane/ElementWinding.h"
 

@@ -8,6 +8,7 @@
 /// from the start.
 #include "gmregion/Offset.h"
 
+#include <algorithm>
 #include <cmath>
 
 #include "region/operations/Scratch.h"
