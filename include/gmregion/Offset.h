@@ -42,7 +42,8 @@ struct OffsetOptions {
 /// tolerance of the exact one. Cost: near-linear in the number of elements and of places where raw
 /// parallels meet.
 /// @param source the set to be offset
-/// @param distance in length units, positive outward, negative inward; 0 copies the source
+/// @param distance in length units, positive outward, negative inward; up to half the tolerance
+/// copies the source
 /// @param options joins; ends do not matter
 /// @param workspace working memory of the call
 /// @param outcome gets the result; must not hold the source
@@ -79,7 +80,8 @@ GMREGION_EXPORT bool thicken(const Paths& paths, double halfWidth, double tolera
                              const OffsetOptions& options, Workspace& workspace, Outcome& outcome);
 
 /// What a disc of that radius covers when it moves within the set: an inward offset, then the same
-/// outward. Corners that open are rounded, necks and tips narrower than the disc vanish.
+/// outward. Corners that open are rounded, necks and tips narrower than the disc vanish. Works in
+/// memory of its own for the step between.
 /// @param source the set to be opened
 /// @param radius in length units, 0 or more
 /// @param workspace working memory of the call

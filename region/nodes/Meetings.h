@@ -54,7 +54,6 @@ private:
     void meetBackAndForth(Index i, Index j);
     void meetBetween(Index i, Index j, bool areNeighbours);
     bool stopAtEnds(Index ends, Index on);
-    void stopAtVertex(Index v, Index on);
     void stopBoth(Index i, Index j, Vec2 p);
     bool isNear(const Carrier& c, Vec2 p) const;
     bool isNearCommonEnd(const Element& a, const Element& b, Vec2 p) const;

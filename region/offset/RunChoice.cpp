@@ -24,8 +24,8 @@ namespace gmregion {
 
 namespace {
 
-// In tolerances: something is nearer by less for what is in, by more for what is out; between the
-// first and the last of them there is doubt.
+// By how many tolerances something else is nearer: up to the first that is rounding; up to kIn a
+// run is in, beyond it out; between kSurelyIn and kSurelyOut there is doubt.
 constexpr double kCertain = 1.0 / 1024.0;
 constexpr double kSurelyIn = 1.0 / 16.0;
 constexpr double kIn = 0.5;

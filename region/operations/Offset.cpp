@@ -4,8 +4,8 @@
 ///
 /// Round joins and ends go by raw parallels. Should the result not pass its check, the same is
 /// tried without trimmed neighbours, then a third of a tolerance beside the distance, where no
-/// threshold is the same, and then as a union of strips. Other joins and ends are unions of strips
-/// from the start.
+/// threshold is the same, then as a union of strips, and at last so with half the tolerance. Other
+/// joins and ends are unions of strips from the start.
 #include "gmregion/Offset.h"
 
 #include <algorithm>
@@ -21,6 +21,8 @@ namespace {
 
 /// In distances: the coarsest tolerance that an offset is computed with.
 constexpr double kCoarsest = 1.0 / 64.0;
+/// In tolerances: an offset by no more is a copy.
+constexpr double kCopies = 0.5;
 /// In tolerances: how far beside the distance a second attempt goes.
 constexpr double kBeside = 1.0 / 3.0;
 
@@ -84,7 +86,8 @@ bool offsetSeries(const RegionSet& source, const double* distances, std::size_t 
     for (std::size_t i = 0; i < count; ++i) {
         const Refusal refusal = checked(distances[i], options);
         if (refusal) return refuse(outcomes[i], refusal);
-        if (source.empty() || distances[i] == 0.0) {
+        const bool isCopy = std::fabs(distances[i]) <= kCopies * source.tolerance();
+        if (source.empty() || isCopy) {
             outcomes[i].regions = source;
             outcomes[i].marginal.clear();
             outcomes[i].refusal = {};

@@ -282,6 +282,12 @@ TEST(Offset, RefusesWhatItCannotAnswer) {
     EXPECT_EQ(offset(square, 1, {Join::kMiter, End::kRound, 0.5}).refusal.reason,
               Reason::kOutOfRange);
     EXPECT_TRUE(offset(RegionSet{}, 1).regions.empty());
+    // Distances about and below the tolerance are no trouble.
+    for (double d = 1e-18; d < 1e-4; d *= 3.7) {
+        for (const double distance : {d, -d})
+            EXPECT_NEAR(area(offsetOf(square, distance)), 100 + 40 * distance,
+                        40 * square.tolerance() + 8 * d * d);
+    }
     Workspace workspace;
     Outcome outcome;
     EXPECT_FALSE(thicken(Paths{}, -1, 0, {}, workspace, outcome));
