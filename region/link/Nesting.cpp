@@ -79,6 +79,17 @@ double Nesting::riseOf(Index element) const {
     return m_boxes[element].size().y;
 }
 
+/// Where a look to the left meets an element for the last time; where it starts if it does not.
+double Nesting::lastLeft(const Element& e, Vec2 from) const {
+    // An element that turns by half a turn at the most meets a level twice at the most.
+    for (int i = 0; i < 2; ++i) {
+        const LevelHit hit = hitLeftOf(e, {from.x - kStep * m_tolerance, from.y});
+        if (!std::isfinite(hit.x)) break;
+        from.x = hit.x;
+    }
+    return from.x;
+}
+
 /// A point right beside a loop's element that reaches far left, from where the look meets it. The
 /// element is no level one, unless the whole loop is hardly higher.
 Vec2 Nesting::startBeside(Index loop) const {
@@ -95,6 +106,7 @@ Vec2 Nesting::startBeside(Index loop) const {
         if (!(box.low.x < left) || riseOf(i) < enough) continue;
         left = box.low.x;
         start = {box.high.x + m_tolerance, 0.5 * (box.low.y + box.high.y)};
+        start.x = lastLeft((*m_elements)[i], start) + kStep * m_tolerance;
     }
     return start;
 }

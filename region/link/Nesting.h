@@ -39,6 +39,7 @@ private:
     Sight lookLeft(Vec2 from) const;
     bool place(Index loop);
     double riseOf(Index element) const;
+    double lastLeft(const Element& e, Vec2 from) const;
     Vec2 startBeside(Index loop) const;
     bool resolve(Index loop);
     Index outlineAbout(Index loop);

@@ -11,31 +11,34 @@ namespace gmregion {
 
 void BoundaryIndex::take(const RegionSet& set) {
     m_pieces.clear();
+    m_loops.clear();
     for (std::size_t loop = 0; loop < set.loops().size(); ++loop) {
         for (Index i = set.loops()[loop].first; i < set.loops()[loop].last; ++i)
-            append(set.elements()[i], i, static_cast<Index>(loop));
+            append(set.elements()[i], i);
+        m_loops.endChain(static_cast<Index>(m_pieces.size()));
     }
     index();
 }
 
 void BoundaryIndex::take(const LoopsView& view) {
     m_pieces.clear();
+    m_loops.clear();
     Index i = 0;
     for (std::size_t loop = 0; loop < view.loopEnds->size(); ++loop) {
         for (; i < (*view.loopEnds)[loop]; ++i)
-            append((*view.elements)[i], i, static_cast<Index>(loop));
+            append((*view.elements)[i], i);
+        m_loops.endChain(static_cast<Index>(m_pieces.size()));
     }
     index();
 }
 
-void BoundaryIndex::append(const Element& e, Index element, Index loop) {
+void BoundaryIndex::append(const Element& e, Index element) {
     visitHalves(e, [&](const Element& half) {
         if (half.sp == half.ep) return;
         BoundaryPiece piece;
         static_cast<Element&>(piece) = half;
         piece.carrier = carrierOf(half);
         piece.element = element;
-        piece.loop = loop;
         m_pieces.push_back(piece);
     });
 }
@@ -45,10 +48,6 @@ void BoundaryIndex::index() {
     for (const BoundaryPiece& piece : m_pieces)
         m_boxes.add(boxAbout(piece));
     m_boxes.finish();
-}
-
-int BoundaryIndex::pieceWinding(std::size_t piece, Vec2 p) const {
-    return windingOf(m_pieces[piece], p);
 }
 
 int BoundaryIndex::windingAbout(Vec2 p) const {

@@ -28,7 +28,13 @@ public:
     /// strands as they were, cut at nodes.
     Strands& strands() { return m_in; }
 
-    /// Cuts the strands. False when nodes have not come to rest after three rounds.
+    /// Lets the next calls compare so many pairs of elements altogether.
+    void allow(std::uint64_t pairs) { m_meetings.allow(pairs); }
+    /// Whether that many have been compared.
+    bool isAtLimit() const { return m_meetings.isAtLimit(); }
+
+    /// Cuts the strands. False when nodes have not come to rest after three rounds, or when there
+    /// are more pairs than allowed.
     /// @param tolerance in length units, positive
     /// @param split where it is not kNone, elements before and from that number on are two clean
     /// sets, and those of one of them are not compared with each other
@@ -38,6 +44,8 @@ public:
     /// Along each strand in their order.
     const std::vector<Run>& runs() const { return m_runs; }
     const std::vector<StrandElement>& pieces() const { return m_in.elements; }
+    /// The strands as ranges of the pieces.
+    const std::vector<Strand>& strandsCut() const { return m_in.strands; }
     double tolerance() const { return m_tolerance; }
 
 private:

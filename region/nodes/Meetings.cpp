@@ -33,7 +33,7 @@ bool isShallow(const Carrier& a, const Carrier& b, Vec2 p) {
 
 }  // namespace
 
-void Meetings::find(const Strands& strands, double tolerance, const Scope& scope) {
+bool Meetings::find(const Strands& strands, double tolerance, const Scope& scope) {
     m_strands = &strands;
     m_tolerance = tolerance;
     m_points.clear();
@@ -42,18 +42,33 @@ void Meetings::find(const Strands& strands, double tolerance, const Scope& scope
     m_turnsBack = false;
     prepare(strands);
     raiseBoxes(scope);
-    if (scope.split != kNone) {
-        m_boxes.visitPairsWith(m_otherBoxes, [&](std::size_t i, std::size_t j) {
-            meet(static_cast<Index>(i), static_cast<Index>(j) + scope.split);
-        });
-    } else {
-        m_boxes.visitPairs([&](std::size_t i, std::size_t j) {
-            if (scope.moved && (*scope.moved)[i] == 0 && (*scope.moved)[j] == 0) return;
-            meet(static_cast<Index>(i), static_cast<Index>(j));
-        });
-    }
+    if (!meetPairs(scope)) return false;
     stopAtShallow(scope.split);
     sortStops();
+    return true;
+}
+
+bool Meetings::takePair() {
+    if (m_pairsLeft == 0) return false;
+    --m_pairsLeft;
+    return true;
+}
+
+/// False when there are more pairs than allowed.
+bool Meetings::meetPairs(const Scope& scope) {
+    if (scope.split != kNone) {
+        return m_boxes.visitPairsWith(m_otherBoxes, [&](std::size_t i, std::size_t j) {
+            if (!takePair()) return false;
+            meet(static_cast<Index>(i), static_cast<Index>(j) + scope.split);
+            return true;
+        });
+    }
+    return m_boxes.visitPairs([&](std::size_t i, std::size_t j) {
+        if (scope.moved && (*scope.moved)[i] == 0 && (*scope.moved)[j] == 0) return true;
+        if (!takePair()) return false;
+        meet(static_cast<Index>(i), static_cast<Index>(j));
+        return true;
+    });
 }
 
 Vec2 Meetings::vertex(Index v) const {

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include <cstdint>
 #include <vector>
 
 #include "region/nodes/Strands.h"
@@ -30,8 +31,14 @@ public:
             nullptr;  ///< if given, of each two one that is set
     };
 
-    /// Cost: that of the pairs of elements whose boxes come near.
-    void find(const Strands& strands, double tolerance, const Scope& scope);
+    /// Lets the next calls compare so many pairs of elements altogether.
+    void allow(std::uint64_t pairs) { m_pairsLeft = pairs; }
+
+    bool isAtLimit() const { return m_pairsLeft == 0; }
+
+    /// False when that needs more pairs than allowed. Cost: that of the pairs of elements whose
+    /// boxes come near.
+    bool find(const Strands& strands, double tolerance, const Scope& scope);
 
     /// Whether anything was found but that elements end at common points.
     bool foundAny() const { return !m_stops.empty() || m_turnsBack; }
@@ -48,6 +55,8 @@ public:
 private:
     void prepare(const Strands& strands);
     void raiseBoxes(const Scope& scope);
+    bool takePair();
+    bool meetPairs(const Scope& scope);
     const Box& boxOf(Index element) const;
     const Carrier& carrier(Index element);
     void meet(Index i, Index j);
@@ -66,6 +75,7 @@ private:
 
     const Strands* m_strands = nullptr;
     double m_tolerance = 0.0;
+    std::uint64_t m_pairsLeft = UINT64_MAX;
     bool m_turnsBack = false;
     BoxRow m_boxes;
     BoxRow m_otherBoxes;

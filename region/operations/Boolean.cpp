@@ -28,7 +28,7 @@ Covers coveredBy(Combination combination) {
 
 bool combine(const RegionSet& first, const RegionSet& second, Combination combination,
              Workspace& workspace, Outcome& outcome) {
-    OverlayScratch& scratch = workspace.scratch().overlay;
+    OverlayScratch& scratch = workspace.begin().overlay;
     const double tolerance = std::max(first.tolerance(), second.tolerance());
     const Index split = static_cast<Index>(first.elements().size());
     OriginSource source;
@@ -52,7 +52,7 @@ Outcome combine(const RegionSet& first, const RegionSet& second, Combination com
 }
 
 bool uniteAll(const RegionSet* sets, std::size_t count, Workspace& workspace, Outcome& outcome) {
-    OverlayScratch& scratch = workspace.scratch().overlay;
+    OverlayScratch& scratch = workspace.begin().overlay;
     scratch.origins.clear();
     scratch.originEnds.clear();
     double tolerance = 0.0;

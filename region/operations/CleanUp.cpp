@@ -28,7 +28,7 @@ double defaultTolerance(const Paths& paths) {
 
 bool cleanUp(const Paths& paths, const CleanUpOptions& options, Workspace& workspace,
              Outcome& outcome) {
-    OverlayScratch& scratch = workspace.scratch().overlay;
+    OverlayScratch& scratch = workspace.begin().overlay;
     const Extent extent = extentOf(paths);
     if (extent.refusal) return refuse(outcome, extent.refusal);
     const double tolerance = toleranceFor(extent, options.tolerance);

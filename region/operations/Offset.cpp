@@ -79,7 +79,7 @@ Outcome offset(const RegionSet& source, double distance, const OffsetOptions& op
 
 bool offsetSeries(const RegionSet& source, const double* distances, std::size_t count,
                   const OffsetOptions& options, Workspace& workspace, Outcome* outcomes) {
-    Scratch& scratch = workspace.scratch();
+    Scratch& scratch = workspace.begin();
     scratch.offset.source.take(source);
     OriginSource origins;
     origins.first = &source;
@@ -101,7 +101,7 @@ bool offsetSeries(const RegionSet& source, const double* distances, std::size_t 
 
 bool thicken(const Paths& paths, double halfWidth, double tolerance, const OffsetOptions& options,
              Workspace& workspace, Outcome& outcome) {
-    Scratch& scratch = workspace.scratch();
+    Scratch& scratch = workspace.begin();
     const Extent extent = extentOf(paths);
     Refusal refusal = extent.refusal ? extent.refusal : checked(halfWidth, options);
     if (!refusal && !(halfWidth > 0.0)) refusal = {Reason::kOutOfRange, {}, 0};

@@ -15,6 +15,11 @@ bool refuse(Outcome& outcome, const Refusal& refusal) {
     return false;
 }
 
+bool refuseUnsettled(const Arrangement& arrangement, Outcome& outcome) {
+    const Reason reason = arrangement.isAtLimit() ? Reason::kWorkLimit : Reason::kUnsettled;
+    return refuse(outcome, {reason, {}, 0});
+}
+
 void beginOutcome(Outcome& outcome, double tolerance) {
     SetWriter::clear(outcome.regions, tolerance);
     outcome.marginal.clear();
@@ -26,7 +31,7 @@ bool overlay(OverlayScratch& scratch, double tolerance, Index split, const Origi
     Arrangement& arrangement = scratch.arrangement;
     beginOutcome(outcome, tolerance);
     if (arrangement.strands().elements.empty()) return true;
-    if (!arrangement.settle(tolerance, split)) return refuse(outcome, {Reason::kUnsettled, {}, 0});
+    if (!arrangement.settle(tolerance, split)) return refuseUnsettled(arrangement, outcome);
     scratch.fans.build(arrangement);
     if (!scratch.windings.find(arrangement, scratch.fans))
         return refuse(outcome, {Reason::kUncertified, scratch.windings.conflict(), 0});

@@ -35,6 +35,9 @@ bool overlayTwice(OverlayScratch& scratch, double tolerance, const Fill& fill,
 /// Gives up: an empty set and a refusal.
 bool refuse(Outcome& outcome, const Refusal& refusal);
 
+/// The same for an arrangement that has not settled.
+bool refuseUnsettled(const Arrangement& arrangement, Outcome& outcome);
+
 /// Begins an outcome anew, keeping its memory.
 void beginOutcome(Outcome& outcome, double tolerance);
 

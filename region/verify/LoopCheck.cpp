@@ -137,6 +137,7 @@ void checkLoops(const LoopsView& view, const BoundaryIndex& index, double tolera
     checkEnds(view, tolerance, faults);
     index.boxes().visitPairs([&](std::size_t i, std::size_t j) {
         checkPair(index.pieces()[i], index.pieces()[j], tolerance, faults);
+        return true;
     });
     checkNesting(view, index, faults);
 }

@@ -101,9 +101,9 @@ void OffsetVerifier::linkFeatures() {
     const auto& pieces = m_source.pieces();
     Index first = 0;
     for (Index i = 0; i < pieces.size(); ++i) {
-        if (i > 0 && pieces[i].loop != pieces[i - 1].loop) first = i;
+        if (i > 0 && m_source.loopOf(i) != m_source.loopOf(i - 1)) first = i;
         if (i > first) m_features[i].before = i - 1;
-        const bool isLast = i + 1 == pieces.size() || pieces[i + 1].loop != pieces[i].loop;
+        const bool isLast = i + 1 == pieces.size() || m_source.loopOf(i + 1) != m_source.loopOf(i);
         if (isLast) m_features[first].before = i;
         m_features[i].after = isLast ? first : i + 1;
     }

@@ -73,8 +73,8 @@ TEST(Offset, AgreesWithDistancesAtRandomPoints) {
 TEST(Offset, ByParallelsIsTheOneByStrips) {
     std::mt19937 engine(6);
     Workspace workspace;
-    OverlayScratch& overlay = workspace.scratch().overlay;
-    OffsetScratch& offsets = workspace.scratch().offset;
+    OverlayScratch& overlay = workspace.begin().overlay;
+    OffsetScratch& offsets = workspace.begin().offset;
     Outcome parallels;
     Outcome strips;
     for (int round = 0; round < 100; ++round) {

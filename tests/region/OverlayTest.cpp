@@ -263,4 +263,36 @@ TEST(Boolean, ElementsKnowWhereTheyComeFrom) {
     }
 }
 
+TEST(CleanUp, RefusesMoreWorkThanAllowedAndGoesOnAfterwards) {
+    Paths heap;
+    std::mt19937 engine(11);
+    heap.add(tangle(engine, 40, 10.0), true);
+    Workspace workspace;
+    Outcome free;
+    ASSERT_TRUE(cleanUp(heap, {}, workspace, free));
+    workspace.setWorkLimit(20);
+    Outcome limited;
+    EXPECT_FALSE(cleanUp(heap, {}, workspace, limited));
+    EXPECT_EQ(limited.refusal.reason, Reason::kWorkLimit);
+    EXPECT_TRUE(limited.regions.empty());
+    workspace.setWorkLimit(1000000);
+    ASSERT_TRUE(cleanUp(heap, {}, workspace, limited));
+    EXPECT_EQ(area(limited.regions), area(free.regions));
+}
+
+/// Loops in a row, and loops in each other: none of them is allowed to cost a look at all others.
+TEST(CleanUp, FindsWindingsAndNestingOfManyLoops) {
+    Paths row;
+    Paths rings;
+    for (int i = 0; i < 300; ++i) {
+        row.add(circle({3.0 * i, 0.0}, 1.0), true);
+        rings.add(circle({0.0, 0.0}, 1.0 + i), true);
+    }
+    EXPECT_EQ(cleaned(row).regionCount(), 300U);
+    const RegionSet nested = cleaned(rings, FillRule::kEvenOdd);
+    EXPECT_EQ(nested.regionCount(), 150U);
+    EXPECT_EQ(nested.loops().size(), 300U);
+    EXPECT_NEAR(area(nested), 3.14159265358979 * (300.0 * 301.0 / 2.0), 1e-5);
+}
+
 }  // namespace
