@@ -81,8 +81,9 @@ Refusal measure(const Paths& paths, double& largest) {
 // Halves move together.
 void endAt(Vec2 p, std::vector<Piece>& pieces) {
     Piece last = pieces.back();
+    // By the points: the length of a gap far below rounding is 0.
+    if (p == last.e.ep) return;
     const double gap = lengthOf(p - last.e.ep);
-    if (gap == 0.0) return;
     Element whole{last.e.sp, p, last.e.bulge};
     pieces.pop_back();
     if (last.part == Part::kSecondHalf) {
