@@ -116,6 +116,10 @@ Refusal takePath(const PathView& path, std::size_t number, const Limits& limits,
     for (const Piece& piece : chain.pieces) {
         if (!(piece.slack <= widest)) return {Reason::kGap, piece.e.sp, number};
     }
+    // What was no longer than the gap that it was closed over has no length any more.
+    const auto isPoint = [](const Piece& piece) { return piece.e.sp == piece.e.ep; };
+    chain.pieces.erase(std::remove_if(chain.pieces.begin(), chain.pieces.end(), isPoint),
+                       chain.pieces.end());
     return {};
 }
 

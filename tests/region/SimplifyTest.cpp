@@ -300,6 +300,14 @@ TEST(Simplify, TurnsAndGapsWithinTheTolerance) {
     }
     // A gap whose length has no square is closed, too.
     simplified({{{0, 0}, {4, 0}, 0}, {{4, 0}, {1, 3}, 0}, {{1, 3}, {1e-200, 0}, 0}}, true, 0.0);
+    // What is shorter than the gap that it is closed over vanishes.
+    Paths paths;
+    paths.add(Elements{{{3, 4}, {3, 4.001}, 0}}, true);
+    paths.add(Elements{{{3, 4}, {5, 4}, 0}, {{5, 4}, {3, 4}, 0.5}, {{3, 4}, {3, 4.002}, 0}}, true);
+    Simplified result;
+    EXPECT_TRUE(simplify(paths, {0.1}, result));
+    EXPECT_EQ(result.paths[0].size(), 0U);
+    EXPECT_EQ(result.paths[1].size(), 2U);
 }
 
 std::vector<TangentPoint> tangentPoints(Vec2 (*at)(double), double from, double to, int count,
