@@ -126,7 +126,8 @@ bool Nesting::place(Index loop) {
             m_beside[loop] = other;
             return sight.coveredToEast == isHole(loop);
         }
-        from.x = sight.x - kStep * m_tolerance;
+        // A tolerance near rounding may be no step at all.
+        from.x = std::min(sight.x - kStep * m_tolerance, std::nextafter(sight.x, -HUGE_VAL));
     }
 }
 

@@ -77,7 +77,6 @@ private:
     Vec2 m_at;
     Index m_node = kNone;
     Index m_runFirst = 0;
-    bool m_bent = false;
 };
 
 }  // namespace gmregion

@@ -11,6 +11,8 @@ namespace gmregion {
 
 namespace {
 
+/// Numbers above it are refused, bulges among them.
+constexpr double kLargestBulge = 1e12;
 constexpr double kDefaultShare = 1.0 / 1073741824.0;  // 2^-30
 
 bool isFinite(const Element& e) {
@@ -29,7 +31,10 @@ Extent extentOf(const Paths& paths) {
     Box box;
     for (std::size_t i = 0; i < paths.size(); ++i) {
         for (const Element& e : paths[i]) {
-            const bool inRange = std::max(largestOf(e.sp), largestOf(e.ep)) <= kLargestCoordinate;
+            // The square of a larger bulge may have no bits any more; no box would tell.
+            const bool isTooBent = e.sp != e.ep && std::fabs(e.bulge) > kLargestBulge;
+            const bool inRange =
+                !isTooBent && std::max(largestOf(e.sp), largestOf(e.ep)) <= kLargestCoordinate;
             if (!isFinite(e) || !inRange) {
                 const Reason reason = isFinite(e) ? Reason::kOutOfRange : Reason::kNotFinite;
                 extent.refusal = {reason, isFinite(e) ? e.sp : Point{}, i};

@@ -11,6 +11,9 @@
 /// The same line is square to the line of centres, and passes between carriers that miss each
 /// other: where it crosses the line of centres they come nearest.
 ///
+/// The common origin is a point of the more bent carrier. Far from a small circle its form is large
+/// there, and would take digits with it; that of the flatter one grows no more than the distance.
+///
 /// Each crossing is then improved by a step of Newton's method on both forms, each written from the
 /// point by which its own carrier is given: it takes out what the common origin cost in digits.
 #include "region/plane/Crossing.h"
@@ -103,15 +106,15 @@ std::optional<Vec2> nearestApproach(const Carrier& a, const Carrier& b) {
     const Carrier& flat = isFlatter(a, b) ? a : b;
     const Carrier& bent = isFlatter(a, b) ? b : a;
     if (bent.curvature == 0.0) return std::nullopt;
-    const auto line = commonLine(formFrom(flat, flat.at), formFrom(bent, flat.at));
+    const auto line = commonLine(formFrom(flat, bent.at), formFrom(bent, bent.at));
     if (!line) return std::nullopt;
-    return flat.at + line->foot + (line->b / line->k) * line->along;
+    return bent.at + line->foot + (line->b / line->k) * line->along;
 }
 
 CrossingPoints crossings(const Carrier& a, const Carrier& b) {
     const Carrier& flat = isFlatter(a, b) ? a : b;
     const Carrier& bent = isFlatter(a, b) ? b : a;
-    const Vec2 origin = flat.at;
+    const Vec2 origin = bent.at;
     const Form flatForm = formFrom(flat, origin);
     const Form bentForm = formFrom(bent, origin);
     CrossingPoints points;

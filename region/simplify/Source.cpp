@@ -81,8 +81,9 @@ Refusal measure(const Paths& paths, double& largest) {
 // Halves move together.
 void endAt(Vec2 p, std::vector<Piece>& pieces) {
     Piece last = pieces.back();
+    // By the points: the length of a gap far below rounding is 0.
+    if (p == last.e.ep) return;
     const double gap = lengthOf(p - last.e.ep);
-    if (gap == 0.0) return;
     Element whole{last.e.sp, p, last.e.bulge};
     pieces.pop_back();
     if (last.part == Part::kSecondHalf) {
@@ -115,6 +116,10 @@ Refusal takePath(const PathView& path, std::size_t number, const Limits& limits,
     for (const Piece& piece : chain.pieces) {
         if (!(piece.slack <= widest)) return {Reason::kGap, piece.e.sp, number};
     }
+    // What was no longer than the gap that it was closed over has no length any more.
+    const auto isPoint = [](const Piece& piece) { return piece.e.sp == piece.e.ep; };
+    chain.pieces.erase(std::remove_if(chain.pieces.begin(), chain.pieces.end(), isPoint),
+                       chain.pieces.end());
     return {};
 }
 

@@ -136,6 +136,40 @@ TEST(Crossing, IsFoundWhereTheElementsWereMadeToCross) {
     EXPECT_GT(compared, 30000);
 }
 
+/// A rounding of 1e-8 at the end of a side of 50 was missed once.
+TEST(Crossing, IsFoundOnSmallArcsFarAlongLongElements) {
+    Draw draw(6);
+    for (int i = 0; i < 20000; ++i) {
+        const Vec2 x{draw.between(-50, 50), draw.between(-50, 50)};
+        const double direction = draw.between(-kPi, kPi);
+        const double length = draw.between(1.0, 50.0);
+        const double curvature = draw.chance(2) ? 0.0 : 1.0 / length;
+        const auto elementAlong = [&](double angle, double before, double after, double k) {
+            const Reached start = along(x, angle, k, -before);
+            const Reached end = along(x, angle, k, after);
+            return Element{{double(start.x), double(start.y)},
+                           {double(end.x), double(end.y)},
+                           std::tan(0.25 * k * (before + after))};
+        };
+        const Element large = elementAlong(direction, length, 1.0, curvature);
+        const double size = draw.power(-8.0, -2.0);
+        const double angle = direction + draw.between(0.5, 2.6);
+        const Element small = elementAlong(angle, size, size, draw.between(-1.5, 1.5) / size);
+        EXPECT_LT(distanceTo(crossings(large, small), x), 1e-12) << i;
+        EXPECT_LT(distanceTo(crossings(small, large), x), 1e-12) << i;
+        // Beside the element, where the small arc comes nearest: its middle, to the side it bends.
+        const Vec2 d{std::cos(direction), std::sin(direction)};
+        const double beside = 3.0 * size;
+        const Vec2 m = x + beside * rightNormal(d);
+        const Element circle{m + size * d, m - size * d, 1.0};
+        const Element line{x - length * d, x + d, 0.0};
+        const auto near = nearestApproach(carrierOf(circle), carrierOf(line));
+        ASSERT_TRUE(near);
+        EXPECT_LT(std::fabs(dot(*near - x, d)), 1e-12) << i;
+        EXPECT_LT(std::fabs(signedDistance(carrierOf(line), *near)), beside) << i;
+    }
+}
+
 TEST(Crossing, CountsWhatLiesOnBothElements) {
     const Element line{{-2, 0.5}, {2, 0.5}, 0};
     const Element upper{{1, 0}, {-1, 0}, 1};  // the half circle above

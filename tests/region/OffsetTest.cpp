@@ -293,6 +293,13 @@ TEST(Offset, RefusesWhatItCannotAnswer) {
     EXPECT_FALSE(thicken(Paths{}, -1, 0, {}, workspace, outcome));
     EXPECT_TRUE(thicken(Paths{}, 1, 0, {}, workspace, outcome));
     EXPECT_TRUE(outcome.regions.empty());
+    // So thin that a share of the tolerance is no step any more: nesting never came to an end.
+    Paths thin;
+    thin.add(Elements{{{16.75, 31}, {16.74993896484375, 30.999999999068677}, 0},
+                      {{16.74993896484375, 30.999999999068677}, {16.75, 31}, 1}},
+             true);
+    EXPECT_TRUE(thicken(thin, 1e-12, 0, {Join::kRound, End::kSquare, 4}, workspace, outcome));
+    EXPECT_LT(area(outcome.regions), 1e-14);
 }
 
 }  // namespace

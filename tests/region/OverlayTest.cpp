@@ -178,6 +178,9 @@ TEST(CleanUp, RefusesWhatItCannotAnswer) {
     Elements bent = square;
     bent[1].bulge = kNan;
     EXPECT_EQ(reasonFor(bent, true, 0), Reason::kNotFinite);
+    // An arc whose bulge has no square: it reached to 1e160 without being seen.
+    bent[1].bulge = 1e160;
+    EXPECT_EQ(reasonFor(bent, true, 0), Reason::kOutOfRange);
     Elements torn = square;
     torn[1].sp.x += 1e-3;
     EXPECT_EQ(reasonFor(torn, true, 0), Reason::kGap);

@@ -9,8 +9,8 @@
 #include <random>
 
 #include "gmregion/Simplify.h"
-#include "region/plane/Nearest.h"
 #include "region/simplify/Directions.h"
+#include "tests/support/PathDistance.h"
 #include "tests/support/RegionShapes.h"
 
 namespace {
@@ -19,35 +19,6 @@ using namespace gmregion;
 using namespace gmregion::shapes;
 
 constexpr double kTurn = 6.283185307179586;
-
-/// The distance of a point from the nearest of some elements, by halves.
-double distanceFrom(const Elements& elements, Vec2 p) {
-    double least = HUGE_VAL;
-    for (const Element& e : elements) {
-        if (e.sp == e.ep) continue;
-        // An element of half a turn at the most is within its chord's length of its start.
-        const double off = lengthOf(p - e.sp) - lengthOf(e.ep - e.sp);
-        if (std::fabs(e.bulge) <= 1.0 && off > least) continue;
-        const Parts parts = halved(e);
-        for (const Element& half : {parts.first, parts.second})
-            least = std::min(least, lengthOf(nearestOn(half, carrierOf(half), p) - p));
-    }
-    return least;
-}
-
-void visitSamples(const Element& e, int halvings, const std::function<void(Vec2)>& visit) {
-    if (halvings == 0 || e.sp == e.ep) return visit(e.sp);
-    const Parts parts = halved(e);
-    visitSamples(parts.first, halvings - 1, visit);
-    visitSamples(parts.second, halvings - 1, visit);
-}
-
-double farthest(const Elements& from, const Elements& to, int halvings) {
-    double most = 0.0;
-    for (const Element& e : from)
-        visitSamples(e, halvings, [&](Vec2 p) { most = std::max(most, distanceFrom(to, p)); });
-    return most;
-}
 
 /// The largest jump of direction, in degrees.
 double largestJump(const Elements& path, bool closed) {
@@ -327,6 +298,16 @@ TEST(Simplify, TurnsAndGapsWithinTheTolerance) {
             e.sp = e.sp + Vec2{0.0, uniform(engine, -0.04, 0.04)};
         EXPECT_LT(simplified(gaps, false, 0.05).size(), 120U);
     }
+    // A gap whose length has no square is closed, too.
+    simplified({{{0, 0}, {4, 0}, 0}, {{4, 0}, {1, 3}, 0}, {{1, 3}, {1e-200, 0}, 0}}, true, 0.0);
+    // What is shorter than the gap that it is closed over vanishes.
+    Paths paths;
+    paths.add(Elements{{{3, 4}, {3, 4.001}, 0}}, true);
+    paths.add(Elements{{{3, 4}, {5, 4}, 0}, {{5, 4}, {3, 4}, 0.5}, {{3, 4}, {3, 4.002}, 0}}, true);
+    Simplified result;
+    EXPECT_TRUE(simplify(paths, {0.1}, result));
+    EXPECT_EQ(result.paths[0].size(), 0U);
+    EXPECT_EQ(result.paths[1].size(), 2U);
 }
 
 std::vector<TangentPoint> tangentPoints(Vec2 (*at)(double), double from, double to, int count,
