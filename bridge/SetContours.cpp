@@ -107,14 +107,15 @@ bool goesOn(const Piece& before, const Piece& piece) {
            before.origin.element == piece.origin.element;
 }
 
-/// Begins a loop with the lowest identifier, of those with the first in its source, but not within
-/// an arc if that can be.
+/// Begins a loop with the lowest identifier, where the pieces that carry it begin, of several such
+/// places at the first in its source; within an arc only where all is one arc.
 void beginAtLowest(Pieces& pieces) {
-    using Rank = std::tuple<bool, long, std::int64_t, std::uint32_t>;
+    using Rank = std::tuple<bool, long, bool, std::int64_t, std::uint32_t>;
     const auto rank = [&](std::size_t i) {
         const Piece& piece = pieces[i];
         const Piece& before = pieces[i == 0 ? pieces.size() - 1 : i - 1];
-        return Rank{goesOn(before, piece), piece.id(), piece.origin.path, piece.origin.element};
+        return Rank{goesOn(before, piece), piece.id(), before.id() == piece.id(), piece.origin.path,
+                    piece.origin.element};
     };
     std::size_t lowest = 0;
     for (std::size_t i = 1; i < pieces.size(); ++i) {
