@@ -40,7 +40,7 @@ Refusal unite(const ContourPaths& paths, Workspace& workspace, Outcome& covered)
 /// Takes the islands out of the outline's region.
 Refusal takeOutIslands(const ContourPaths& paths, Workspace& workspace, RegionSet& region) {
     Outcome covered;
-    const Refusal refusal = unite(paths, workspace, covered);
+    Refusal refusal = unite(paths, workspace, covered);
     if (refusal) return refusal;
     Outcome part;
     gmregion::combine(region, covered.regions, gmregion::Combination::kDifference, workspace, part);
