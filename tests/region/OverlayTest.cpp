@@ -298,4 +298,41 @@ TEST(CleanUp, FindsWindingsAndNestingOfManyLoops) {
     EXPECT_NEAR(area(nested), 3.14159265358979 * (300.0 * 301.0 / 2.0), 1e-5);
 }
 
+/// Where a look for the nesting would meet two loops in one point, or an arc that is flat.
+TEST(CleanUp, NestsLoopsThatTouchAtTheHeightOfTheirMiddle) {
+    struct Case {
+        Elements loop;
+        double area;
+    };
+    const Elements square = rectangle(0, 0, 4, 4);
+    const std::array<Case, 4> cases{{
+        {polygon({{0, 2}, {-2, 1}, {-2, 3}}), 18.0},        // a tip from outside
+        {polygon({{0, 2}, {1, 3}, {2, 2}, {1, 1}}), 14.0},  // the corner of a hole
+        {polygon({{4, 2}, {3, 3}, {2, 2}, {3, 1}}), 14.0},
+        {{{{1, 2}, {2, 2}, 0.05}, {{2, 2}, {1, 2}, 0.05}}, 16.0 - 0.0333499941},  // flat arcs
+    }};
+    for (const Case& c : cases) {
+        for (const double angle : {0.0, 1.5707963267948966, 3.1415926535897931}) {
+            Paths heap;
+            heap.add(placed(square, {}, angle), true);
+            heap.add(placed(c.loop, {}, angle), true);
+            const RegionSet set = cleaned(heap, FillRule::kEvenOdd);
+            EXPECT_EQ(set.loops().size(), 2U) << c.area << " " << angle;
+            EXPECT_NEAR(area(set), c.area, 1e-8) << angle;
+        }
+    }
+    std::mt19937 engine(5);
+    for (int i = 0; i < 300; ++i) {
+        Paths heap;
+        for (int k = 0; k < 6; ++k) {
+            std::vector<Vec2> corners;
+            for (int c = 0; c < 3; ++c)
+                corners.push_back({double(engine() % 7), double(engine() % 7)});
+            heap.add(polygon(corners), true);
+        }
+        const RegionSet set = cleaned(heap, FillRule::kEvenOdd);
+        EXPECT_NEAR(area(set), area(combine(set, set, Combination::kUnion).regions), 1e-8);
+    }
+}
+
 }  // namespace
