@@ -58,9 +58,10 @@ struct Verdict {
 /// boundary, the result must have one within some tolerances; two boundaries nearer to each other
 /// than eight tolerances may be missing. Loops must close, must not cross, and must nest.
 ///
-/// With miters the result may lie as far as the limit from the source, with bevels as near as it
-/// likes; what is missing is looked for along the parallels alone, and with miters not at all where
-/// it is behind another corner's. Ends are not asked for: sets have none.
+/// With miters the result may lie as far as the limit from the source, with bevels, and at corners
+/// beyond the limit, as near as it likes; what is missing is looked for along the parallels alone,
+/// and with miters not at all where it is behind another corner's. Ends are not asked for: sets
+/// have none.
 ///
 /// Cost: near-linear, about that of the offset.
 GMREGION_EXPORT Verdict verifyOffset(const RegionSet& source, double distance,

@@ -213,13 +213,15 @@ void OffsetVerifier::judgePart(const BoundaryPiece& piece, Vec2 from, Vec2 q, Ve
     if (m_radius > slack && isInside != (m_distance < 0.0)) {
         m_faults->add(FaultKind::kWrongSide, q, away + m_radius, piece.element);
     } else if (away < m_radius - slack) {
-        if (m_options.join == Join::kBevel) return;
+        if (m_options.join == Join::kBevel || isCutOff(near)) return;
         m_faults->add(FaultKind::kTooNear, q, m_radius - away, piece.element);
     } else if (away > m_radius + slack) {
         const bool mayReachOut = m_options.join == Join::kMiter;
         if (mayReachOut && away <= m_options.miterLimit * m_radius + m_margin) return;
         m_faults->add(FaultKind::kTooFar, q, away - m_radius, piece.element);
-    } else if (m_radius > 8.0 * m_margin && apart(from, to) > 8.0 * m_margin) {
+    } else if (m_options.join != Join::kMiter && m_radius > 8.0 * m_margin &&
+               apart(from, to) > 8.0 * m_margin) {
+        // The tip of a miter may come to the distance of what is on its other side.
         const Vec2 normal = sideOf(piece.carrier, q).gradient;
         // In a neck twice the distance wide either wall is as near, and no sense is wrong.
         const double behind = kBehind * m_margin;
@@ -228,6 +230,22 @@ void OffsetVerifier::judgePart(const BoundaryPiece& piece, Vec2 from, Vec2 q, Ve
         if (dot(normal, near.at - q) * m_distance < 0.0 && !isNeck)
             m_faults->add(FaultKind::kWrongSense, q, 0.0, piece.element);
     }
+}
+
+/// Whether a point of the source is a corner that the result may cut off, nearer than the distance.
+bool OffsetVerifier::isCutOff(const BoundaryIndex::Near& near) const {
+    const BoundaryPiece& s = m_source.pieces()[near.piece];
+    return (near.at == s.sp && isCutOff(near.piece)) ||
+           (near.at == s.ep && isCutOff(m_features[near.piece].after));
+}
+
+/// The same for the start of a piece: corners that open, with miters those beyond the limit.
+bool OffsetVerifier::isCutOff(Index feature) const {
+    const Feature& f = m_features[feature];
+    if (m_options.join != Join::kMiter) return m_options.join == Join::kBevel && f.opens;
+    const double spread = 1.0 + dot(m_features[f.before].endNormal, f.startNormal);
+    const double limit = m_options.miterLimit;
+    return f.opens && spread * limit * limit <= 2.0 * (1.0 + kTurns);
 }
 
 /// Looks for boundary of the true offset that the result does not have.

@@ -48,6 +48,8 @@ private:
     void probeAll();
     void judge(std::size_t number);
     void judgePart(const BoundaryPiece& piece, Vec2 from, Vec2 q, Vec2 to);
+    bool isCutOff(const BoundaryIndex::Near& near) const;
+    bool isCutOff(Index feature) const;
     void findMissing();
     void findMissing(Index feature);
     void findMissingOnParallel(Index feature);

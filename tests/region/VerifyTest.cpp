@@ -201,6 +201,33 @@ TEST(Verify, PassesRandomOffsetsAndNotTheirNeighbours) {
     EXPECT_GT(passed, 300);
 }
 
+/// Corners beyond the limit are bevels, which were told to be too near once.
+TEST(Verify, PassesMitersAndBevels) {
+    std::mt19937 engine(22);
+    int passed = 0;
+    for (int round = 0; round < 140; ++round) {
+        SCOPED_TRACE(round);
+        const RegionSet source = tangles(engine);
+        for (const OffsetOptions& options :
+             {OffsetOptions{Join::kMiter, End::kRound, uniform(engine, 1, 4)},
+              OffsetOptions{Join::kBevel, End::kRound, 1.0}}) {
+            const double d = uniform(engine, -1, 2);
+            const Outcome outcome = offset(source, d, options);
+            if (outcome.refusal) continue;
+            const Verdict verdict = verifyOffset(source, d, outcome.regions, options);
+            EXPECT_TRUE(verdict.isSound()) << int(options.join) << " by " << d << ", limit "
+                                           << options.miterLimit << ": " << texts(verdict);
+            ++passed;
+        }
+    }
+    EXPECT_GT(passed, 200);
+    // A miter within its limit must not be cut off.
+    const RegionSet square = cleaned({rectangle(0, 0, 10, 6)});
+    const RegionSet bevels = offset(square, 1.0, {Join::kBevel, End::kRound, 1.0}).regions;
+    const Verdict cut = verifyOffset(square, 1.0, bevels, {Join::kMiter, End::kRound, 1.5});
+    EXPECT_TRUE(found(cut, FaultKind::kTooNear, {-0.5, -0.5}, 1e-6)) << texts(cut);
+}
+
 TEST(Verify, AnswersEmptyAndUndefined) {
     const RegionSet none;
     const RegionSet square = cleaned({rectangle(0, 0, 2, 2)});
