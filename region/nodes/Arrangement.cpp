@@ -35,15 +35,15 @@ StrandElement part(const StrandElement& e, Vec2 from, Vec2 to) {
 
 }  // namespace
 
-bool Arrangement::settle(double tolerance, Index split) {
+bool Arrangement::settle(double tolerance, Index split, Care care) {
     m_tolerance = tolerance;
     m_settled.clear();
-    if (!m_meetings.find(m_in, tolerance, {split, nullptr})) return false;
+    if (!m_meetings.find(m_in, tolerance, {split, nullptr, care})) return false;
     cutRound(true);
     for (int round = 1;; ++round) {
         const bool any = std::find(m_moved.begin(), m_moved.end(), 1) != m_moved.end();
         if (!any) return true;
-        if (!m_meetings.find(m_in, tolerance, {kNone, &m_moved})) return false;
+        if (!m_meetings.find(m_in, tolerance, {kNone, &m_moved, care})) return false;
         if (!m_meetings.foundAny()) return true;
         if (round == kRounds) return false;
         const std::size_t before = m_in.elements.size();

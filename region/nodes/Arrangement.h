@@ -38,7 +38,8 @@ public:
     /// @param tolerance in length units, positive
     /// @param split where it is not kNone, elements before and from that number on are two clean
     /// sets, and those of one of them are not compared with each other
-    bool settle(double tolerance, Index split = kNone);
+    /// @param care see Care
+    bool settle(double tolerance, Index split = kNone, Care care = Care::kUsual);
 
     const std::vector<Vec2>& nodes() const { return m_clusters.nodes(); }
     /// Along each strand in their order.

@@ -22,13 +22,14 @@ namespace {
 
 /// Crossings at a smaller sine lie where rounding lets them along the elements.
 constexpr double kShallow = 1e-4;
+constexpr double kAnySine = 2.0;
 
 double squaredLength(Vec2 v) {
     return dot(v, v);
 }
 
-bool isShallow(const Carrier& a, const Carrier& b, Vec2 p) {
-    return std::fabs(cross(sideOf(a, p).gradient, sideOf(b, p).gradient)) < kShallow;
+double sineBetween(const Carrier& a, const Carrier& b, Vec2 p) {
+    return std::fabs(cross(sideOf(a, p).gradient, sideOf(b, p).gradient));
 }
 
 }  // namespace
@@ -36,9 +37,10 @@ bool isShallow(const Carrier& a, const Carrier& b, Vec2 p) {
 bool Meetings::find(const Strands& strands, double tolerance, const Scope& scope) {
     m_strands = &strands;
     m_tolerance = tolerance;
+    m_shallow = scope.care == Care::kThorough ? kAnySine : kShallow;
     m_points.clear();
     m_found.clear();
-    m_shallow.clear();
+    m_shallowPoints.clear();
     m_turnsBack = false;
     prepare(strands);
     raiseBoxes(scope);
@@ -172,7 +174,8 @@ void Meetings::meetBetween(Index i, Index j, bool areNeighbours) {
         if (!isNear(onA, p) || !isNear(onB, p)) continue;
         crossed = true;
         if (isNearCommonEnd(a, b, p)) continue;
-        if (isShallow(onA, onB, p)) m_shallow.push_back(static_cast<Index>(m_points.size()));
+        if (sineBetween(onA, onB, p) < m_shallow)
+            m_shallowPoints.push_back(static_cast<Index>(m_points.size()));
         stopBoth(i, j, p);
     }
     if (crossed || areNeighbours) return;
@@ -232,7 +235,7 @@ void Meetings::stopBoth(Index i, Index j, Vec2 p) {
 /// Lets whatever comes near a shallow crossing stop there: what runs along one of the two elements
 /// may cross the other one far from there, or not at all.
 void Meetings::stopAtShallow(Index split) {
-    for (const Index number : m_shallow) {
+    for (const Index number : m_shallowPoints) {
         const Vec2 p = m_points[number];
         const Index point = static_cast<Index>(m_isMet.size()) + number;
         const auto stopHere = [&](std::size_t i) {

@@ -17,6 +17,9 @@ struct Stop {
     double place;  ///< along the element, 0..1
 };
 
+/// What else comes near a crossing stops there, too: where the crossing is shallow, or anywhere.
+enum class Care : std::uint8_t { kUsual, kThorough };
+
 /// Finds where elements of strands meet: where they cross, where one ends on another, and where
 /// they come nearest without crossing, if that is within the tolerance.
 ///
@@ -24,11 +27,12 @@ struct Stop {
 /// strand do not meet in their common end.
 class Meetings {
 public:
-    /// Which elements are compared.
+    /// Which elements are compared, and how.
     struct Scope {
         Index split = kNone;  ///< see Arrangement::settle
         const std::vector<std::uint8_t>* moved =
             nullptr;  ///< if given, of each two one that is set
+        Care care = Care::kUsual;
     };
 
     /// Lets the next calls compare so many pairs of elements altogether.
@@ -76,6 +80,7 @@ private:
     const Strands* m_strands = nullptr;
     double m_tolerance = 0.0;
     std::uint64_t m_pairsLeft = UINT64_MAX;
+    double m_shallow = 0.0;  ///< the sine of a crossing that is called shallow
     bool m_turnsBack = false;
     BoxRow m_boxes;
     BoxRow m_otherBoxes;
@@ -84,7 +89,7 @@ private:
     std::vector<Index> m_endVertex;
     std::vector<std::uint8_t> m_isMet;
     std::vector<Vec2> m_points;
-    std::vector<Index> m_shallow;  ///< points where elements cross at a small angle
+    std::vector<Index> m_shallowPoints;  ///< where elements cross at a small angle
     std::vector<Stop> m_found;
     std::vector<Stop> m_stops;
     std::vector<Index> m_firstStop;

@@ -81,7 +81,8 @@ bool stripOffset(OverlayScratch& scratch, OffsetScratch& offsets, const OriginSo
     offsets.strips.addSource(offsets.source, {1, 0}, strands);
     const Covers covers = grows ? Covers([](Weight w) { return w.a > 0; })
                                 : Covers([](Weight w) { return w.a > 0 && w.b <= 0; });
-    return overlay(scratch, tolerance, kNone, withKinds(origins, offsets.strips), covers, outcome);
+    return overlay(scratch, tolerance, kNone, Care::kThorough, withKinds(origins, offsets.strips),
+                   covers, outcome);
 }
 
 }  // namespace gmregion

@@ -41,7 +41,7 @@ bool combine(const RegionSet& first, const RegionSet& second, Combination combin
         takeSet(second, {0, 1}, split, strands);
         return firstOfSecond;
     };
-    return overlayTwice(scratch, tolerance, fill, source, coveredBy(combination), outcome);
+    return overlayInAttempts(scratch, tolerance, fill, source, coveredBy(combination), outcome);
 }
 
 Outcome combine(const RegionSet& first, const RegionSet& second, Combination combination) {
@@ -76,7 +76,7 @@ bool uniteAll(const RegionSet* sets, std::size_t count, Workspace& workspace, Ou
         return kNone;
     };
     const Covers covers = [](Weight w) { return w.a > 0; };
-    return overlayTwice(scratch, tolerance, fill, source, covers, outcome);
+    return overlayInAttempts(scratch, tolerance, fill, source, covers, outcome);
 }
 
 }  // namespace gmregion

@@ -43,7 +43,7 @@ bool cleanUp(const Paths& paths, const CleanUpOptions& options, Workspace& works
         return kNone;
     };
     const bool found =
-        overlayTwice(scratch, tolerance, fill, source, coveredBy(options.rule), outcome);
+        overlayInAttempts(scratch, tolerance, fill, source, coveredBy(options.rule), outcome);
     return refusal ? refuse(outcome, refusal) : found;
 }
 

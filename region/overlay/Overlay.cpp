@@ -26,12 +26,12 @@ void beginOutcome(Outcome& outcome, double tolerance) {
     outcome.refusal = {};
 }
 
-bool overlay(OverlayScratch& scratch, double tolerance, Index split, const OriginSource& source,
-             Covers covers, Outcome& outcome) {
+bool overlay(OverlayScratch& scratch, double tolerance, Index split, Care care,
+             const OriginSource& source, Covers covers, Outcome& outcome) {
     Arrangement& arrangement = scratch.arrangement;
     beginOutcome(outcome, tolerance);
     if (arrangement.strands().elements.empty()) return true;
-    if (!arrangement.settle(tolerance, split)) return refuseUnsettled(arrangement, outcome);
+    if (!arrangement.settle(tolerance, split, care)) return refuseUnsettled(arrangement, outcome);
     scratch.fans.build(arrangement);
     if (!scratch.windings.find(arrangement, scratch.fans))
         return refuse(outcome, {Reason::kUncertified, scratch.windings.conflict(), 0});

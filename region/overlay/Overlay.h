@@ -12,20 +12,29 @@ using Covers = bool (*)(Weight);
 /// Makes a set of what is covered by the strands in the arrangement of a scratch.
 /// @param split see Arrangement::settle
 /// @return whether there is a result; else the outcome says why not
-bool overlay(OverlayScratch& scratch, double tolerance, Index split, const OriginSource& source,
-             Covers covers, Outcome& outcome);
+bool overlay(OverlayScratch& scratch, double tolerance, Index split, Care care,
+             const OriginSource& source, Covers covers, Outcome& outcome);
 
-/// The same, and once more with half the tolerance where that does not work out: what lies just
-/// within the tolerance then lies just beyond it.
+/// How an overlay is tried.
+struct OverlayAttempt {
+    double share;  ///< of the tolerance
+    Care care;
+};
+
+/// The same, and once more with more care where that does not work out, then with half the
+/// tolerance: what lies just within the tolerance then lies just beyond it.
 /// @param fill fills the strands, and answers where to split them
 template <class Fill>
-bool overlayTwice(OverlayScratch& scratch, double tolerance, const Fill& fill,
-                  const OriginSource& source, Covers covers, Outcome& outcome) {
-    for (const double share : {1.0, 0.5}) {
+bool overlayInAttempts(OverlayScratch& scratch, double tolerance, const Fill& fill,
+                       const OriginSource& source, Covers covers, Outcome& outcome) {
+    for (const OverlayAttempt& attempt :
+         {OverlayAttempt{1.0, Care::kUsual}, {1.0, Care::kThorough}, {0.5, Care::kThorough}}) {
         Strands& strands = scratch.arrangement.strands();
         strands.clear();
         const Index split = fill(strands);
-        if (!overlay(scratch, share * tolerance, split, source, covers, outcome)) continue;
+        if (!overlay(scratch, attempt.share * tolerance, split, attempt.care, source, covers,
+                     outcome))
+            continue;
         SetWriter::setTolerance(outcome.regions, tolerance);
         return true;
     }

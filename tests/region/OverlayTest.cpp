@@ -335,4 +335,29 @@ TEST(CleanUp, NestsLoopsThatTouchAtTheHeightOfTheirMiddle) {
     }
 }
 
+/// Where two crossing sides are there twice, a part of the tolerance apart, their crossings lie
+/// farther apart than the sides.
+TEST(CleanUp, TakesCrossingBarsThatAreThereTwice) {
+    constexpr double kTolerance = 1e-6;
+    std::mt19937 engine(3);
+    for (const double angle : {0.5, 0.2, 0.05, 0.01}) {
+        for (const double apart : {0.02, 0.3, 0.9}) {
+            for (int i = 0; i < 20; ++i) {
+                Paths heap;
+                for (const double turn : {0.0, angle}) {
+                    const Elements bar = placed(rectangle(-5, -0.5, 10, 1), {}, turn);
+                    const double way = apart * kTolerance;
+                    const double to = uniform(engine, 0.0, 6.28);
+                    heap.add(bar, true);
+                    heap.add(placed(bar, {way * std::cos(to), way * std::sin(to)}, 0.0), true);
+                }
+                const RegionSet set = cleaned(heap, FillRule::kNonZero, kTolerance);
+                const double common = std::min(10.0, 1.0 / std::sin(angle));
+                EXPECT_EQ(set.regionCount(), 1U) << angle << " " << apart;
+                EXPECT_LE(area(set), 20.0 - 0.5 * common);
+            }
+        }
+    }
+}
+
 }  // namespace
