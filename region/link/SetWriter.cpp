@@ -2,29 +2,15 @@
 #include "region/link/SetWriter.h"
 
 #include <algorithm>
-#include <cmath>
 #include <numeric>
 
-#include "region/plane/Carrier.h"
+#include "region/link/PieceJoin.h"
 #include "region/plane/ElementHalves.h"
 #include "region/plane/Measures.h"
 
 namespace gmregion {
 
 namespace {
-
-/// The largest bulge of an element of a result, that of 300 degrees: beyond it the ends come near
-/// each other in comparison to the radius.
-constexpr double kLargestBulge = 3.7320508075688772;
-
-/// In parts of the tolerance, how far an end between two pieces may lie beside both as one.
-constexpr double kStraight = 1.0 / 1024.0;
-
-/// The bulge of two arcs of one circle that follow each other: the tangents of their quarter
-/// sweeps, added.
-double joinedBulge(double a, double b) {
-    return (a + b) / (1.0 - a * b);
-}
 
 bool sameOrigin(const Origin& a, const Origin& b) {
     return a.path == b.path && a.element == b.element && a.kind == b.kind;
@@ -88,16 +74,7 @@ void SetWriter::gather(const Arrangement& arrangement, const Loops& loops, std::
 /// Whether two pieces that follow each other are parts of one element, with nothing between them.
 bool SetWriter::joins(const Item& a, const Item& b) const {
     if (a.tag != b.tag || a.backward != b.backward || !sameOrigins(a, b)) return false;
-    if ((a.element.bulge == 0.0) != (b.element.bulge == 0.0)) return false;
-    const double product = a.element.bulge * b.element.bulge;
-    if (product < 0.0 || product >= 1.0) return false;
-    const double bulge = joinedBulge(a.element.bulge, b.element.bulge);
-    if (std::fabs(bulge) > kLargestBulge) return false;
-    const Vec2 chord = b.element.ep - a.element.sp;
-    if (!(dot(chord, chord) > 0.0)) return false;
-    const Element joined{a.element.sp, b.element.ep, bulge};
-    const double beside = std::fabs(signedDistance(carrierOf(joined), a.element.ep));
-    return beside <= kStraight * m_arrangement->tolerance();
+    return makeOne(a.element, b.element, m_arrangement->tolerance());
 }
 
 bool SetWriter::sameOrigins(const Item& a, const Item& b) const {

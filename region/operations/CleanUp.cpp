@@ -38,7 +38,7 @@ bool cleanUp(const Paths& paths, const CleanUpOptions& options, Workspace& works
     source.list = &scratch.origins;
     const auto fill = [&](Strands& strands) {
         scratch.origins.clear();
-        refusal = takePaths(paths, tolerance, true, strands, scratch.origins);
+        refusal = takePaths(paths, tolerance, true, {1, 0}, strands, scratch.origins);
         if (refusal) strands.clear();
         return kNone;
     };

@@ -111,7 +111,7 @@ bool thicken(const Paths& paths, double halfWidth, double tolerance, const Offse
     Strands& strands = scratch.overlay.arrangement.strands();
     strands.clear();
     scratch.overlay.origins.clear();
-    refusal = takePaths(paths, coincident, false, strands, scratch.overlay.origins);
+    refusal = takePaths(paths, coincident, false, {1, 0}, strands, scratch.overlay.origins);
     if (refusal) return refuse(outcome, refusal);
     scratch.offset.source.take(strands);
     if (scratch.offset.source.elements().empty()) {

@@ -73,8 +73,8 @@ void appendElement(std::vector<StrandElement>& elements, const Element& e, Index
     });
 }
 
-Refusal takePaths(const Paths& paths, double tolerance, bool wantClosed, Strands& strands,
-                  std::vector<Origin>& origins) {
+Refusal takePaths(const Paths& paths, double tolerance, bool wantClosed, Weight weight,
+                  Strands& strands, std::vector<Origin>& origins) {
     auto& elements = strands.elements;
     for (std::size_t i = 0; i < paths.size(); ++i) {
         const PathView path = paths[i];
@@ -93,7 +93,7 @@ Refusal takePaths(const Paths& paths, double tolerance, bool wantClosed, Strands
             if (!(dot(gap, gap) <= tolerance * tolerance)) return {Reason::kGap, e.ep, i};
             appendElement(elements, {e.ep, next, 0.0}, tag);
         }
-        strands.endStrand(path.closed, {1, 0});
+        strands.endStrand(path.closed, weight);
     }
     return {};
 }

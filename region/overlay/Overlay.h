@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include <array>
+
 #include "gmregion/Outcome.h"
 #include "region/overlay/OverlayScratch.h"
 
@@ -20,6 +22,8 @@ struct OverlayAttempt {
     double share;  ///< of the tolerance
     Care care;
 };
+constexpr std::array<OverlayAttempt, 3> kOverlayAttempts{
+    {{1.0, Care::kUsual}, {1.0, Care::kThorough}, {0.5, Care::kThorough}}};
 
 /// The same, and once more with more care where that does not work out, then with half the
 /// tolerance: what lies just within the tolerance then lies just beyond it.
@@ -27,8 +31,7 @@ struct OverlayAttempt {
 template <class Fill>
 bool overlayInAttempts(OverlayScratch& scratch, double tolerance, const Fill& fill,
                        const OriginSource& source, Covers covers, Outcome& outcome) {
-    for (const OverlayAttempt& attempt :
-         {OverlayAttempt{1.0, Care::kUsual}, {1.0, Care::kThorough}, {0.5, Care::kThorough}}) {
+    for (const OverlayAttempt& attempt : kOverlayAttempts) {
         Strands& strands = scratch.arrangement.strands();
         strands.clear();
         const Index split = fill(strands);
