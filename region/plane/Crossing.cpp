@@ -18,6 +18,7 @@
 /// point by which its own carrier is given: it takes out what the common origin cost in digits.
 #include "region/plane/Crossing.h"
 
+#include <algorithm>
 #include <cmath>
 #include <optional>
 
@@ -40,7 +41,12 @@ Form formFrom(const Carrier& c, Vec2 origin) {
     return {side.value, side.gradient, c.curvature};
 }
 
-/// One step towards the common zero of both sides; the point itself where they run alongside.
+/// Above this sine a step of Newton's method is taken as it is.
+constexpr double kSteep = 1e-3;
+
+/// One step towards the common zero of both sides; the point itself where they run alongside. Where
+/// carriers touch, a step is the quotient of two roundings and may lead far away: there it is taken
+/// only when it comes nearer to both.
 Vec2 improved(const Carrier& a, const Carrier& b, Vec2 p) {
     const Side sideA = sideOf(a, p);
     const Side sideB = sideOf(b, p);
@@ -48,7 +54,13 @@ Vec2 improved(const Carrier& a, const Carrier& b, Vec2 p) {
     const Vec2 step{sideA.value * sideB.gradient.y - sideB.value * sideA.gradient.y,
                     sideB.value * sideA.gradient.x - sideA.value * sideB.gradient.x};
     const Vec2 better = p - (1.0 / determinant) * step;
-    return std::isfinite(better.x) && std::isfinite(better.y) ? better : p;
+    if (!std::isfinite(better.x) || !std::isfinite(better.y)) return p;
+    if (std::fabs(determinant) > kSteep) return better;
+    const auto away = [](double atA, double atB) {
+        return std::max(std::fabs(atA), std::fabs(atB));
+    };
+    const double before = away(sideA.value, sideB.value);
+    return away(sideOf(a, better).value, sideOf(b, better).value) <= before ? better : p;
 }
 
 /// The line through both crossings of two carriers, and where along it the more bent one is: in the

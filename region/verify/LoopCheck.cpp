@@ -33,15 +33,17 @@ bool isOn(const BoundaryPiece& e, Vec2 p, double within) {
            squared(nearestOn(e, e.carrier, p) - p) <= within * within;
 }
 
-/// Whether the shorter piece runs along the longer one.
+/// Whether the shorter piece runs along the longer one. Sides of a wedge whose ends are two nodes
+/// do not: at three quarters of their length they are farther apart than half the tolerance.
 bool runAlong(const BoundaryPiece& a, const BoundaryPiece& b, double within) {
     const bool aIsShorter = squared(a.ep - a.sp) < squared(b.ep - b.sp);
     const BoundaryPiece& shorter = aIsShorter ? a : b;
     const BoundaryPiece& longer = aIsShorter ? b : a;
     if (squared(shorter.ep - shorter.sp) < 64.0 * within * within) return false;
     const Vec2 m = middleOf(shorter);
-    return isOn(longer, between(shorter, shorter.sp, m), within) &&
-           isOn(longer, between(shorter, m, shorter.ep), within) && isOn(longer, m, within);
+    const auto isBeside = [&](Vec2 p) { return isOn(longer, p, 0.5 * within); };
+    return isBeside(between(shorter, shorter.sp, m)) && isBeside(between(shorter, m, shorter.ep)) &&
+           isBeside(m);
 }
 
 /// Whether a piece passes from one side of another to the other at a point of both.
