@@ -155,6 +155,16 @@ TEST(CleanUp, IsTheSameFromAnyStartInAnyOrderAndTwice) {
     }
 }
 
+/// A node near the end of an element, where it came nearest to an arc, once left a piece between
+/// them of a sixth of the tolerance.
+TEST(CleanUp, LeavesNoElementBelowTheTolerance) {
+    const Vec2 tip{-7.4505805969238281e-09, 9.0949470177292824e-13};
+    const RegionSet set =
+        cleaned(Elements{{tip, {0, 0}, 2.75}, {{0, 0}, {7.75, 4.125}, 0}, {{7.75, 4.125}, tip, 0}});
+    for (const Element& e : set.elements())
+        EXPECT_GE(lengthAlong(e), set.tolerance());
+}
+
 TEST(CleanUp, RefusesWhatItCannotAnswer) {
     const auto reasonFor = [](const Elements& loop, bool isClosed, double tolerance) {
         Paths paths;
