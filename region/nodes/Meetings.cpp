@@ -183,8 +183,13 @@ void Meetings::meetBetween(Index i, Index j, bool areNeighbours) {
     if (!p || !isNear(onA, *p) || !isNear(onB, *p)) return;
     const Vec2 gap = nearestOn(a, onA, *p) - nearestOn(b, onB, *p);
     const bool near = squaredLength(gap) <= m_tolerance * m_tolerance;
-    if (near && squaredLength(nearestOn(a, onA, *p) - *p) <= m_tolerance * m_tolerance)
-        stopBoth(i, j, *p);
+    if (!near || squaredLength(nearestOn(a, onA, *p) - *p) > m_tolerance * m_tolerance) return;
+    m_shallow.push_back(static_cast<Index>(m_points.size()));
+    stopBoth(i, j, *p);
+    // The place is on neither, so an end near it need not be near the other element.
+    for (const Index v : {i, m_endVertex[i], j, m_endVertex[j]}) {
+        if (squaredLength(vertex(v) - *p) <= m_tolerance * m_tolerance) m_isMet[v] = 1;
+    }
 }
 
 /// Crossings of carriers that are nearly the same may lie anywhere.

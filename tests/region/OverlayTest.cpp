@@ -155,6 +155,30 @@ TEST(CleanUp, IsTheSameFromAnyStartInAnyOrderAndTwice) {
     }
 }
 
+/// A node near the end of an element, where it came nearest to an arc, once left a piece between
+/// them of a sixth of the tolerance.
+TEST(CleanUp, LeavesNoElementBelowTheTolerance) {
+    const Vec2 tip{-7.4505805969238281e-09, 9.0949470177292824e-13};
+    const RegionSet set =
+        cleaned(Elements{{tip, {0, 0}, 2.75}, {{0, 0}, {7.75, 4.125}, 0}, {{7.75, 4.125}, tip, 0}});
+    for (const Element& e : set.elements())
+        EXPECT_GE(lengthAlong(e), set.tolerance());
+}
+
+/// A flat sliver and itself the other way round, moved by less than the tolerance: where two sides
+/// came nearest they had a node that the other two had not.
+TEST(CleanUp, LeavesNothingOfWhatCancels) {
+    const double flat = 9.0949470177292824e-13;
+    Paths paths;
+    paths.add(
+        Elements{{{27.875, 27.25}, {8.875, 21.75}, 0}, {{8.875, 21.75}, {27.875, 27.25}, flat}},
+        true);
+    const Vec2 a{27.875000000029104, 27.249999999999993};
+    const Vec2 b{8.8750000000292601, 21.749999999999453};
+    paths.add(Elements{{a, b, -flat}, {b, a, 0}}, true);
+    EXPECT_TRUE(cleaned(paths).empty());
+}
+
 TEST(CleanUp, RefusesWhatItCannotAnswer) {
     const auto reasonFor = [](const Elements& loop, bool isClosed, double tolerance) {
         Paths paths;
