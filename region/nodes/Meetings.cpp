@@ -184,7 +184,7 @@ void Meetings::meetBetween(Index i, Index j, bool areNeighbours) {
     const Vec2 gap = nearestOn(a, onA, *p) - nearestOn(b, onB, *p);
     const bool near = squaredLength(gap) <= m_tolerance * m_tolerance;
     if (!near || squaredLength(nearestOn(a, onA, *p) - *p) > m_tolerance * m_tolerance) return;
-    m_shallow.push_back(static_cast<Index>(m_points.size()));
+    m_shallowPoints.push_back(static_cast<Index>(m_points.size()));
     stopBoth(i, j, *p);
     // The place is on neither, so an end near it need not be near the other element.
     for (const Index v : {i, m_endVertex[i], j, m_endVertex[j]}) {
