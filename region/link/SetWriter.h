@@ -23,8 +23,6 @@ public:
 
     /// Makes a set empty.
     static void clear(RegionSet& set, double tolerance);
-    /// Lets a set have another tolerance than it was made with.
-    static void setTolerance(RegionSet& set, double tolerance) { set.m_tolerance = tolerance; }
 
 private:
     /// An element on its way into the set.

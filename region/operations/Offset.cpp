@@ -54,12 +54,21 @@ bool attempt(Scratch& scratch, const OriginSource& origins, double distance, dou
            stripOffset(overlay, offsets, origins, distance + beside, 0.5 * fine, options, outcome);
 }
 
+/// The finest tolerance that the numbers of an offset bear.
+double finestFor(const OffsetSource& source, double distance) {
+    const Box box = source.bounds().grown(std::fabs(distance));
+    const Vec2 low = box.low;
+    const Vec2 high = box.high;
+    return std::max({-low.x, -low.y, high.x, high.y}) * kFinestTolerance;
+}
+
 /// The offset of the source that a scratch holds.
 bool offsetSource(Scratch& scratch, const OriginSource& origins, double distance, double tolerance,
                   const OffsetOptions& options, bool isOpen, Outcome& outcome) {
-    const double fine = std::min(tolerance, std::fabs(distance) * kCoarsest);
+    const double fine = std::max(std::min(tolerance, std::fabs(distance) * kCoarsest),
+                                 finestFor(scratch.offset.source, distance));
     if (!attempt(scratch, origins, distance, fine, options, isOpen, outcome)) return false;
-    SetWriter::setTolerance(outcome.regions, tolerance);
+    coarsen(scratch.overlay, tolerance, outcome);
     return true;
 }
 
@@ -107,12 +116,15 @@ bool thicken(const Paths& paths, double halfWidth, double tolerance, const Offse
     if (!refusal && !(halfWidth > 0.0)) refusal = {Reason::kOutOfRange, {}, 0};
     const double coincident = toleranceFor(extent, tolerance);
     if (!refusal) refusal = checkedTolerance(extent, coincident);
+    if (!refusal && extent.size > 0.0 && halfWidth <= kCopies * coincident)
+        refusal = {Reason::kTolerance, {}, 0};
     if (refusal) return refuse(outcome, refusal);
     Strands& strands = scratch.overlay.arrangement.strands();
     strands.clear();
     scratch.overlay.origins.clear();
     refusal = takePaths(paths, coincident, false, {1, 0}, strands, scratch.overlay.origins);
     if (refusal) return refuse(outcome, refusal);
+    scratch.overlay.order.improve(strands, kNone);
     scratch.offset.source.take(strands);
     if (scratch.offset.source.elements().empty()) {
         beginOutcome(outcome, coincident);

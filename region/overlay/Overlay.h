@@ -25,6 +25,11 @@ struct OverlayAttempt {
 constexpr std::array<OverlayAttempt, 3> kOverlayAttempts{
     {{1.0, Care::kUsual}, {1.0, Care::kThorough}, {0.5, Care::kThorough}}};
 
+/// Lays a result of a finer tolerance over itself once more, so that it holds for the coarser one:
+/// no element shorter, nothing nearer to each other. Where that does not work out it stays as it
+/// is, with the tolerance that it has.
+void coarsen(OverlayScratch& scratch, double tolerance, Outcome& outcome);
+
 /// The same, and once more with more care where that does not work out, then with half the
 /// tolerance: what lies just within the tolerance then lies just beyond it.
 /// @param fill fills the strands, and answers where to split them
@@ -35,10 +40,11 @@ bool overlayInAttempts(OverlayScratch& scratch, double tolerance, const Fill& fi
         Strands& strands = scratch.arrangement.strands();
         strands.clear();
         const Index split = fill(strands);
+        scratch.order.improve(strands, split);
         if (!overlay(scratch, attempt.share * tolerance, split, attempt.care, source, covers,
                      outcome))
             continue;
-        SetWriter::setTolerance(outcome.regions, tolerance);
+        coarsen(scratch, tolerance, outcome);
         return true;
     }
     return false;
