@@ -89,41 +89,69 @@ bool SetWriter::sameOrigins(const Item& a, const Item& b) const {
     return other == kNone;
 }
 
-/// Appends the pieces of a loop, joined where they are parts of one element.
-void SetWriter::emitLoop() {
+/// Lists the pieces of a loop, joined where they are parts of one element.
+void SetWriter::join() {
     const std::size_t count = m_items.size();
-    if (count == 0) return;
+    m_joined.clear();
     std::size_t start = 0;
     while (start < count && joins(m_items[(start + count - 1) % count], m_items[start]))
         ++start;
     start %= count;
-    Item item = m_items[start];
-    const std::size_t first = m_elements.size();
-    for (std::size_t i = 1; i <= count; ++i) {
+    m_joined.push_back(m_items[start]);
+    for (std::size_t i = 1; i < count; ++i) {
         const Item& next = m_items[(start + i) % count];
-        if (i < count && joins(item, next)) {
-            item.element.bulge = joinedBulge(item.element.bulge, next.element.bulge);
-            item.element.ep = next.element.ep;
-            continue;
+        Item& last = m_joined.back();
+        if (joins(last, next)) {
+            last.element.bulge = joinedBulge(last.element.bulge, next.element.bulge);
+            last.element.ep = next.element.ep;
+        } else {
+            m_joined.push_back(next);
         }
-        m_elements.push_back(item.element);
-        appendOrigins(item);
-        item = next;
     }
     // One element cannot close a loop: what was joined to it stays in parts then.
-    if (m_elements.size() - first < 2) emitParts(first);
-    m_ends.push_back(static_cast<Index>(m_elements.size()));
+    if (m_joined.size() < 2) m_joined = m_items;
 }
 
-/// Appends the pieces of a loop as they are, in place of what was appended from an element on.
-void SetWriter::emitParts(std::size_t first) {
-    m_elements.resize(first);
-    m_originEnds.resize(first);
-    m_origins.resize(m_originEnds.empty() ? 0 : m_originEnds.back());
-    for (const Item& part : m_items) {
-        m_elements.push_back(part.element);
-        appendOrigins(part);
+/// Whether an element goes back the way that another has come.
+bool SetWriter::returns(const Element& there, const Element& back) const {
+    if (there.sp != back.ep || there.ep != back.sp) return false;
+    const Vec2 chord = there.ep - there.sp;
+    const double heights = 0.5 * (there.bulge + back.bulge);
+    return heights * heights * dot(chord, chord) <
+           m_arrangement->tolerance() * m_arrangement->tolerance();
+}
+
+/// Leaves out elements that go there and back: runs of several pieces may have become the same by
+/// being joined.
+void SetWriter::dropSpikes() {
+    m_kept.clear();
+    for (const Item& item : m_joined) {
+        if (!m_kept.empty() && returns(m_kept.back().element, item.element))
+            m_kept.pop_back();
+        else
+            m_kept.push_back(item);
     }
+    std::size_t first = 0;
+    while (m_kept.size() > first + 1 && returns(m_kept.back().element, m_kept[first].element)) {
+        m_kept.pop_back();
+        ++first;
+    }
+    m_kept.erase(m_kept.begin(), m_kept.begin() + static_cast<std::ptrdiff_t>(first));
+}
+
+/// Appends what a loop consists of; no loop where nothing is left of it.
+void SetWriter::emitLoop() {
+    join();
+    dropSpikes();
+    if (m_kept.empty()) {
+        m_areas.pop_back();
+        return;
+    }
+    for (const Item& item : m_kept) {
+        m_elements.push_back(item.element);
+        appendOrigins(item);
+    }
+    m_ends.push_back(static_cast<Index>(m_elements.size()));
 }
 
 /// All origins of a piece, each once.

@@ -36,8 +36,10 @@ private:
     void gather(const Arrangement& arrangement, const Loops& loops, std::size_t loop);
     bool joins(const Item& a, const Item& b) const;
     bool sameOrigins(const Item& a, const Item& b) const;
+    void join();
+    bool returns(const Element& there, const Element& back) const;
+    void dropSpikes();
     void emitLoop();
-    void emitParts(std::size_t first);
     void appendOrigins(const Item& item);
     bool nest();
     void arrange(RegionSet& set);
@@ -46,6 +48,8 @@ private:
     const Fans* m_fans = nullptr;
     const OriginSource* m_source = nullptr;
     std::vector<Item> m_items;
+    std::vector<Item> m_joined;  ///< those of an element made one
+    std::vector<Item> m_kept;    ///< without what goes there and back
     std::vector<Element> m_elements;
     std::vector<Index> m_ends;
     std::vector<double> m_areas;

@@ -4,11 +4,13 @@
 ///
 /// Round joins and ends go by raw parallels. Should the result not pass its check, the same is
 /// tried without trimmed neighbours, then a third of a tolerance beside the distance, where no
-/// threshold is the same, then as a union of strips, and at last so with half the tolerance. Other
-/// joins and ends are unions of strips from the start.
+/// threshold is the same, then as a union of strips, and at last so with parts of the tolerance.
+/// Other joins and ends are unions of strips from the start. What is near a threshold, or was found
+/// with another tolerance, is laid over itself once more.
 #include "gmregion/Offset.h"
 
 #include <algorithm>
+#include <array>
 #include <cmath>
 
 #include "region/operations/Scratch.h"
@@ -25,6 +27,8 @@ constexpr double kCoarsest = 1.0 / 64.0;
 constexpr double kCopies = 0.5;
 /// In tolerances: how far beside the distance a second attempt goes.
 constexpr double kBeside = 1.0 / 3.0;
+/// Of the tolerance, for the last attempts.
+constexpr std::array<double, 2> kFinerShares{1.0 / 2.0, 1.0 / 16.0};
 
 Refusal checked(double distance, const OffsetOptions& options) {
     if (!std::isfinite(distance) || !std::isfinite(options.miterLimit))
@@ -50,8 +54,13 @@ bool attempt(Scratch& scratch, const OriginSource& origins, double distance, dou
         if (roundOffset(overlay, offsets, origins, distance + beside, fine, false, outcome))
             return true;
     }
-    return stripOffset(overlay, offsets, origins, distance, fine, options, outcome) ||
-           stripOffset(overlay, offsets, origins, distance + beside, 0.5 * fine, options, outcome);
+    if (stripOffset(overlay, offsets, origins, distance, fine, options, outcome)) return true;
+    for (const double share : kFinerShares) {
+        if (stripOffset(overlay, offsets, origins, distance + beside, share * fine, options,
+                        outcome))
+            return true;
+    }
+    return false;
 }
 
 /// The finest tolerance that the numbers of an offset bear.
@@ -68,7 +77,8 @@ bool offsetSource(Scratch& scratch, const OriginSource& origins, double distance
     const double fine = std::max(std::min(tolerance, std::fabs(distance) * kCoarsest),
                                  finestFor(scratch.offset.source, distance));
     if (!attempt(scratch, origins, distance, fine, options, isOpen, outcome)) return false;
-    coarsen(scratch.overlay, tolerance, outcome);
+    if (outcome.regions.tolerance() < tolerance || !outcome.marginal.empty())
+        consolidate(scratch.overlay, std::max(tolerance, fine), outcome);
     return true;
 }
 

@@ -53,19 +53,18 @@ bool overlay(OverlayScratch& scratch, double tolerance, Index split, Care care,
     return refuse(outcome, {Reason::kUncertified, scratch.writer.conflict(), 0});
 }
 
-void coarsen(OverlayScratch& scratch, double tolerance, Outcome& outcome) {
-    if (!(outcome.regions.tolerance() < tolerance)) return;
-    std::swap(scratch.finer, outcome);
+void consolidate(OverlayScratch& scratch, double tolerance, Outcome& outcome) {
+    std::swap(scratch.loose, outcome);
     OriginSource source;
-    source.first = &scratch.finer.regions;
+    source.first = &scratch.loose.regions;
     Strands& strands = scratch.arrangement.strands();
     strands.clear();
-    takeSet(scratch.finer.regions, {1, 0}, 0, strands);
+    takeSet(scratch.loose.regions, {1, 0}, 0, strands);
     const Covers covers = [](Weight w) { return w.a > 0; };
     if (overlay(scratch, tolerance, kNone, Care::kUsual, source, covers, outcome))
-        std::swap(outcome.marginal, scratch.finer.marginal);
+        std::swap(outcome.marginal, scratch.loose.marginal);
     else
-        std::swap(scratch.finer, outcome);
+        std::swap(scratch.loose, outcome);
 }
 
 }  // namespace gmregion

@@ -22,16 +22,19 @@ struct OverlayAttempt {
     double share;  ///< of the tolerance
     Care care;
 };
-constexpr std::array<OverlayAttempt, 3> kOverlayAttempts{
-    {{1.0, Care::kUsual}, {1.0, Care::kThorough}, {0.5, Care::kThorough}}};
+constexpr std::array<OverlayAttempt, 5> kOverlayAttempts{{{1.0, Care::kUsual},
+                                                          {1.0, Care::kThorough},
+                                                          {1.0 / 2.0, Care::kThorough},
+                                                          {1.0 / 8.0, Care::kThorough},
+                                                          {1.0 / 64.0, Care::kThorough}}};
 
-/// Lays a result of a finer tolerance over itself once more, so that it holds for the coarser one:
-/// no element shorter, nothing nearer to each other. Where that does not work out it stays as it
-/// is, with the tolerance that it has.
-void coarsen(OverlayScratch& scratch, double tolerance, Outcome& outcome);
+/// Lays a result over itself once more, so that it holds for a tolerance: no element shorter,
+/// nothing nearer to each other. Where that does not work out it stays as it is, with the tolerance
+/// that it has.
+void consolidate(OverlayScratch& scratch, double tolerance, Outcome& outcome);
 
-/// The same, and once more with more care where that does not work out, then with half the
-/// tolerance: what lies just within the tolerance then lies just beyond it.
+/// The same, and once more with more care where that does not work out, then with smaller
+/// parts of the tolerance: what lies just within the tolerance then lies just beyond it.
 /// @param fill fills the strands, and answers where to split them
 template <class Fill>
 bool overlayInAttempts(OverlayScratch& scratch, double tolerance, const Fill& fill,
@@ -44,7 +47,7 @@ bool overlayInAttempts(OverlayScratch& scratch, double tolerance, const Fill& fi
         if (!overlay(scratch, attempt.share * tolerance, split, attempt.care, source, covers,
                      outcome))
             continue;
-        coarsen(scratch, tolerance, outcome);
+        if (attempt.share < 1.0) consolidate(scratch, tolerance, outcome);
         return true;
     }
     return false;

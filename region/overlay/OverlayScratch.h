@@ -23,7 +23,7 @@ struct OverlayScratch {
     SetWriter writer;
     std::vector<Origin> origins;    ///< of the operands, where they are listed
     std::vector<Index> originEnds;  ///< behind the last origin of each tag
-    Outcome finer;                  ///< one that is being coarsened
+    Outcome loose;                  ///< one that is being consolidated
 };
 
 }  // namespace gmregion

@@ -63,8 +63,8 @@ bool isLongWay(const std::vector<Vec2>& stops, Vec2 size) {
 void StrandOrder::improve(Strands& strands, Index split) {
     const auto& all = strands.strands;
     const auto isOfFirst = [split](const Strand& s) { return s.first < split; };
-    const Index middle = static_cast<Index>(
-        std::partition_point(all.begin(), all.end(), isOfFirst) - all.begin());
+    const Index middle =
+        static_cast<Index>(std::partition_point(all.begin(), all.end(), isOfFirst) - all.begin());
     const Index count = static_cast<Index>(all.size());
     m_places.clear();
     place(strands, 0, middle);
