@@ -28,7 +28,7 @@ constexpr double kCopies = 0.5;
 /// In tolerances: how far beside the distance a second attempt goes.
 constexpr double kBeside = 1.0 / 3.0;
 /// Of the tolerance, for the last attempts.
-constexpr std::array<double, 2> kFinerShares{1.0 / 2.0, 1.0 / 16.0};
+constexpr std::array<double, 3> kFinerShares{1.0 / 2.0, 1.0 / 16.0, 1.0 / 1024.0};
 
 Refusal checked(double distance, const OffsetOptions& options) {
     if (!std::isfinite(distance) || !std::isfinite(options.miterLimit))
