@@ -134,6 +134,7 @@ void Meetings::meet(Index i, Index j) {
     const bool thenB = m_endVertex[i] == j;
     const bool thenA = m_endVertex[j] == i;
     if ((thenB && a.joined) || (thenA && b.joined)) return;
+    if (!thenA && !thenB && areApart(i, j)) return;
     const std::size_t before = m_found.size();
     const bool endsOfA = stopAtEnds(i, j);
     const bool endsOfB = stopAtEnds(j, i);
@@ -147,6 +148,23 @@ void Meetings::meet(Index i, Index j) {
     // they turn back.
     if (thenB) m_isMet[j] = 1;
     if (thenA) m_isMet[i] = 1;
+}
+
+/// Whether one of two carriers passes by all that the boxes of their elements have in common: then
+/// they meet nowhere. A carrier passes by a disc of the radius h when |G| > h + |k| h^2 / 2 at its
+/// centre, see Carrier.cpp.
+bool Meetings::areApart(Index i, Index j) {
+    const Box& a = boxOf(i);
+    const Box& b = boxOf(j);
+    const Vec2 low{std::max(a.low.x, b.low.x), std::max(a.low.y, b.low.y)};
+    const Vec2 high{std::min(a.high.x, b.high.x), std::min(a.high.y, b.high.y)};
+    const Vec2 centre = 0.5 * (low + high);
+    const double radius = 0.5 * (high.x - low.x + high.y - low.y) + m_tolerance;
+    const auto passesBy = [&](const Carrier& c) {
+        const double reach = radius + 0.5 * std::fabs(c.curvature) * radius * radius;
+        return std::fabs(sideOf(c, centre).value) > reach;
+    };
+    return passesBy(carrier(i)) || passesBy(carrier(j));
 }
 
 /// Neighbours with both ends in common that lie side by side need both as nodes.
@@ -168,9 +186,7 @@ void Meetings::meetBetween(Index i, Index j, bool areNeighbours) {
     const Carrier& onB = carrier(j);
     bool crossed = false;
     for (const Vec2 p : crossings(onA, onB)) {
-        const double placeOnA = placeOn(a, p);
-        const double placeOnB = placeOn(b, p);
-        if (placeOnA < 0.0 || placeOnA > 1.0 || placeOnB < 0.0 || placeOnB > 1.0) continue;
+        if (!spans(a, p) || !spans(b, p)) continue;
         if (!isNear(onA, p) || !isNear(onB, p)) continue;
         crossed = true;
         if (isNearCommonEnd(a, b, p)) continue;
