@@ -39,9 +39,7 @@ void RawParallels::make(const OffsetSource& source, double distance, double tole
     m_trims = trims;
     m_sweptArea = 0.0;
     m_source = source.elements().data();
-    m_sources.clear();
-    m_owners.clear();
-    m_kinds.clear();
+    m_madeOf.clear();
     strands.clear();
     Index first = 0;
     for (const Index last : source.loopEnds()) {
@@ -153,17 +151,14 @@ void RawParallels::emitElement(const Element& e, const SourceElement& of, Origin
                                bool goesOn, Strands& strands) {
     StrandElement s;
     static_cast<Element&>(s) = e;
-    s.tag = static_cast<Index>(m_owners.size());
+    s.tag = m_madeOf.add(static_cast<Index>(&of - m_source), of.owner, kind);
     s.joined = goesOn;
-    m_sources.push_back(static_cast<Index>(&of - m_source));
-    m_owners.push_back(of.owner);
-    m_kinds.push_back(kind);
     strands.elements.push_back(s);
 }
 
 double RawParallels::ownDistance(const OffsetSource& source, Index tag, Vec2 p) const {
-    const SourceElement& e = source.elements()[m_sources[tag]];
-    if (m_kinds[tag] == OriginKind::kCorner) return std::sqrt(squared(p - e.ep));
+    const SourceElement& e = source.elements()[m_madeOf.sources[tag]];
+    if (m_madeOf.kinds[tag] == OriginKind::kCorner) return std::sqrt(squared(p - e.ep));
     return std::fabs(signedDistance(e.carrier(), p));
 }
 

@@ -10,6 +10,9 @@ namespace gmregion {
 struct Scratch {
     OverlayScratch overlay;
     OffsetScratch offset;
+    Strands paths;
+    Strands path;     ///< one of them
+    Outcome outcome;  ///< of a step between
 };
 
 }  // namespace gmregion
