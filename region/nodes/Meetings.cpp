@@ -210,7 +210,7 @@ void Meetings::meetBetween(Index i, Index j, bool areNeighbours) {
 
 /// Crossings of carriers that are nearly the same may lie anywhere.
 bool Meetings::isNear(const Carrier& c, Vec2 p) const {
-    return std::fabs(signedDistance(c, p)) <= m_tolerance;
+    return isWithin(c, p, m_tolerance);
 }
 
 /// Whether a point is an end that both elements have in common, bit by bit, but for the tolerance.

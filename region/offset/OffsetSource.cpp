@@ -35,9 +35,8 @@ double distanceFrom(const SourceElement& e, Vec2 p, double limit) {
         return found < limit * limit ? std::sqrt(found) : limit;
     }
     const Carrier carrier = e.carrier();
-    const double aside = std::fabs(signedDistance(carrier, p));
-    if (!(aside < limit)) return limit;
-    if (spans(e, footOn(carrier, p))) return aside;
+    if (!isWithin(carrier, p, limit)) return limit;
+    if (spans(e, footOn(carrier, p))) return std::min(limit, std::fabs(signedDistance(carrier, p)));
     return std::min(limit, std::sqrt(std::min(squared(p - e.sp), squared(p - e.ep))));
 }
 
