@@ -2,6 +2,7 @@
 #pragma once
 
 #include "region/offset/RoundOffset.h"
+#include "region/offset/SideWriter.h"
 #include "region/overlay/OverlayScratch.h"
 
 namespace gmregion {
@@ -10,6 +11,7 @@ namespace gmregion {
 struct Scratch {
     OverlayScratch overlay;
     OffsetScratch offset;
+    SideWriter sides;
     Strands paths;
     Strands path;     ///< one of them
     Outcome outcome;  ///< of a step between
