@@ -78,7 +78,7 @@ BoundaryIndex::Near BoundaryIndex::nearest(Vec2 p, double limit) const {
 
 bool BoundaryIndex::isNear(std::size_t piece, Vec2 p, double limit) const {
     const BoundaryPiece& e = m_pieces[piece];
-    if (!(std::fabs(signedDistance(e.carrier, p)) <= limit)) return false;
+    if (!isWithin(e.carrier, p, limit)) return false;
     const Vec2 way = nearestOn(e, e.carrier, p) - p;
     return dot(way, way) <= limit * limit;
 }

@@ -12,6 +12,7 @@
 #include <cmath>
 #include <optional>
 
+#include "region/plane/Apart.h"
 #include "region/plane/Crossing.h"
 #include "region/plane/ElementBox.h"
 #include "region/plane/Nearest.h"
@@ -134,7 +135,8 @@ void Meetings::meet(Index i, Index j) {
     const bool thenB = m_endVertex[i] == j;
     const bool thenA = m_endVertex[j] == i;
     if ((thenB && a.joined) || (thenA && b.joined)) return;
-    if (!thenA && !thenB && areApart(i, j)) return;
+    if (!thenA && !thenB && areApart(carrier(i), boxOf(i), carrier(j), boxOf(j), m_tolerance))
+        return;
     const std::size_t before = m_found.size();
     const bool endsOfA = stopAtEnds(i, j);
     const bool endsOfB = stopAtEnds(j, i);
@@ -148,23 +150,6 @@ void Meetings::meet(Index i, Index j) {
     // they turn back.
     if (thenB) m_isMet[j] = 1;
     if (thenA) m_isMet[i] = 1;
-}
-
-/// Whether one of two carriers passes by all that the boxes of their elements have in common: then
-/// they meet nowhere. A carrier passes by a disc of the radius h when |G| > h + |k| h^2 / 2 at its
-/// centre, see Carrier.cpp.
-bool Meetings::areApart(Index i, Index j) {
-    const Box& a = boxOf(i);
-    const Box& b = boxOf(j);
-    const Vec2 low{std::max(a.low.x, b.low.x), std::max(a.low.y, b.low.y)};
-    const Vec2 high{std::min(a.high.x, b.high.x), std::min(a.high.y, b.high.y)};
-    const Vec2 centre = 0.5 * (low + high);
-    const double radius = 0.5 * (high.x - low.x + high.y - low.y) + m_tolerance;
-    const auto passesBy = [&](const Carrier& c) {
-        const double reach = radius + 0.5 * std::fabs(c.curvature) * radius * radius;
-        return std::fabs(sideOf(c, centre).value) > reach;
-    };
-    return passesBy(carrier(i)) || passesBy(carrier(j));
 }
 
 /// Neighbours with both ends in common that lie side by side need both as nodes.

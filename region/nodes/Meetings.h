@@ -68,7 +68,6 @@ private:
     void meetBetween(Index i, Index j, bool areNeighbours);
     bool stopAtEnds(Index ends, Index on);
     void stopBoth(Index i, Index j, Vec2 p);
-    bool areApart(Index i, Index j);
     bool isNear(const Carrier& c, Vec2 p) const;
     bool isNearCommonEnd(const Element& a, const Element& b, Vec2 p) const;
     bool isVertexOf(Index v, Index element) const {

@@ -45,7 +45,7 @@ constexpr double kRounding = 1.0 / 64.0;
 /// result must be found.
 constexpr double kBehind = 4.0;
 constexpr double kFound = 4.0;
-/// How often what is missing is halved before it is cut.
+/// How often what is not proven as a whole is halved before it is cut.
 constexpr int kHalvings = 3;
 /// Corners that turn by less than this sine have no arc worth asking for.
 constexpr double kTurns = 1e-9;
@@ -142,7 +142,26 @@ bool OffsetVerifier::staysAway(const BoundaryPiece& piece, const BoundaryPiece& 
     if (std::fabs(signedDistance(piece.carrier, s.sp)) < least &&
         squared(nearestOn(piece, piece.carrier, s.sp) - s.sp) < least * least)
         return false;
-    if (isBeside(s, f, p)) return true;
+    return isClear(piece, piece.carrier, s, f, p, kHalvings);
+}
+
+/// Whether a part of a piece of the result avoids what lies between the parallels and the normals
+/// of one of the source: as a whole, or by halves.
+bool OffsetVerifier::isClear(const Element& part, const Carrier& carrier, const BoundaryPiece& s,
+                             const Feature& f, const Probe& p, int halvings) const {
+    if (isBeside(s, f, p) || isBeyond(s, p)) return true;
+    if (halvings == 0) return false;
+    const Vec2 m = p.mid;
+    const double half = part.bulge / (1.0 + std::sqrt(1.0 + part.bulge * part.bulge));
+    for (const Element& e : {Element{part.sp, m, half}, Element{m, part.ep, half}}) {
+        if (!isClear(e, carrier, s, f, Probe(e, carrier), halvings - 1)) return false;
+    }
+    return true;
+}
+
+/// Whether a probe lies on the outer side of one of the parallels of a piece.
+bool OffsetVerifier::isBeyond(const BoundaryPiece& s, const Probe& p) const {
+    const double least = m_radius - m_margin;
     const bool isOnRight = sideOf(s.carrier, p.sp).value < 0.0;
     const std::optional<Carrier> limit = parallel(s.carrier, isOnRight ? least : -least);
     if (!limit) return false;

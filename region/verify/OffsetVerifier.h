@@ -42,6 +42,9 @@ private:
     void probe(std::size_t piece, std::size_t feature, const Probe& p);
     bool staysAway(const BoundaryPiece& piece, const BoundaryPiece& s, const Feature& f,
                    const Probe& p) const;
+    bool isClear(const Element& part, const Carrier& carrier, const BoundaryPiece& s,
+                 const Feature& f, const Probe& p, int halvings) const;
+    bool isBeyond(const BoundaryPiece& s, const Probe& p) const;
     bool isBeside(const BoundaryPiece& s, const Feature& f, const Probe& p) const;
     bool runsAlong(const BoundaryPiece& s, Feature& f, const Probe& p) const;
     bool runsAbout(const BoundaryPiece& s, Feature& f, const Probe& p) const;
