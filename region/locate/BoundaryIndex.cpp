@@ -84,9 +84,18 @@ bool BoundaryIndex::isNear(std::size_t piece, Vec2 p, double limit) const {
 }
 
 bool BoundaryIndex::isAnyNear(Vec2 p, double limit) const {
+    Index guess = kNone;
+    return isAnyNear(p, limit, guess);
+}
+
+bool BoundaryIndex::isAnyNear(Vec2 p, double limit, Index& guess) const {
+    if (guess < m_pieces.size() && isNear(guess, p, limit)) return true;
     const Vec2 by{limit, limit};
-    return m_boxes.anyOverlapping({p - by, p + by},
-                                  [&](std::size_t i) { return isNear(i, p, limit); });
+    return m_boxes.anyOverlapping({p - by, p + by}, [&](std::size_t i) {
+        if (!isNear(i, p, limit)) return false;
+        guess = static_cast<Index>(i);
+        return true;
+    });
 }
 
 }  // namespace gmregion

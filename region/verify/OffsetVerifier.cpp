@@ -73,6 +73,7 @@ void OffsetVerifier::verify(const LoopsView& source, double distance, const Loop
     m_margin = kMargin * tolerance;
     m_options = options;
     m_faults = &faults;
+    m_guess = kNone;
     m_source.take(source);
     m_result.take(result);
     checkLoops(result, m_result, tolerance, faults);
@@ -333,8 +334,8 @@ void OffsetVerifier::findMissing(const Element& wanted, Index feature, int halvi
     if (wanted.sp == wanted.ep) return;
     const Vec2 q = middleOf(wanted);
     const double reach = apart(q, wanted.sp);
-    if (reach < m_radius && m_source.isAnyNear(q, m_radius - reach)) return;
-    if (halvings == 0 || !m_source.isAnyNear(q, m_radius - m_margin)) {
+    if (reach < m_radius && m_source.isAnyNear(q, m_radius - reach, m_guess)) return;
+    if (halvings == 0 || !m_source.isAnyNear(q, m_radius - m_margin, m_guess)) {
         cutMissing(wanted, feature);
         return;
     }
@@ -360,14 +361,14 @@ void OffsetVerifier::cutMissing(const Element& wanted, Index feature) {
     });
 }
 
-bool OffsetVerifier::isMissing(Vec2 q, Vec2 outward, Index feature) const {
+bool OffsetVerifier::isMissing(Vec2 q, Vec2 outward, Index feature) {
     const double behind = kBehind * m_margin;
     const Vec2 p = q + behind * outward;
     const double limit = m_radius + 0.5 * behind;
     // Mostly what cuts a parallel off is the next element or the one before.
     const Feature& f = m_features[feature];
     if (m_source.isNear(f.before, p, limit) || m_source.isNear(f.after, p, limit)) return false;
-    if (m_source.isAnyNear(p, limit)) return false;
+    if (m_source.isAnyNear(p, limit, m_guess)) return false;
     if (m_result.isAnyNear(q, kFound * m_margin)) return false;
     if ((m_source.windingAbout(p) > 0) != (m_distance < 0.0)) return false;
     if (m_options.join != Join::kMiter) return true;

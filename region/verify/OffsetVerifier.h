@@ -59,7 +59,7 @@ private:
     bool isHidden(const Element& e, const Carrier& c, Index by) const;
     void findMissing(const Element& wanted, Index feature, int halvings);
     void cutMissing(const Element& wanted, Index feature);
-    bool isMissing(Vec2 q, Vec2 outward, Index feature) const;
+    bool isMissing(Vec2 q, Vec2 outward, Index feature);
 
     double m_distance = 0.0;
     double m_radius = 0.0;  ///< the distance without its sign
@@ -72,6 +72,7 @@ private:
     std::vector<State> m_states;      ///< one a piece of the result
     Cuts m_cuts;
     FaultList* m_faults = nullptr;
+    Index m_guess = kNone;  ///< the piece of the source that was near last
 };
 
 }  // namespace gmregion
