@@ -66,12 +66,27 @@ bool Meetings::meetPairs(const Scope& scope) {
             return true;
         });
     }
+    if (scope.moved) return meetMoved(*scope.moved);
     return m_boxes.visitPairs([&](std::size_t i, std::size_t j) {
-        if (scope.moved && (*scope.moved)[i] == 0 && (*scope.moved)[j] == 0) return true;
         if (!takePair()) return false;
         meet(static_cast<Index>(i), static_cast<Index>(j));
         return true;
     });
+}
+
+/// The same for pairs of which one has moved: mostly few have.
+bool Meetings::meetMoved(const std::vector<std::uint8_t>& moved) {
+    for (std::size_t i = 0; i < moved.size(); ++i) {
+        if (moved[i] == 0) continue;
+        const bool isAtLimit = m_boxes.anyOverlapping(m_boxes[i], [&](std::size_t j) {
+            if (j == i || (j < i && moved[j] != 0)) return false;
+            if (!takePair()) return true;
+            meet(static_cast<Index>(std::min(i, j)), static_cast<Index>(std::max(i, j)));
+            return false;
+        });
+        if (isAtLimit) return false;
+    }
+    return true;
 }
 
 Vec2 Meetings::vertex(Index v) const {

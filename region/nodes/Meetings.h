@@ -61,6 +61,7 @@ private:
     void raiseBoxes(const Scope& scope);
     bool takePair();
     bool meetPairs(const Scope& scope);
+    bool meetMoved(const std::vector<std::uint8_t>& moved);
     const Box& boxOf(Index element) const;
     const Carrier& carrier(Index element);
     void meet(Index i, Index j);
