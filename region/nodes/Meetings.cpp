@@ -270,10 +270,14 @@ void Meetings::stopAtShallow(Index split) {
     }
 }
 
-/// A point beside an end comes between the start and the end, too.
+/// At a point beyond an end the element stops already, at that end: going to the point and back
+/// would be a way of its own.
 void Meetings::addStop(Index element, Index point, Vec2 p) {
     const double place = placeOn(m_strands->elements[element], p);
-    m_found.push_back({element, point, std::clamp(place, 0.0, 1.0)});
+    if (place > 0.0 && place < 1.0)
+        m_found.push_back({element, point, place});
+    else
+        m_isMet[place < 0.5 ? element : m_endVertex[element]] = 1;
 }
 
 /// By element, then by place: counted into their elements, then sorted within each.
