@@ -29,27 +29,26 @@ private:
     struct Item {
         Element element;
         Index tag;
-        Index run;
-        bool backward;
+        Half half;  ///< the run that it is a piece of, and its sense
     };
 
-    void gather(const Arrangement& arrangement, const Loops& loops, std::size_t loop);
+    void gather(const Loops& loops, std::size_t loop);
+    double gatheredArea() const;
     bool joins(const Item& a, const Item& b) const;
     bool sameOrigins(const Item& a, const Item& b) const;
-    void join();
+    bool join();
     bool returns(const Element& there, const Element& back) const;
     void dropSpikes();
-    void emitLoop();
+    void emitLoop(const Loops& loops, std::size_t loop);
     void appendOrigins(const Item& item);
     bool nest();
+    void handOver(RegionSet& set);
     void arrange(RegionSet& set);
 
     const Arrangement* m_arrangement = nullptr;
     const Fans* m_fans = nullptr;
     const OriginSource* m_source = nullptr;
     std::vector<Item> m_items;
-    std::vector<Item> m_joined;  ///< those of an element made one
-    std::vector<Item> m_kept;    ///< without what goes there and back
     std::vector<Element> m_elements;
     std::vector<Index> m_ends;
     std::vector<double> m_areas;

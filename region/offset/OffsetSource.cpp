@@ -54,6 +54,7 @@ void OffsetSource::clear() {
 
 void OffsetSource::take(const RegionSet& set) {
     clear();
+    m_elements.reserve(set.elements().size());
     for (const Loop& loop : set.loops()) {
         for (Index i = loop.first; i < loop.last; ++i)
             append(set.elements()[i], i);

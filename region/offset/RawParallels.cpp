@@ -50,6 +50,7 @@ void RawParallels::make(const OffsetSource& source, double distance, double tole
 
 void RawParallels::makeLoop(const SourceElement* first, std::size_t count, Strands& strands) {
     m_parallels.clear();
+    m_parallels.reserve(count);
     for (std::size_t i = 0; i < count; ++i) {
         m_parallels.push_back(parallelOf(first[i]));
         const double chord = std::sqrt(squared(first[i].ep - first[i].sp));
@@ -130,9 +131,19 @@ Element RawParallels::cornerArc(const SourceElement& before, const SourceElement
             bulge};
 }
 
+/// Room for the parallels in hand and their corner arcs, and no more where that is all there is.
+void RawParallels::makeRoom(Strands& strands) const {
+    std::size_t needed = strands.elements.size();
+    for (const Parallel& p : m_parallels)
+        needed += (p.exists ? 1U : 0U) + (p.joint == Joint::kCorner ? 1U : 0U);
+    const std::size_t capacity = strands.elements.capacity();
+    if (needed > capacity) strands.elements.reserve(std::max(needed, 2 * capacity));
+}
+
 /// Lists the parallels of a loop and its corner arcs, and ends its strands.
 void RawParallels::emit(const SourceElement* first, std::size_t count, Strands& strands) {
     const Index begin = static_cast<Index>(strands.elements.size());
+    makeRoom(strands);
     for (std::size_t i = 0; i < count; ++i) {
         const std::size_t next = i + 1 < count ? i + 1 : 0;
         const Parallel& p = m_parallels[i];

@@ -50,6 +50,7 @@ private:
     bool meetInMiddle(Parallel& a, Parallel& b) const;
     bool trimToCrossing(Parallel& a, Parallel& b) const;
     void emit(const SourceElement* first, std::size_t count, Strands& strands);
+    void makeRoom(Strands& strands) const;
     void emitElement(const Element& e, const SourceElement& of, OriginKind kind, bool goesOn,
                      Strands& strands);
     Element cornerArc(const SourceElement& before, const SourceElement& after) const;
