@@ -7,6 +7,7 @@
 #include "gmbridge/Curves.h"
 #include "gmregion/Boolean.h"
 #include "gmregion/Offset.h"
+#include "gmregion/Parallels.h"
 
 namespace gmbridge {
 
@@ -48,10 +49,26 @@ Refusal takeOutIslands(const ContourPaths& paths, Workspace& workspace, RegionSe
     return refusalOf(part.refusal, 0);
 }
 
+/// The offset of an open contour, the only one of the paths.
+ContourOffset offsetOpen(const ContourPaths& paths, double distance) {
+    ContourOffset result;
+    Workspace workspace;
+    gmregion::Parallels beside;
+    gmregion::makeParallels(paths.paths(), distance, 0.0, {}, workspace, beside);
+    result.refusal = refusalOf(beside.refusal, 0);
+    result.contours = contoursOf(beside, paths);
+    for (const gmregion::Point& p : beside.marginal)
+        result.marginal.push_back(kernelPoint(p));
+    return result;
+}
+
 }  // namespace
 
 ContourOffset offsetContour(const GmContour& contour, double distance) {
-    return offsetPart(contour, {}, distance);
+    ContourPaths paths;
+    const Refusal refusal = paths.add(contour);
+    if (refusal || paths.paths()[0].closed) return offsetPart(contour, {}, distance);
+    return offsetOpen(paths, distance);
 }
 
 ContourOffset offsetPart(const GmContour& outline, const std::vector<const GmContour*>& islands,

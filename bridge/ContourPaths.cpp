@@ -87,13 +87,17 @@ Refusal ContourPaths::add(const GmContour& contour) {
 
 std::optional<ContourElement> ContourPaths::sourceOf(const gmregion::RegionSet& set,
                                                      std::size_t element) const {
-    const Origin origin = *set.origins(element).begin();
+    return sourceOf(set.elements()[element], *set.origins(element).begin());
+}
+
+std::optional<ContourElement> ContourPaths::sourceOf(const gmregion::Element& element,
+                                                     const Origin& origin) const {
     if (origin.path < 0 || static_cast<std::size_t>(origin.path) >= m_paths.size()) return {};
     const gmregion::PathView path = m_paths[static_cast<std::size_t>(origin.path)];
     std::size_t number = origin.element;
     if (number >= path.size()) return {};
     const bool isCorner = origin.kind == OriginKind::kCorner;
-    if (isCorner && isAboutStart(set.elements()[element], path.first[number])) {
+    if (isCorner && isAboutStart(element, path.first[number])) {
         if (number > 0) {
             --number;
         } else if (path.closed) {

@@ -46,6 +46,17 @@ bool isShort(const Element& e) {
     return chordOf(e) < 2.0 * GmBase::m_scdPrec;
 }
 
+Pieces piecesOf(const gmregion::Parallels& parallels, const gmregion::ParallelPart& part,
+                const ContourPaths& sources) {
+    Pieces pieces;
+    for (std::size_t i = part.first; i < part.last; ++i) {
+        const Element& e = parallels.elements[i];
+        const Origin& origin = parallels.origins[i];
+        pieces.push_back({e, origin, sources.sourceOf(e, origin)});
+    }
+    return pieces;
+}
+
 Pieces piecesOf(const RegionSet& set, const gmregion::Loop& loop, const ContourPaths& sources,
                 bool reversed) {
     Pieces pieces;
@@ -59,19 +70,13 @@ Pieces piecesOf(const RegionSet& set, const gmregion::Loop& loop, const ContourP
 }
 
 /// Takes out what is short: the piece behind starts where the short one started, so that a row of
-/// them does not add up. The longest piece comes first, so that it is there to stay. Leaves nothing
-/// of a loop that is then no loop any more.
+/// them does not add up. The ends stay where they are.
 /// @returns where something was taken out
 std::vector<GmPoint> takeOutShort(Pieces& pieces) {
-    const auto isShorter = [](const Piece& a, const Piece& b) {
-        return chordOf(a.element) < chordOf(b.element);
-    };
-    std::rotate(pieces.begin(), std::max_element(pieces.begin(), pieces.end(), isShorter),
-                pieces.end());
     std::vector<GmPoint> places;
     Pieces kept;
-    const Point start = pieces.front().element.sp;
-    Point sp = start;
+    const Point end = pieces.back().element.ep;
+    Point sp = pieces.front().element.sp;
     for (Piece& piece : pieces) {
         piece.element.sp = sp;
         if (isShort(piece.element)) {
@@ -81,17 +86,29 @@ std::vector<GmPoint> takeOutShort(Pieces& pieces) {
         sp = piece.element.ep;
         kept.push_back(piece);
     }
-    while (!kept.empty() && kept.back().element.ep != start) {
+    while (!kept.empty() && kept.back().element.ep != end) {
         Element& last = kept.back().element;
-        last.ep = start;
+        last.ep = end;
         if (!isShort(last)) break;
         places.push_back(kernelPoint(last.sp));
         kept.pop_back();
     }
-    const bool isFold =
-        kept.size() == 2 && kept.front().element.bulge == -kept.back().element.bulge;
-    if (kept.size() < 2 || isFold) kept.clear();
     pieces = std::move(kept);
+    return places;
+}
+
+/// The same of a loop, where the longest piece comes first, so that it is there to stay. Leaves
+/// nothing of a loop that is then no loop any more.
+std::vector<GmPoint> takeOutShortOfLoop(Pieces& pieces) {
+    const auto isShorter = [](const Piece& a, const Piece& b) {
+        return chordOf(a.element) < chordOf(b.element);
+    };
+    std::rotate(pieces.begin(), std::max_element(pieces.begin(), pieces.end(), isShorter),
+                pieces.end());
+    std::vector<GmPoint> places = takeOutShort(pieces);
+    const bool isFold =
+        pieces.size() == 2 && pieces.front().element.bulge == -pieces.back().element.bulge;
+    if (pieces.size() < 2 || isFold) pieces.clear();
     return places;
 }
 
@@ -160,6 +177,19 @@ std::unique_ptr<GmContour> contourOf(const Pieces& pieces) {
     return contour;
 }
 
+/// Appends a loop or a curve as a contour, or as lost.
+void append(SetContours& result, Pieces& pieces, bool isLoop, std::size_t region, bool hole) {
+    const GmPoint at = kernelPoint(pieces.front().element.sp);
+    const std::vector<GmPoint> places = isLoop ? takeOutShortOfLoop(pieces) : takeOutShort(pieces);
+    if (pieces.empty()) {
+        result.lost.push_back(at);
+        return;
+    }
+    if (isLoop) beginAtLowest(pieces);
+    result.closedUp.insert(result.closedUp.end(), places.begin(), places.end());
+    result.loops.push_back({contourOf(pieces), region, hole});
+}
+
 }  // namespace
 
 SetContours contoursOf(const RegionSet& set, const ContourPaths& sources,
@@ -167,15 +197,16 @@ SetContours contoursOf(const RegionSet& set, const ContourPaths& sources,
     SetContours result;
     for (const gmregion::Loop& loop : set.loops()) {
         Pieces pieces = piecesOf(set, loop, sources, outlines == GmBase::eRotCW);
-        const GmPoint at = kernelPoint(pieces.front().element.sp);
-        const std::vector<GmPoint> places = takeOutShort(pieces);
-        if (pieces.empty()) {
-            result.lost.push_back(at);
-            continue;
-        }
-        beginAtLowest(pieces);
-        result.closedUp.insert(result.closedUp.end(), places.begin(), places.end());
-        result.loops.push_back({contourOf(pieces), loop.region, loop.hole});
+        append(result, pieces, true, loop.region, loop.hole);
+    }
+    return result;
+}
+
+SetContours contoursOf(const gmregion::Parallels& parallels, const ContourPaths& sources) {
+    SetContours result;
+    for (const gmregion::ParallelPart& part : parallels.parts) {
+        Pieces pieces = piecesOf(parallels, part, sources);
+        append(result, pieces, part.closed, result.loops.size(), false);
     }
     return result;
 }

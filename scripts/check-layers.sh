@@ -20,7 +20,7 @@ declare -A floors=(
     [kernel/values]=1 [kernel/curves]=2 [kernel/contour]=3
     [region/public]=0 [region/model]=1 [region/plane]=2 [region/search]=2 [region/nodes]=3
     [region/link]=4 [region/overlay]=5 [region/offset]=6 [region/operations]=7
-    [region/locate]=5 [region/simplify]=5 [region/verify]=8
+    [region/locate]=5 [region/simplify]=5 [region/verify]=6
     [bridge/public]=1 [bridge]=2
     [region/bridge]=4 [region/corners]=7 [region/boolean]=7
     [drawing]=10 [drawing/contours]=11 [drawing/dxf]=11 [drawing/svg]=12 [drawing/files]=13

@@ -18,20 +18,22 @@ struct ContourOffset {
     std::vector<GmPoint> marginal;
 };
 
-/// The exact offset of a closed contour by way of regions, with corners rounded, as
+/// The exact offset of a contour by way of regions, with corners rounded, as
 /// GmContour::Offsetting() makes it within its known limits, and without these.
 ///
-/// What the contour runs round is offset: the part. Where it runs round places more than once, with
-/// loops of its own sense, these are inside. Where it also runs round places against its sense, it
-/// has two outsides and is refused, unless no disc of the kernel's length tolerance as radius has
-/// room there; then these are passed over.
+/// What a closed contour runs round is offset: the part. Where it runs round places more than once,
+/// with loops of its own sense, these are inside. Where it also runs round places against its
+/// sense, it has two outsides and is refused, unless no disc of the kernel's length tolerance as
+/// radius has room there; then these are passed over.
 ///
 /// Outlines run in the sense of the contour and holes against it, so that the part stays on the
 /// side on which the contour has it. For identifiers, starts, and what is too short for the kernel
 /// see contoursOf().
 ///
-/// Open contours are refused for the time being: their offset to one side is what the thickening
-/// has on that side, without its ends, and parting it takes clipping open paths by regions.
+/// Of an open contour it is all that lies at the distance on that side and not about its ends, in
+/// the contour's direction: parts of the parallel that come nearer to another part of the contour,
+/// or to its ends, are left out, see gmregion::makeParallels(). A distance of 0 is refused.
+///
 /// Refused, too, is what ContourPaths::add() and gmregion::offset() refuse, such as a distance that
 /// is not finite. Cost: near-linear.
 /// @param contour it is only read

@@ -50,6 +50,9 @@ public:
     /// @param element number of its element
     std::optional<ContourElement> sourceOf(const gmregion::RegionSet& set,
                                            std::size_t element) const;
+    /// The same for an element with its first origin.
+    std::optional<ContourElement> sourceOf(const gmregion::Element& element,
+                                           const gmregion::Origin& origin) const;
 
 private:
     gmregion::Paths m_paths;

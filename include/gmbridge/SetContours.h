@@ -8,6 +8,7 @@
 #include "gmbridge/ContourPaths.h"
 #include "gmbridge/export.h"
 #include "gmkernel/GmContour.h"
+#include "gmregion/Parallels.h"
 #include "gmregion/RegionSet.h"
 
 namespace gmbridge {
@@ -49,5 +50,10 @@ struct SetContours {
 /// @param outlines the sense in which outlines run, eRotCW for clockwise; holes run against it
 GMBRIDGE_EXPORT SetContours contoursOf(const gmregion::RegionSet& set, const ContourPaths& sources,
                                        GmBase::eRotDir outlines = GmBase::eRotCCW);
+
+/// Curves beside contours as contours of the kernel: the same, but that those which are open keep
+/// both their ends, and each is a region of its own.
+GMBRIDGE_EXPORT SetContours contoursOf(const gmregion::Parallels& parallels,
+                                       const ContourPaths& sources);
 
 }  // namespace gmbridge

@@ -78,15 +78,24 @@ BoundaryIndex::Near BoundaryIndex::nearest(Vec2 p, double limit) const {
 
 bool BoundaryIndex::isNear(std::size_t piece, Vec2 p, double limit) const {
     const BoundaryPiece& e = m_pieces[piece];
-    if (!(std::fabs(signedDistance(e.carrier, p)) <= limit)) return false;
+    if (!isWithin(e.carrier, p, limit)) return false;
     const Vec2 way = nearestOn(e, e.carrier, p) - p;
     return dot(way, way) <= limit * limit;
 }
 
 bool BoundaryIndex::isAnyNear(Vec2 p, double limit) const {
+    Index guess = kNone;
+    return isAnyNear(p, limit, guess);
+}
+
+bool BoundaryIndex::isAnyNear(Vec2 p, double limit, Index& guess) const {
+    if (guess < m_pieces.size() && isNear(guess, p, limit)) return true;
     const Vec2 by{limit, limit};
-    return m_boxes.anyOverlapping({p - by, p + by},
-                                  [&](std::size_t i) { return isNear(i, p, limit); });
+    return m_boxes.anyOverlapping({p - by, p + by}, [&](std::size_t i) {
+        if (!isNear(i, p, limit)) return false;
+        guess = static_cast<Index>(i);
+        return true;
+    });
 }
 
 }  // namespace gmregion

@@ -56,6 +56,8 @@ public:
     /// Whether a piece is not farther off than a limit.
     bool isNear(std::size_t piece, Vec2 p, double limit) const;
     bool isAnyNear(Vec2 p, double limit) const;
+    /// The same, asking first the piece that was near the last time.
+    bool isAnyNear(Vec2 p, double limit, Index& guess) const;
 
 private:
     void append(const Element& e, Index element);

@@ -57,6 +57,7 @@ void Arrangement::cutRound(bool first) {
     gatherPoints(first);
     m_runs.clear();
     m_out.clear();
+    m_out.elements.reserve(m_in.elements.size() + m_meetings.stopCount());
     m_movedOut.clear();
     for (const Strand& strand : m_in.strands)
         cutStrand(strand);

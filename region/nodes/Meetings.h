@@ -46,6 +46,7 @@ public:
 
     /// Whether anything was found but that elements end at common points.
     bool foundAny() const { return !m_stops.empty() || m_turnsBack; }
+    std::size_t stopCount() const { return m_stops.size(); }
     Index endVertex(Index element) const { return m_endVertex[element]; }
     std::size_t vertexCount() const { return m_isMet.size(); }
     Vec2 vertex(Index v) const;
@@ -61,6 +62,7 @@ private:
     void raiseBoxes(const Scope& scope);
     bool takePair();
     bool meetPairs(const Scope& scope);
+    bool meetMoved(const std::vector<std::uint8_t>& moved);
     const Box& boxOf(Index element) const;
     const Carrier& carrier(Index element);
     void meet(Index i, Index j);

@@ -39,7 +39,8 @@ bool combine(const RegionSet& first, const RegionSet& second, Combination combin
         takeSet(first, {1, 0}, 0, strands);
         const Index firstOfSecond = static_cast<Index>(strands.elements.size());
         takeSet(second, {0, 1}, split, strands);
-        return firstOfSecond;
+        // At a coarser tolerance than its own a set is compared with itself as well.
+        return first.tolerance() == second.tolerance() ? firstOfSecond : kNone;
     };
     return overlayInAttempts(scratch, tolerance, fill, source, coveredBy(combination), outcome);
 }

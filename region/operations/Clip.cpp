@@ -9,7 +9,7 @@
 
 #include <algorithm>
 
-#include "region/link/PieceJoin.h"
+#include "region/link/PieceWriter.h"
 #include "region/operations/Scratch.h"
 #include "region/overlay/Intake.h"
 #include "region/overlay/Overlay.h"
@@ -35,7 +35,10 @@ bool refuse(Clipping& clipping, const Refusal& refusal) {
 class PartWriter {
 public:
     PartWriter(const OverlayScratch& scratch, Clipping& clipping)
-        : m_scratch(scratch), m_arrangement(scratch.arrangement), m_clipping(clipping) {}
+        : m_scratch(scratch),
+          m_arrangement(scratch.arrangement),
+          m_clipping(clipping),
+          m_writer(clipping.elements, scratch.arrangement.tolerance()) {}
 
     /// Runs of a strand stand from one number up to another one.
     void write(const Strand& strand, Index firstRun, Index lastRun) {
@@ -62,33 +65,23 @@ private:
     void append(Index run, bool begins) {
         const Place place = placeOf(run);
         const Index next = static_cast<Index>(m_clipping.elements.size());
-        if (begins || m_clipping.parts.back().place != place)
+        if (begins || m_clipping.parts.back().place != place) {
             m_clipping.parts.push_back({next, next, false, place});
-        const Run& r = m_arrangement.runs()[run];
-        for (Index i = r.first; i < r.last; ++i)
-            appendPiece(m_arrangement.pieces()[i]);
-        m_clipping.parts.back().last = static_cast<Index>(m_clipping.elements.size());
-    }
-
-    /// Appends a piece, or lengthens the element before by it.
-    void appendPiece(const StrandElement& piece) {
-        const Origin& origin = m_scratch.origins[piece.tag];
-        const bool isFirst = m_clipping.parts.back().first == m_clipping.elements.size();
-        if (!isFirst && m_lastTag == piece.tag &&
-            makeOne(m_clipping.elements.back(), piece, m_arrangement.tolerance())) {
-            Element& before = m_clipping.elements.back();
-            before = {before.sp, piece.ep, joinedBulge(before.bulge, piece.bulge)};
-            return;
+            m_writer.begin();
         }
-        m_lastTag = piece.tag;
-        m_clipping.elements.push_back(piece);
-        m_clipping.origins.push_back(origin);
+        const Run& r = m_arrangement.runs()[run];
+        for (Index i = r.first; i < r.last; ++i) {
+            const StrandElement& piece = m_arrangement.pieces()[i];
+            if (m_writer.append(piece, piece.tag))
+                m_clipping.origins.push_back(m_scratch.origins[piece.tag]);
+        }
+        m_clipping.parts.back().last = static_cast<Index>(m_clipping.elements.size());
     }
 
     const OverlayScratch& m_scratch;
     const Arrangement& m_arrangement;
     Clipping& m_clipping;
-    Index m_lastTag = kNone;
+    PieceWriter m_writer;
 };
 
 /// Writes the parts of all strands that count nothing.

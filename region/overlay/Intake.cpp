@@ -46,6 +46,8 @@ Extent extentOf(const Paths& paths) {
     }
     if (box.isEmpty()) return extent;
     extent.size = std::max(box.size().x, box.size().y);
+    if (extent.size > 0.0 && extent.size < kSmallestSize)
+        extent.refusal = {Reason::kOutOfRange, box.low, 0};
     extent.largest = std::max(largestOf(box.low), largestOf(box.high));
     if (!(extent.largest <= 4.0 * kLargestCoordinate))
         extent.refusal = {Reason::kOutOfRange, {}, 0};

@@ -11,6 +11,8 @@ namespace gmregion {
 
 /// The largest coordinate that operations take.
 constexpr double kLargestCoordinate = 1e12;
+/// The smallest size of a drawing that operations take: areas and their squares are numbers yet.
+constexpr double kSmallestSize = 1e-60;
 /// The tolerance is at least the largest coordinate times this.
 constexpr double kFinestTolerance = 1.0 / 17592186044416.0;  // 2^-44
 

@@ -6,6 +6,10 @@
 /// runs that are covered on one side only bound the result.
 #include "region/overlay/Overlay.h"
 
+#include <utility>
+
+#include "region/overlay/Intake.h"
+
 namespace gmregion {
 
 bool refuse(Outcome& outcome, const Refusal& refusal) {
@@ -47,6 +51,20 @@ bool overlay(OverlayScratch& scratch, double tolerance, Index split, Care care,
     if (scratch.writer.write(arrangement, scratch.fans, scratch.loops, source, outcome.regions))
         return true;
     return refuse(outcome, {Reason::kUncertified, scratch.writer.conflict(), 0});
+}
+
+void consolidate(OverlayScratch& scratch, double tolerance, Outcome& outcome) {
+    std::swap(scratch.loose, outcome);
+    OriginSource source;
+    source.first = &scratch.loose.regions;
+    Strands& strands = scratch.arrangement.strands();
+    strands.clear();
+    takeSet(scratch.loose.regions, {1, 0}, 0, strands);
+    const Covers covers = [](Weight w) { return w.a > 0; };
+    if (overlay(scratch, tolerance, kNone, Care::kUsual, source, covers, outcome))
+        std::swap(outcome.marginal, scratch.loose.marginal);
+    else
+        std::swap(scratch.loose, outcome);
 }
 
 }  // namespace gmregion

@@ -22,11 +22,19 @@ struct OverlayAttempt {
     double share;  ///< of the tolerance
     Care care;
 };
-constexpr std::array<OverlayAttempt, 3> kOverlayAttempts{
-    {{1.0, Care::kUsual}, {1.0, Care::kThorough}, {0.5, Care::kThorough}}};
+constexpr std::array<OverlayAttempt, 5> kOverlayAttempts{{{1.0, Care::kUsual},
+                                                          {1.0, Care::kThorough},
+                                                          {1.0 / 2.0, Care::kThorough},
+                                                          {1.0 / 8.0, Care::kThorough},
+                                                          {1.0 / 64.0, Care::kThorough}}};
 
-/// The same, and once more with more care where that does not work out, then with half the
-/// tolerance: what lies just within the tolerance then lies just beyond it.
+/// Lays a result over itself once more, so that it holds for a tolerance: no element shorter,
+/// nothing nearer to each other. Where that does not work out it stays as it is, with the tolerance
+/// that it has.
+void consolidate(OverlayScratch& scratch, double tolerance, Outcome& outcome);
+
+/// The same, and once more with more care where that does not work out, then with smaller
+/// parts of the tolerance: what lies just within the tolerance then lies just beyond it.
 /// @param fill fills the strands, and answers where to split them
 template <class Fill>
 bool overlayInAttempts(OverlayScratch& scratch, double tolerance, const Fill& fill,
@@ -35,10 +43,11 @@ bool overlayInAttempts(OverlayScratch& scratch, double tolerance, const Fill& fi
         Strands& strands = scratch.arrangement.strands();
         strands.clear();
         const Index split = fill(strands);
+        scratch.order.improve(strands, split);
         if (!overlay(scratch, attempt.share * tolerance, split, attempt.care, source, covers,
                      outcome))
             continue;
-        SetWriter::setTolerance(outcome.regions, tolerance);
+        if (attempt.share < 1.0) consolidate(scratch, tolerance, outcome);
         return true;
     }
     return false;

@@ -139,34 +139,52 @@ CrossingPoints crossings(const Carrier& a, const Carrier& b) {
     return points;
 }
 
-double placeOn(const Element& e, Vec2 p) {
+namespace {
+
+/// Where a point of a carrier lies beside the element: before its start, behind its end, or on the
+/// far side of the circle.
+struct Beside {
+    bool before;
+    bool behind;
+    bool across;
+};
+
+Beside besideOf(const Element& e, Vec2 p) {
     const Vec2 chord = e.ep - e.sp;
+    const Vec2 fromStart = p - e.sp;
+    const double aside = cross(chord, fromStart);
+    // Of a circle, the arc is what lies on its own side of the chord.
+    if (std::fabs(e.bulge) > kBent) return {false, false, aside * e.bulge > 0.0};
+    // Of the circle's points beside the chord, those beyond the centre are not on the arc. The
+    // centre lies at the height L (1 - b^2) / (4 b).
+    const double heights = 4.0 * e.bulge * aside;
+    const bool beyond = heights > dot(chord, chord) * (1.0 - e.bulge) * (1.0 + e.bulge);
+    return {dot(chord, fromStart) < 0.0, dot(chord, e.ep - p) < 0.0, beyond};
+}
+
+}  // namespace
+
+double placeOn(const Element& e, Vec2 p) {
     const Vec2 fromStart = p - e.sp;
     const Vec2 toEnd = e.ep - p;
     const double a = std::sqrt(dot(fromStart, fromStart));
     const double b = std::sqrt(dot(toEnd, toEnd));
     const double place = a + b > 0.0 ? a / (a + b) : 0.0;
-    if (std::fabs(e.bulge) > kBent) {
-        // Of a circle, the arc is what lies on its own side of the chord.
-        const bool onArc = (cross(chord, fromStart) > 0.0) != (e.bulge > 0.0);
-        if (onArc) return place;
-        return a < b ? -place : 2.0 - place;
-    }
-    // Of the circle's points beside the chord, those beyond the centre are not on the arc. The
-    // centre lies at the height L (1 - b^2) / (4 b).
-    const double heights = 4.0 * e.bulge * cross(chord, fromStart);
-    const bool beyond = heights > dot(chord, chord) * (1.0 - e.bulge) * (1.0 + e.bulge);
-    if (dot(chord, fromStart) < 0.0 || (beyond && a < b)) return -place;
-    if (dot(chord, toEnd) < 0.0 || beyond) return 2.0 - place;
+    const Beside beside = besideOf(e, p);
+    if (beside.before || (beside.across && a < b)) return -place;
+    if (beside.behind || beside.across) return 2.0 - place;
     return place;
+}
+
+bool spans(const Element& e, Vec2 p) {
+    const Beside beside = besideOf(e, p);
+    return !(beside.before || beside.behind || beside.across);
 }
 
 CrossingPoints crossings(const Element& a, const Element& b) {
     CrossingPoints points;
     for (const Vec2 p : crossings(carrierOf(a), carrierOf(b))) {
-        const double onA = placeOn(a, p);
-        const double onB = placeOn(b, p);
-        if (onA >= 0.0 && onA <= 1.0 && onB >= 0.0 && onB <= 1.0) points.add(p);
+        if (spans(a, p) && spans(b, p)) points.add(p);
     }
     return points;
 }

@@ -30,6 +30,8 @@ public:
 
     std::size_t size() const { return m_ends.empty() ? 0 : m_ends.front(); }
     const Box& operator[](std::size_t index) const { return m_boxes[index]; }
+    /// The box about all; empty for an empty row.
+    Box bounds() const { return size() > 0 ? boxOf(top(), 0) : Box{}; }
 
     /// Calls visit(index) for the boxes that overlap a box, in the order of the row.
     template <class Visit>

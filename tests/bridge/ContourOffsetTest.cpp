@@ -86,6 +86,27 @@ TEST(ContourOffset, IsTheKernelsWhereThatIsRight) {
     EXPECT_EQ(compared, 24);
 }
 
+TEST(ContourOffset, OpenContoursHaveParallelsOnTheSideAskedFor) {
+    const auto angle = identified(shapes::Path("0 0  10 0  10 5"), false);
+    const ContourOffset right = offsetContour(*angle, 1.0);
+    ASSERT_EQ(right.contours.loops.size(), 1U);
+    const GmContour& beside = *right.contours.loops[0].contour;
+    ASSERT_EQ(beside.ElementCount(), 3);
+    EXPECT_TRUE(beside.GetElement(0)->SP() == GmPoint(0, -1));
+    EXPECT_TRUE(beside.GetElement(2)->EP() == GmPoint(11, 5));
+    EXPECT_TRUE(beside.GetContElement(1)->bInserted);
+    EXPECT_EQ(beside.GetContElement(1)->lId, angle->GetContElement(0)->lId);
+    EXPECT_EQ(beside.GetContElement(2)->lId, angle->GetContElement(1)->lId);
+    const ContourOffset left = offsetContour(*angle, -1.0);
+    ASSERT_EQ(left.contours.loops.size(), 1U);
+    EXPECT_NEAR(shapes::ChainLength(*left.contours.loops[0].contour), 9.0 + 4.0, 1e-9);
+
+    // Between the arms of a hairpin nothing is left but what lies beside its ends and turn.
+    const GmContour hairpin = shapes::Path("0 0  9 0  9 3  0 3");
+    EXPECT_TRUE(offsetContour(hairpin, -2.0).contours.loops.empty());
+    EXPECT_EQ(offsetContour(hairpin, -1.0).contours.loops.size(), 1U);
+}
+
 TEST(ContourOffset, IslandsOfAPlateFollowItsOutline) {
     const GmContour hole = shapes::Moved(shapes::Path("2 0  ccw 0 0 -2 0  ccw 0 0 2 0"), 6, 4.5);
     int compared = 0;
@@ -222,12 +243,13 @@ TEST(ContourOffset, RefusesWhatHasNoAnswer) {
     EXPECT_TRUE(notFinite.contours.loops.empty());
     EXPECT_STREQ(textOf(notFinite.refusal), gmregion::textOf(gmregion::Reason::kNotFinite));
 
-    EXPECT_EQ(offsetContour(open, 1.0).refusal.reason, Reason::kOpen);
+    EXPECT_EQ(offsetContour(open, 0.0).refusal.regions, gmregion::Reason::kTolerance);
     EXPECT_EQ(offsetContour(undefined, 1.0).refusal.reason, Reason::kUndefined);
     const Refusal second = offsetPart(square, {&square, nullptr}, 1.0).refusal;
     EXPECT_EQ(second.reason, Reason::kUndefined);
     EXPECT_EQ(second.contour, 2U);
     EXPECT_EQ(offsetPart(square, {&open}, 1.0).refusal.contour, 1U);
+    EXPECT_EQ(offsetPart(open, {&square}, 1.0).refusal.reason, Reason::kOpen);
     GmContour huge = shapes::Square(10);
     huge.Transform(GmMatrix::matrixScale(1e13));
     EXPECT_EQ(offsetContour(huge, 1.0).refusal.regions, gmregion::Reason::kOutOfRange);
