@@ -47,10 +47,11 @@ StrandElement flattened(StrandElement e, double tolerance) {
 
 }  // namespace
 
-bool Arrangement::settle(double tolerance, Index split, Care care) {
+bool Arrangement::settle(double tolerance, Index split, Care care, bool wantsNearMisses) {
     m_tolerance = tolerance;
     m_settled.clear();
-    if (!m_meetings.find(m_in, tolerance, {split, nullptr, care})) return false;
+    if (!m_meetings.find(m_in, tolerance, {split, nullptr, care, wantsNearMisses})) return false;
+    m_nearMisses = m_meetings.nearMisses();
     cutRound(true);
     for (int round = 1;; ++round) {
         const bool any = std::find(m_moved.begin(), m_moved.end(), 1) != m_moved.end();

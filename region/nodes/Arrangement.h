@@ -39,7 +39,11 @@ public:
     /// @param split where it is not kNone, elements before and from that number on are two clean
     /// sets, and those of one of them are not compared with each other
     /// @param care see Care
-    bool settle(double tolerance, Index split = kNone, Care care = Care::kUsual);
+    /// @param wantsNearMisses whether to note them
+    bool settle(double tolerance, Index split = kNone, Care care = Care::kUsual,
+                bool wantsNearMisses = false);
+    /// See Meetings.
+    const std::vector<Vec2>& nearMisses() const { return m_nearMisses; }
 
     const std::vector<Vec2>& nodes() const { return m_clusters.nodes(); }
     /// Along each strand in their order.
@@ -61,6 +65,7 @@ private:
     void passNode(Index node);
     bool hasMoved(const StrandElement& e, Vec2 was, Vec2 node) const;
 
+    std::vector<Vec2> m_nearMisses;
     Strands m_in;
     Strands m_out;
     double m_tolerance = 0.0;

@@ -25,6 +25,8 @@ namespace {
 /// Crossings at a smaller sine lie where rounding lets them along the elements.
 constexpr double kShallow = 1e-4;
 constexpr double kAnySine = 2.0;
+/// In tolerances: what comes nearer is a near miss.
+constexpr double kNear = 4.0;
 
 double squaredLength(Vec2 v) {
     return dot(v, v);
@@ -43,6 +45,8 @@ bool Meetings::find(const Strands& strands, double tolerance, const Scope& scope
     m_points.clear();
     m_found.clear();
     m_shallowPoints.clear();
+    m_nearMisses.clear();
+    m_reach = scope.wantsNearMisses ? 0.5 * kNear * tolerance : tolerance;
     m_turnsBack = false;
     prepare(strands);
     raiseBoxes(scope);
@@ -127,7 +131,7 @@ void Meetings::raiseBoxes(const Scope& scope) {
     m_boxes.begin(split);
     m_otherBoxes.begin(elements.size() - split);
     for (std::size_t i = 0; i < elements.size(); ++i)
-        (i < split ? m_boxes : m_otherBoxes).add(boxAbout(elements[i]).grown(m_tolerance));
+        (i < split ? m_boxes : m_otherBoxes).add(boxAbout(elements[i]).grown(m_reach));
     m_boxes.finish();
     m_otherBoxes.finish();
 }
@@ -151,8 +155,7 @@ void Meetings::meet(Index i, Index j) {
     const bool thenB = m_endVertex[i] == j;
     const bool thenA = m_endVertex[j] == i;
     if ((thenB && a.joined) || (thenA && b.joined)) return;
-    if (!thenA && !thenB && areApart(carrier(i), boxOf(i), carrier(j), boxOf(j), m_tolerance))
-        return;
+    if (!thenA && !thenB && areApart(carrier(i), boxOf(i), carrier(j), boxOf(j), m_reach)) return;
     const std::size_t before = m_found.size();
     m_contacts.clear();
     const bool endsOfA = stopAtEnds(i, j);
@@ -163,7 +166,10 @@ void Meetings::meet(Index i, Index j) {
     if (backAndForth || (a.sp == b.sp && a.ep == b.ep)) return;
     const bool isAlong = straight ? thenA || thenB || (endsOfA && endsOfB) : runAlong(i, j);
     if (!isAlong) meetBetween(i, j, thenA || thenB);
-    if (m_found.size() == before) return;
+    if (m_found.size() == before) {
+        if (m_reach > m_tolerance && !thenA && !thenB) noteNearMiss(i, j);
+        return;
+    }
     // Neighbours that meet again lie side by side from there to their common end, which is where
     // they turn back.
     if (thenB) m_isMet[j] = 1;
@@ -179,6 +185,24 @@ void Meetings::meetBackAndForth(Index i, Index j) {
     m_turnsBack = m_turnsBack || m_isMet[i] == 0 || m_isMet[j] == 0;
     m_isMet[i] = 1;
     m_isMet[j] = 1;
+}
+
+/// Notes where an end of one element comes near another one, or both do between their ends.
+void Meetings::noteNearMiss(Index i, Index j) {
+    const StrandElement& a = m_strands->elements[i];
+    const StrandElement& b = m_strands->elements[j];
+    const auto isNearMiss = [&](Vec2 p, const Element& e, const Carrier& c) {
+        return squaredLength(nearestOn(e, c, p) - p) <= kNear * kNear * m_tolerance * m_tolerance;
+    };
+    for (const Vec2 p : {a.sp, a.ep}) {
+        if (isNearMiss(p, b, carrier(j))) return m_nearMisses.push_back(p);
+    }
+    for (const Vec2 p : {b.sp, b.ep}) {
+        if (isNearMiss(p, a, carrier(i))) return m_nearMisses.push_back(p);
+    }
+    const std::optional<Vec2> p = nearestApproach(carrier(i), carrier(j));
+    if (p && isNearMiss(*p, a, carrier(i)) && isNearMiss(*p, b, carrier(j)))
+        m_nearMisses.push_back(*p);
 }
 
 /// Whether two elements lie beside each other from one end that is on both to another one: then

@@ -33,6 +33,7 @@ public:
         const std::vector<std::uint8_t>* moved =
             nullptr;  ///< if given, of each two one that is set
         Care care = Care::kUsual;
+        bool wantsNearMisses = false;  ///< see nearMisses()
     };
 
     /// Lets the next calls compare so many pairs of elements altogether.
@@ -53,6 +54,9 @@ public:
     /// True for vertices that something else comes near, and for the ends of open strands.
     bool isMet(Index v) const { return m_isMet[v] != 0; }
     const std::vector<Vec2>& points() const { return m_points; }
+    /// Where elements of which no two follow each other come within four tolerances of each other
+    /// without meeting.
+    const std::vector<Vec2>& nearMisses() const { return m_nearMisses; }
     /// The stops of an element, from its start to its end: firstStop(e) up to firstStop(e + 1).
     Index firstStop(Index element) const { return m_firstStop[element]; }
     const std::vector<Stop>& stops() const { return m_stops; }
@@ -70,6 +74,7 @@ private:
     void meetBetween(Index i, Index j, bool areNeighbours);
     bool stopAtEnds(Index ends, Index on);
     void stopBoth(Index i, Index j, Vec2 p);
+    void noteNearMiss(Index i, Index j);
     bool runAlong(Index i, Index j);
     bool isNear(const Carrier& c, Vec2 p) const;
     bool isNearCommonEnd(const Element& a, const Element& b, Vec2 p) const;
@@ -92,6 +97,8 @@ private:
     std::vector<std::uint8_t> m_hasCarrier;
     std::vector<Index> m_endVertex;
     std::vector<std::uint8_t> m_isMet;
+    double m_reach = 0.0;  ///< by which boxes are grown
+    std::vector<Vec2> m_nearMisses;
     std::vector<Vec2> m_points;
     std::vector<Index> m_shallowPoints;  ///< where elements cross at a small angle
     std::vector<Stop> m_found;

@@ -8,6 +8,7 @@
 #include "region/plane/ElementBox.h"
 #include "region/plane/ElementHalves.h"
 #include "region/plane/Measures.h"
+#include "region/plane/Nearest.h"
 
 namespace gmregion {
 

@@ -26,6 +26,9 @@ namespace gmregion {
 
 namespace {
 
+/// In tolerances: the largest radius of a parallel that counts as none.
+constexpr double kVanishing = 4.0;
+
 double squared(Vec2 v) {
     return dot(v, v);
 }
@@ -40,6 +43,7 @@ void RawParallels::make(const OffsetSource& source, double distance, double tole
     m_sweptArea = 0.0;
     m_source = source.elements().data();
     m_madeOf.clear();
+    m_vanishing.clear();
     strands.clear();
     Index first = 0;
     for (const Index last : source.loopEnds()) {
@@ -53,6 +57,7 @@ void RawParallels::makeLoop(const SourceElement* first, std::size_t count, Stran
     m_parallels.reserve(count);
     for (std::size_t i = 0; i < count; ++i) {
         m_parallels.push_back(parallelOf(first[i]));
+        noteVanishing(first[i]);
         const double chord = std::sqrt(squared(first[i].ep - first[i].sp));
         const double growth = 1.0 + first[i].curvature * m_distance;
         m_sweptArea += chord * (1.0 + first[i].bulge * first[i].bulge) * std::fabs(m_distance) *
@@ -63,6 +68,13 @@ void RawParallels::makeLoop(const SourceElement* first, std::size_t count, Stran
         m_parallels[i].joint = join(first[i], first[next], m_parallels[i], m_parallels[next]);
     }
     emit(first, count, strands);
+}
+
+/// Notes an arc whose radius is the distance, within some tolerances, on its inner side.
+void RawParallels::noteVanishing(const SourceElement& e) {
+    const double growth = 1.0 + e.curvature * m_distance;
+    if (!(std::fabs(growth) <= kVanishing * m_tolerance * std::fabs(e.curvature))) return;
+    m_vanishing.push_back(e.sp - m_distance * e.startNormal);
 }
 
 RawParallels::Parallel RawParallels::parallelOf(const SourceElement& e) const {

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include <cmath>
 #include <vector>
 
 #include "gmregion/RegionSet.h"
@@ -25,6 +26,10 @@ public:
     const MadeOf& madeOf() const { return m_madeOf; }
     /// The distance of a point from what the element with a tag is the parallel or the corner of.
     double ownDistance(const OffsetSource& source, Index tag, Vec2 p) const;
+    /// The distance without its sign.
+    double radius() const { return std::fabs(m_distance); }
+    /// The centres of arcs that are parallels of radius 0, within some tolerances.
+    const std::vector<Vec2>& vanishing() const { return m_vanishing; }
     /// An upper bound of the area between the source and its offset: the sum of the areas that the
     /// elements and the corners sweep.
     double sweptArea() const { return m_sweptArea; }
@@ -50,6 +55,7 @@ private:
     bool meetInMiddle(Parallel& a, Parallel& b) const;
     bool trimToCrossing(Parallel& a, Parallel& b) const;
     void emit(const SourceElement* first, std::size_t count, Strands& strands);
+    void noteVanishing(const SourceElement& e);
     void makeRoom(Strands& strands) const;
     void emitElement(const Element& e, const SourceElement& of, OriginKind kind, bool goesOn,
                      Strands& strands);
@@ -61,6 +67,7 @@ private:
     bool m_trims = true;
     double m_sweptArea = 0.0;
     std::vector<Parallel> m_parallels;
+    std::vector<Vec2> m_vanishing;
     const SourceElement* m_source = nullptr;  ///< the first element of the source
     MadeOf m_madeOf;
 };

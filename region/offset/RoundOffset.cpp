@@ -53,7 +53,8 @@ bool roundOffset(OverlayScratch& scratch, OffsetScratch& offsets, const OriginSo
     Arrangement& arrangement = scratch.arrangement;
     offsets.raw.make(offsets.source, distance, tolerance, trims, arrangement.strands());
     beginOutcome(outcome, tolerance);
-    if (!arrangement.settle(tolerance)) return refuseUnsettled(arrangement, outcome);
+    if (!arrangement.settle(tolerance, kNone, Care::kUsual, true))
+        return refuseUnsettled(arrangement, outcome);
     scratch.fans.build(arrangement);
     scratch.loops.begin(arrangement, scratch.fans);
     if (!offsets.choice.choose(arrangement, scratch.fans, offsets.source, offsets.raw,

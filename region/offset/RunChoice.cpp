@@ -59,6 +59,9 @@ bool RunChoice::choose(const Arrangement& arrangement, Fans& fans, const OffsetS
         ++m_surplus[start(run)];
         --m_surplus[end(run)];
     }
+    // Arcs whose radius is the distance; necks and gaps hardly wider than twice the distance.
+    note(raw.vanishing(), source, raw.radius());
+    note(arrangement.nearMisses(), source, raw.radius());
     if (!settleNodes()) return false;
     for (Index run = 0; run < runs().size(); ++run) {
         if (m_states[run].chosen) loops.choose(run, m_states[run].backward);
@@ -99,6 +102,14 @@ double RunChoice::excessAt(Vec2 p, Index tag, const OffsetSource& source, const 
     const double nearest =
         source.distanceBelow(p, own - kCertain * tolerance, own - kSurelyOut * tolerance, m_guess);
     return (own - nearest) / tolerance;
+}
+
+/// Notes those of some points that are boundary, or nearly so.
+void RunChoice::note(const std::vector<Vec2>& points, const OffsetSource& source, double radius) {
+    const double least = radius - kSurelyOut * m_arrangement->tolerance();
+    for (const Vec2 p : points) {
+        if (source.distanceBelow(p, least, 0.0, m_guess) >= least) m_marginal.push_back(p);
+    }
 }
 
 void RunChoice::change(Index run) {

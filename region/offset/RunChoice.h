@@ -36,6 +36,7 @@ private:
 
     State judge(Index run, const OffsetSource& source, const RawParallels& raw);
     double excessAt(Vec2 p, Index tag, const OffsetSource& source, const RawParallels& raw);
+    void note(const std::vector<Vec2>& points, const OffsetSource& source, double radius);
     const std::vector<Run>& runs() const { return m_arrangement->runs(); }
     Index start(Index run) const {
         return m_states[run].backward ? runs()[run].to : runs()[run].from;
