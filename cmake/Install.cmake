@@ -32,4 +32,5 @@ endfunction()
 
 gmkernel_install_package(gmkernel)
 gmkernel_install_package(gmregion)
+gmkernel_install_package(gmbridge)
 install(FILES "${PROJECT_SOURCE_DIR}/LICENSE" DESTINATION "${CMAKE_INSTALL_DOCDIR}")

@@ -17,6 +17,7 @@ cmake -S tests/consumer -B "$work/build" -G Ninja -DCMAKE_PREFIX_PATH="$prefix" 
 cmake --build "$work/build"
 "$work/build/consumer"
 "$work/build/regions"
+"$work/build/bridge"
 
 echo "-- by pkg-config"
 PKG_CONFIG_PATH=$(dirname "$(find "$prefix" -name gmkernel.pc)")
@@ -30,6 +31,10 @@ read -ra region_flags <<<"$(pkg-config --cflags --libs gmregion)"
 g++ -std=c++20 -Wall -Wextra -Werror tests/consumer/regions.cpp "${region_flags[@]}" \
     "-Wl,-rpath,$libdir" -o "$work/regions"
 "$work/regions"
+read -ra bridge_flags <<<"$(pkg-config --cflags --libs gmbridge)"
+g++ -std=c++20 -Wall -Wextra -Werror tests/consumer/bridge.cpp "${bridge_flags[@]}" \
+    "-Wl,-rpath,$libdir" -o "$work/bridge"
+"$work/bridge"
 
 echo "-- the example of the README"
 awk '/^```cpp$/ { inside = 1; next } /^```$/ { inside = 0 } inside' README.md >"$work/readme.cpp"

@@ -6,7 +6,7 @@ set -euo pipefail
 cd "$(dirname "$0")/.."
 build=${1:?usage: $0 BUILD_DIR}
 
-headers=$(cd include && find gmkernel gmregion -name '*.h' | sort)
+headers=$(cd include && find gmkernel gmregion gmbridge -name '*.h' | sort)
 [ -n "$headers" ] || { echo "check-headers: no public header found" >&2; exit 1; }
 
 failed=0

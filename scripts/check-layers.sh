@@ -1,8 +1,9 @@
 #!/usr/bin/env bash
 # Checks that includes go downward only: a file includes what stands in its own room or on a lower
-# floor. The kernel and the regions stand side by side and do not know each other but for the
-# bridge; drawings, machining and the program stand over them. Who may include the kernel's public
-# headers is listed below; its private ones are its own.
+# floor. The kernel and the regions stand side by side and do not know each other; the bridge
+# stands on the public headers of both, and drawings, machining and the program stand over them. Who
+# may include the public headers of kernel and bridge is listed below; the kernel's private ones are
+# its own.
 #
 # Two places of the kernel may look up, both in a source file: a value answers its bounding
 # rectangle, and the pair dispatch reaches contours. Public headers name a class of a higher floor
@@ -19,15 +20,16 @@ declare -A floors=(
     [kernel/values]=1 [kernel/curves]=2 [kernel/contour]=3
     [region/public]=0 [region/model]=1 [region/plane]=2 [region/search]=2 [region/nodes]=3
     [region/link]=4 [region/overlay]=5 [region/offset]=6 [region/operations]=7
-    [region/locate]=5 [region/simplify]=5 [region/verify]=8
+    [region/locate]=5 [region/simplify]=5 [region/verify]=6
+    [bridge/public]=1 [bridge]=2
     [region/bridge]=4 [region/corners]=7 [region/boolean]=7
     [drawing]=10 [drawing/contours]=11 [drawing/dxf]=11 [drawing/svg]=12 [drawing/files]=13
     [machining/moves]=14 [machining/runs]=14 [machining/obstacles]=14 [machining/order]=14
     [machining/gcode]=15 [machining/leads]=15 [machining]=16 [machining/picture]=17
     [apps/gmpath]=18
 )
-# Besides the kernel itself these rooms may include its public headers.
-kernel_users='^(region/bridge|machining/leads)$'
+# Besides the kernel itself these rooms may include its public headers, and those of the bridge.
+kernel_users='^(bridge|bridge/public|region/bridge|machining/leads)$'
 
 # The room of a header or source by its path, empty when it is in none.
 room_of() {
@@ -36,6 +38,7 @@ room_of() {
     if [[ $name =~ ^gmkernel/($curves)\.h$ ]]; then echo kernel/curves; return; fi
     if [[ $name =~ ^gmkernel/($contour)\.h$ ]]; then echo kernel/contour; return; fi
     if [[ $name == gmregion/* ]]; then echo region/public; return; fi
+    if [[ $name == gmbridge/* ]]; then echo bridge/public; return; fi
     while [[ $name == */* ]]; do
         name=${name%/*}
         if [ -n "${floors[$name]:-}" ]; then echo "$name"; return; fi
@@ -58,6 +61,8 @@ may_include() { # source file, its room, included header, its room
         [[ $2 =~ $kernel_users && $3 == gmkernel/* ]]
         return
     fi
+    if [[ $2 == bridge* && $4 == region/* && $4 != region/public ]]; then return 1; fi
+    if [[ $4 == bridge/public && ! $2 =~ $kernel_users ]]; then return 1; fi
     [ "$2" = "$4" ] || [ "${floors[$4]}" -lt "${floors[$2]}" ] || looks_up_by_design "$1" "$3"
 }
 
@@ -85,7 +90,7 @@ while IFS=: read -r file line; do
         check_foreign "$file" "$header"
         continue
     fi
-    if [[ ! $header =~ ^gm(kernel|region)/ && ! -e $header ]]; then
+    if [[ ! $header =~ ^gm(kernel|region|bridge)/ && ! -e $header ]]; then
         echo "check-layers: $file includes $header, which is no path from the top" >&2
         failed=1
         continue
@@ -104,7 +109,7 @@ while IFS=: read -r file line; do
         failed=1
     fi
 done < <(grep -rHE --include='*.h' --include='*.cpp' '^[[:space:]]*#[[:space:]]*include' \
-    include kernel region drawing machining apps)
+    include kernel region bridge drawing machining apps)
 for room in "${!floors[@]}"; do
     [ -n "${seen[$room]:-}" ] || { echo "check-layers: found no include in $room" >&2; failed=1; }
 done

@@ -6,7 +6,7 @@
 /// An approach belongs to the first element of the path, a departure to the last one.
 #include <iostream>
 
-#include "SvgPicture.h"
+#include "CurvePicture.h"
 #include "gmkernel/gmkernel.h"
 
 using examples::Style;
@@ -42,7 +42,7 @@ int main(int argc, char** argv) {
         for (int i = 0; i < part.ElementCount(); ++i)
             good = tool.AddElement(part.GetElement(i), false, 0) && good;
     }
-    examples::SvgPicture picture;
+    examples::CurvePicture picture;
     for (int i = 0; i < tool.ElementCount(); ++i) {
         const GmCurve& element = *tool.GetElement(i);
         const bool onPath = i >= 2 && i < 5;

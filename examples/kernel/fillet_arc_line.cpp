@@ -6,7 +6,7 @@
 /// which it touches them.
 #include <iostream>
 
-#include "SvgPicture.h"
+#include "CurvePicture.h"
 #include "gmkernel/gmkernel.h"
 
 using examples::Style;
@@ -15,7 +15,7 @@ int main(int argc, char** argv) {
     const double radius = 12;
     GmArc arc(GmPoint(-30, 0), GmPoint(30, 0), GmPoint(0, 0), GmBase::eRotCW);
     GmStretch segment(GmPoint(30, 0), GmPoint(75, 10));
-    examples::SvgPicture picture;
+    examples::CurvePicture picture;
     picture.add(arc, Style::kHelp);
     picture.add(segment, Style::kHelp);
 

@@ -7,7 +7,7 @@
 #include <iostream>
 #include <vector>
 
-#include "SvgPicture.h"
+#include "CurvePicture.h"
 #include "gmkernel/gmkernel.h"
 
 using examples::Style;
@@ -36,7 +36,7 @@ int main(int argc, char** argv) {
     std::vector<GmPoint> onLine;
     Intersection(line, circle, onLine);
 
-    examples::SvgPicture picture;
+    examples::CurvePicture picture;
     picture.add(contour, Style::kGiven);
     picture.add(circle, Style::kGiven);
     picture.add(line, Style::kHelp);

@@ -5,7 +5,7 @@
 #include <cmath>
 #include <iostream>
 
-#include "SvgPicture.h"
+#include "CurvePicture.h"
 #include "gmkernel/gmkernel.h"
 
 using examples::Style;
@@ -36,7 +36,7 @@ int main(int argc, char** argv) {
     const int count = bar.MeltContours(&disc, true);
     const GmContour* const outline = bar.GetMaxSubContour();
 
-    examples::SvgPicture picture;
+    examples::CurvePicture picture;
     double sum = 0;
     for (int i = 0; i < count; ++i) {
         const GmContour& loop = *bar.GetSubContour(i);

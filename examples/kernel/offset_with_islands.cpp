@@ -6,7 +6,7 @@
 #include <string>
 #include <vector>
 
-#include "SvgPicture.h"
+#include "CurvePicture.h"
 #include "gmkernel/gmkernel.h"
 
 using examples::Style;
@@ -38,7 +38,7 @@ int main(int argc, char** argv) {
         polygon({{0, 0}, {120, 0}, {120, 66}, {70, 66}, {60, 50}, {50, 66}, {0, 66}}),
         polygon({{20, 30}, {36, 14}, {52, 30}, {36, 46}}),
         polygon({{78, 20}, {100, 20}, {100, 42}, {78, 42}})};
-    examples::SvgPicture picture;
+    examples::CurvePicture picture;
     for (const GmContour& c : contours)
         picture.add(c, Style::kGiven);
     std::vector<int> crossings;

@@ -7,7 +7,7 @@
 #include <iostream>
 #include <vector>
 
-#include "SvgPicture.h"
+#include "CurvePicture.h"
 #include "gmkernel/gmkernel.h"
 
 using examples::Style;
@@ -29,7 +29,7 @@ GmContour bracket() {
 
 int main(int argc, char** argv) {
     GmContour contour = bracket();
-    examples::SvgPicture picture;
+    examples::CurvePicture picture;
     picture.add(contour, Style::kHelp);
 
     contour.RoundCorners(5, -1);  // outer corners

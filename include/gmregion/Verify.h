@@ -8,6 +8,7 @@
 #include "gmregion/Boolean.h"
 #include "gmregion/Offset.h"
 #include "gmregion/RegionSet.h"
+#include "gmregion/Workspace.h"
 #include "gmregion/export.h"
 
 namespace gmregion {
@@ -66,6 +67,18 @@ struct Verdict {
 /// Cost: near-linear, about that of the offset.
 GMREGION_EXPORT Verdict verifyOffset(const RegionSet& source, double distance,
                                      const RegionSet& result, const OffsetOptions& options = {});
+
+/// The same with a working memory that calls reuse.
+/// @param source what was offset
+/// @param distance by which it was, positive outward
+/// @param result what is to be checked
+/// @param options of the offset
+/// @param workspace working memory of the call
+/// @param verdict gets the result; its memory is used again
+/// @return whether it is sound
+GMREGION_EXPORT bool verifyOffset(const RegionSet& source, double distance, const RegionSet& result,
+                                  const OffsetOptions& options, Workspace& workspace,
+                                  Verdict& verdict);
 
 /// Checks a boolean with geometry of its own: the ends and middles of the result's elements must
 /// lie on boundaries of the operands, and the windings on both sides must be those that the

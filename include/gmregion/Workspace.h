@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include <cstdint>
 #include <memory>
 
 #include "gmregion/export.h"
@@ -23,11 +24,17 @@ public:
     Workspace(const Workspace&) = delete;
     Workspace& operator=(const Workspace&) = delete;
 
-    /// For the operations of this library.
-    Scratch& scratch() { return *m_scratch; }
+    /// Limits the work of each call: the number of pairs of elements near each other that it may
+    /// compare, further attempts included, 0 for no limit. A call that would need more is refused.
+    /// A clean drawing needs a few pairs an element; a pair takes tenths of a microsecond.
+    void setWorkLimit(std::uint64_t pairs) { m_workLimit = pairs; }
+
+    /// For the operations of this library: the memory, at the beginning of a call.
+    Scratch& begin();
 
 private:
     std::unique_ptr<Scratch> m_scratch;
+    std::uint64_t m_workLimit = 0;
 };
 
 }  // namespace gmregion

@@ -8,17 +8,17 @@
 
 #include "machining/leads/Leads.h"
 
+#include "gmbridge/Curves.h"
 #include "gmkernel/GmApprDepData.h"
 #include "gmkernel/GmArc.h"
 #include "gmkernel/GmContour.h"
 #include "gmkernel/GmStretch.h"
-#include "region/bridge/PathConversion.h"
 
 namespace gmmachining {
 
+using gmbridge::kernelPoint;
+using gmbridge::planePoint;
 using gmregion::Element;
-using gmregion::fromKernel;
-using gmregion::kernelPoint;
 using gmregion::Path;
 using gmregion::Vec2;
 
@@ -70,10 +70,10 @@ const GmCurve* leadOf(const GmContour& move, LeadEnd end) {
 }
 
 Element elementFrom(const GmCurve& curve) {
-    const Vec2 sp = fromKernel(curve.SP());
-    const Vec2 ep = fromKernel(curve.EP());
+    const Vec2 sp = planePoint(curve.SP());
+    const Vec2 ep = planePoint(curve.EP());
     if (!curve.IsArc()) return {sp, ep};
-    return arcThrough(sp, fromKernel(static_cast<const GmArc&>(curve).HP()), ep);
+    return arcThrough(sp, planePoint(static_cast<const GmArc&>(curve).HP()), ep);
 }
 
 Element joined(const Element& lead, const Path& cut, LeadEnd end) {

@@ -7,6 +7,8 @@
 
 #include "region/bridge/CornerBreaker.h"
 
+#include "gmbridge/Curves.h"
+
 namespace gmregion {
 
 namespace {
@@ -41,7 +43,7 @@ bool CornerBreaker::breakCorner(std::size_t index, CornerKind kind, double value
                                 const CornerRoom& room) {
     GmContour attempt(m_contour);
     const int first = static_cast<int>(index);
-    const Vec2 corner = fromKernel(attempt.GetElement(first)->EP());
+    const Vec2 corner = gmbridge::planePoint(attempt.GetElement(first)->EP());
     if (!attempt.AddTrans(kernelType(kind), first, value, true)) return false;
     const int made = insertedElement(attempt);
     if (made < 0 || !room.allows(attempt, made, corner)) return false;

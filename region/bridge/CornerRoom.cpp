@@ -11,6 +11,7 @@
 
 #include <algorithm>
 
+#include "gmbridge/Curves.h"
 #include "gmkernel/GmRect.h"
 #include "region/bridge/PathConversion.h"
 #include "region/model/Winding.h"
@@ -47,7 +48,7 @@ CornerRoom::CornerRoom(const std::vector<Path>& contours, std::size_t own) {
         if (i == own || contours[i].elements.empty()) continue;
         m_starts.push_back(contours[i].elements.front().sp);
         for (const Element& e : contours[i].elements)
-            m_obstacles.push_back({boundingBox(e), kernelCurve(e)});
+            m_obstacles.push_back({boundingBox(e), gmbridge::curveOf(e)});
     }
 }
 

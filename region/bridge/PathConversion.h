@@ -2,23 +2,14 @@
 #pragma once
 
 #include <cstddef>
-#include <memory>
 #include <string>
 #include <vector>
 
 #include "gmkernel/GmContour.h"
-#include "gmkernel/GmCurve.h"
-#include "gmkernel/GmPoint.h"
 #include "region/bridge/KernelLimits.h"
 #include "region/model/Path.h"
 
 namespace gmregion {
-
-GmPoint kernelPoint(Vec2 p);
-Vec2 fromKernel(const GmPoint& p);
-
-/// The element as a segment or an arc of the kernel; undefined when it is too short for one.
-std::unique_ptr<GmCurve> kernelCurve(const Element& e);
 
 /// A path without the elements below a length, and the indices that the others had. A path that
 /// small altogether stays as it is.

@@ -51,7 +51,9 @@ public:
     Index toNode(Half half) const;
     Weight weight(Index run) const { return m_runs[run].weight; }
     /// Whether the run stands for itself, not another one for it.
-    bool stands(Index run) const { return m_runs[run].standIn == run; }
+    bool stands(Index run) const { return standIn(run) == run; }
+    /// The run that stands for a run.
+    Index standIn(Index run) const { return m_runs[run].standIn; }
     /// Whether a run stands for runs of opposite sense.
     bool isTwoWay(Index run) const { return m_runs[run].twoWay; }
     /// The next run, of those for which the same run stands; kNone after the last.

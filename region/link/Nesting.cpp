@@ -10,6 +10,7 @@
 #include "region/link/Nesting.h"
 
 #include <algorithm>
+#include <array>
 #include <cmath>
 
 #include "region/model/Box.h"
@@ -25,6 +26,8 @@ namespace {
 constexpr double kFlat = 0.1;
 /// In tolerances: how far beside what it met a look goes on.
 constexpr double kStep = 1.0 / 16.0;
+/// The heights of looks, one after the other, in parts of the height of the element begun from.
+constexpr std::array<double, 7> kShares{0.5, 0.382, 0.618, 0.236, 0.764, 0.146, 0.854};
 
 }  // namespace
 
@@ -72,49 +75,73 @@ Nesting::Sight Nesting::lookLeft(Vec2 from) const {
     return sight;
 }
 
-/// How high an element surely reaches, of flat arcs that of their chord.
-double Nesting::riseOf(Index element) const {
+/// The heights that an element surely passes.
+Nesting::Heights Nesting::heightsOf(Index element) const {
     const Element& e = (*m_elements)[element];
-    if (std::fabs(e.bulge) < kFlat) return std::fabs(e.ep.y - e.sp.y);
-    return m_boxes[element].size().y;
+    const Box& box = m_boxes[element];
+    if (e.bulge == 0.0 || std::fabs(e.bulge) >= kFlat) return {box.low.y, box.high.y};
+    const double middle = middleOf(e).y;
+    return {std::min({e.sp.y, e.ep.y, middle}), std::max({e.sp.y, e.ep.y, middle})};
 }
 
-/// A point right beside a loop's element that reaches far left, from where the look meets it. The
-/// element is no level one, unless the whole loop is hardly higher.
-Vec2 Nesting::startBeside(Index loop) const {
+/// Where a look to the left meets an element for the last time; where it starts if it does not.
+double Nesting::lastLeft(const Element& e, Vec2 from) const {
+    // An element that turns by half a turn at the most meets a level twice at the most.
+    for (int i = 0; i < 2; ++i) {
+        const LevelHit hit = hitLeftOf(e, {from.x - kStep * m_tolerance, from.y});
+        if (!std::isfinite(hit.x)) break;
+        from.x = hit.x;
+    }
+    return from.x;
+}
+
+/// A point right beside a loop's element that reaches far left, from where the look meets it, at a
+/// share of its height. The element is no level one, unless the whole loop is hardly higher.
+Vec2 Nesting::startBeside(Index loop, double share) const {
     const Index first = loop == 0 ? 0 : (*m_ends)[loop - 1];
     const Index last = (*m_ends)[loop];
     double highest = 0.0;
     for (Index i = first; i < last; ++i)
-        highest = std::max(highest, riseOf(i));
+        highest = std::max(highest, heightsOf(i).rise());
     const double enough = std::min(2.0 * m_tolerance, 0.5 * highest);
-    Vec2 start;
+    Index farthest = first;
     double left = HUGE_VAL;
     for (Index i = first; i < last; ++i) {
         const Box& box = m_boxes[i];
-        if (!(box.low.x < left) || riseOf(i) < enough) continue;
+        if (!(box.low.x < left) || heightsOf(i).rise() < enough) continue;
         left = box.low.x;
-        start = {box.high.x + m_tolerance, 0.5 * (box.low.y + box.high.y)};
+        farthest = i;
     }
+    const Heights heights = heightsOf(farthest);
+    Vec2 start{m_boxes[farthest].high.x + m_tolerance, heights.low + share * heights.rise()};
+    start.x = lastLeft((*m_elements)[farthest], start) + kStep * m_tolerance;
     return start;
 }
 
-/// Finds the loop beside a loop, and whether both agree on what lies between them.
+/// Finds the loop beside a loop. Where another loop touches it at the height of the look, the order
+/// in which both are met says nothing; then the look is at another height.
 bool Nesting::place(Index loop) {
-    Vec2 from = startBeside(loop);
+    return std::any_of(kShares.begin(), kShares.end(),
+                       [&](double share) { return placeFrom(loop, startBeside(loop, share)); });
+}
+
+/// Whether a look from there tells the loop beside a loop, and both agree on what lies between
+/// them.
+bool Nesting::placeFrom(Index loop, Vec2 from) {
     m_conflict = from;
     bool isOutside = false;  // whether the look is beside the loop, having met it
+    double own = HUGE_VAL;   // where it met the loop last
     for (;;) {
         const Sight sight = lookLeft(from);
         if (sight.element == kNone) return isOutside && !isHole(loop);
         const Index other = m_loopOf[sight.element];
         if (other == loop) {
             isOutside = sight.coveredToEast != isHole(loop);
+            own = sight.x;
         } else if (isOutside) {
             m_beside[loop] = other;
-            return sight.coveredToEast == isHole(loop);
+            return own - sight.x > m_tolerance && sight.coveredToEast == isHole(loop);
         }
-        // A tolerance near rounding may be no step at all.
         from.x = std::min(sight.x - kStep * m_tolerance, std::nextafter(sight.x, -HUGE_VAL));
     }
 }
@@ -128,7 +155,7 @@ bool Nesting::resolve(Index loop) {
     Index outline = isHole(at) ? m_outlineOf[at] : at;
     if (outline == kNone) outline = outlineAbout(loop);
     if (outline == kNone) {
-        m_conflict = startBeside(loop);
+        m_conflict = startBeside(loop, kShares.front());
         return false;
     }
     for (Index i = loop; m_outlineOf[i] == kNone; i = m_beside[i]) {
@@ -140,7 +167,7 @@ bool Nesting::resolve(Index loop) {
 
 /// The smallest outline that runs round a loop, by winding numbers; kNone when there is none.
 Index Nesting::outlineAbout(Index loop) {
-    const Vec2 p = startBeside(loop);
+    const Vec2 p = startBeside(loop, kShares.front());
     m_winding.assign(m_ends->size(), 0);
     for (std::size_t i = 0; i < m_elements->size(); ++i)
         m_winding[m_loopOf[i]] += windingOf((*m_elements)[i], p);

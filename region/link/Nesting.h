@@ -34,12 +34,20 @@ private:
         bool coveredToEast = false;
     };
 
+    struct Heights {
+        double low;
+        double high;
+        double rise() const { return high - low; }
+    };
+
     void raiseBoxes();
     bool isHole(Index loop) const { return !((*m_areas)[loop] > 0.0); }
     Sight lookLeft(Vec2 from) const;
     bool place(Index loop);
-    double riseOf(Index element) const;
-    Vec2 startBeside(Index loop) const;
+    bool placeFrom(Index loop, Vec2 from);
+    Heights heightsOf(Index element) const;
+    double lastLeft(const Element& e, Vec2 from) const;
+    Vec2 startBeside(Index loop, double share) const;
     bool resolve(Index loop);
     Index outlineAbout(Index loop);
 

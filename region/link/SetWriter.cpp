@@ -2,29 +2,15 @@
 #include "region/link/SetWriter.h"
 
 #include <algorithm>
-#include <cmath>
 #include <numeric>
 
-#include "region/plane/Carrier.h"
+#include "region/link/PieceJoin.h"
 #include "region/plane/ElementHalves.h"
 #include "region/plane/Measures.h"
 
 namespace gmregion {
 
 namespace {
-
-/// The largest bulge of an element of a result, that of 300 degrees: beyond it the ends come near
-/// each other in comparison to the radius.
-constexpr double kLargestBulge = 3.7320508075688772;
-
-/// In parts of the tolerance, how far an end between two pieces may lie beside both as one.
-constexpr double kStraight = 1.0 / 1024.0;
-
-/// The bulge of two arcs of one circle that follow each other: the tangents of their quarter
-/// sweeps, added.
-double joinedBulge(double a, double b) {
-    return (a + b) / (1.0 - a * b);
-}
 
 bool sameOrigin(const Origin& a, const Origin& b) {
     return a.path == b.path && a.element == b.element && a.kind == b.kind;
@@ -51,11 +37,16 @@ bool SetWriter::write(const Arrangement& arrangement, const Fans& fans, const Lo
     m_origins.clear();
     m_originEnds.clear();
     clear(set, arrangement.tolerance());
+    m_items.reserve(arrangement.pieces().size());
+    m_elements.reserve(arrangement.pieces().size());
     for (std::size_t loop = 0; loop < loops.size(); ++loop) {
-        gather(arrangement, loops, loop);
-        emitLoop();
+        emitLoop(loops, loop);
     }
     if (m_ends.empty()) return true;
+    if (m_ends.size() == 1 && m_areas[0] > 0.0) {
+        handOver(set);
+        return true;
+    }
     if (!nest()) return false;
     arrange(set);
     return true;
@@ -65,44 +56,39 @@ double SetWriter::area() const {
     return std::accumulate(m_areas.begin(), m_areas.end(), 0.0);
 }
 
-/// Lists the pieces of a loop in their order, and its area.
-void SetWriter::gather(const Arrangement& arrangement, const Loops& loops, std::size_t loop) {
+/// Lists the pieces of a loop in their order.
+void SetWriter::gather(const Loops& loops, std::size_t loop) {
     m_items.clear();
     for (const Half* half = loops.begin(loop); half != loops.end(loop); ++half) {
-        const Run& run = arrangement.runs()[runOf(*half)];
+        const Run& run = m_arrangement->runs()[runOf(*half)];
         const bool backward = leavesEnd(*half);
         for (Index i = 0; i < run.last - run.first; ++i) {
             const StrandElement& e =
-                arrangement.pieces()[backward ? run.last - 1 - i : run.first + i];
+                m_arrangement->pieces()[backward ? run.last - 1 - i : run.first + i];
             const Element turned = backward ? Element{e.ep, e.sp, -e.bulge} : Element(e);
-            m_items.push_back({turned, e.tag, runOf(*half), backward});
+            m_items.push_back({turned, e.tag, *half});
         }
     }
+}
+
+double SetWriter::gatheredArea() const {
     const Vec2 origin = m_items.front().element.sp;
     double area = 0.0;
     for (const Item& item : m_items)
         area += 0.5 * sweptTwice(item.element, origin);
-    m_areas.push_back(area);
+    return area;
 }
 
 /// Whether two pieces that follow each other are parts of one element, with nothing between them.
 bool SetWriter::joins(const Item& a, const Item& b) const {
-    if (a.tag != b.tag || a.backward != b.backward || !sameOrigins(a, b)) return false;
-    if ((a.element.bulge == 0.0) != (b.element.bulge == 0.0)) return false;
-    const double product = a.element.bulge * b.element.bulge;
-    if (product < 0.0 || product >= 1.0) return false;
-    const double bulge = joinedBulge(a.element.bulge, b.element.bulge);
-    if (std::fabs(bulge) > kLargestBulge) return false;
-    const Vec2 chord = b.element.ep - a.element.sp;
-    if (!(dot(chord, chord) > 0.0)) return false;
-    const Element joined{a.element.sp, b.element.ep, bulge};
-    const double beside = std::fabs(signedDistance(carrierOf(joined), a.element.ep));
-    return beside <= kStraight * m_arrangement->tolerance();
+    if (a.tag != b.tag || leavesEnd(a.half) != leavesEnd(b.half) || !sameOrigins(a, b))
+        return false;
+    return makeOne(a.element, b.element, m_arrangement->tolerance());
 }
 
 bool SetWriter::sameOrigins(const Item& a, const Item& b) const {
-    Index other = m_fans->nextSame(b.run);
-    for (Index run = m_fans->nextSame(a.run); run != kNone; run = m_fans->nextSame(run)) {
+    Index other = m_fans->nextSame(runOf(b.half));
+    for (Index run = m_fans->nextSame(runOf(a.half)); run != kNone; run = m_fans->nextSame(run)) {
         if (other == kNone) return false;
         const auto& pieces = m_arrangement->pieces();
         const auto& runs = m_arrangement->runs();
@@ -112,48 +98,76 @@ bool SetWriter::sameOrigins(const Item& a, const Item& b) const {
     return other == kNone;
 }
 
-/// Appends the pieces of a loop, joined where they are parts of one element.
-void SetWriter::emitLoop() {
+/// Joins pieces that are parts of one element. False when only one would be left, which cannot
+/// close a loop; the items are spoilt then.
+bool SetWriter::join() {
     const std::size_t count = m_items.size();
-    if (count == 0) return;
     std::size_t start = 0;
     while (start < count && joins(m_items[(start + count - 1) % count], m_items[start]))
         ++start;
-    start %= count;
-    Item item = m_items[start];
-    const std::size_t first = m_elements.size();
-    for (std::size_t i = 1; i <= count; ++i) {
-        const Item& next = m_items[(start + i) % count];
-        if (i < count && joins(item, next)) {
-            item.element.bulge = joinedBulge(item.element.bulge, next.element.bulge);
-            item.element.ep = next.element.ep;
-            continue;
-        }
-        m_elements.push_back(item.element);
-        appendOrigins(item);
-        item = next;
+    std::rotate(m_items.begin(), m_items.begin() + static_cast<std::ptrdiff_t>(start % count),
+                m_items.end());
+    std::size_t last = 0;
+    for (std::size_t i = 1; i < count; ++i) {
+        Element& e = m_items[last].element;
+        const Item& next = m_items[i];
+        if (joins(m_items[last], next))
+            e = {e.sp, next.element.ep, joinedBulge(e.bulge, next.element.bulge)};
+        else
+            m_items[++last] = next;
     }
-    // One element cannot close a loop: what was joined to it stays in parts then.
-    if (m_elements.size() - first < 2) emitParts(first);
-    m_ends.push_back(static_cast<Index>(m_elements.size()));
+    m_items.resize(last + 1);
+    return last > 0;
 }
 
-/// Appends the pieces of a loop as they are, in place of what was appended from an element on.
-void SetWriter::emitParts(std::size_t first) {
-    m_elements.resize(first);
-    m_originEnds.resize(first);
-    m_origins.resize(m_originEnds.empty() ? 0 : m_originEnds.back());
-    for (const Item& part : m_items) {
-        m_elements.push_back(part.element);
-        appendOrigins(part);
+/// Whether an element goes back the way that another has come.
+bool SetWriter::returns(const Element& there, const Element& back) const {
+    if (there.sp != back.ep || there.ep != back.sp) return false;
+    const Vec2 chord = there.ep - there.sp;
+    const double heights = 0.5 * (there.bulge + back.bulge);
+    return heights * heights * dot(chord, chord) <
+           m_arrangement->tolerance() * m_arrangement->tolerance();
+}
+
+/// Leaves out elements that go there and back: runs of several pieces may have become the same by
+/// being joined.
+void SetWriter::dropSpikes() {
+    std::size_t kept = 0;
+    for (std::size_t i = 0; i < m_items.size(); ++i) {
+        if (kept > 0 && returns(m_items[kept - 1].element, m_items[i].element))
+            --kept;
+        else
+            m_items[kept++] = m_items[i];
     }
+    std::size_t first = 0;
+    while (kept > first + 1 && returns(m_items[kept - 1].element, m_items[first].element)) {
+        --kept;
+        ++first;
+    }
+    m_items.resize(kept);
+    m_items.erase(m_items.begin(), m_items.begin() + static_cast<std::ptrdiff_t>(first));
+}
+
+/// Appends what a loop consists of; no loop where nothing is left of it.
+void SetWriter::emitLoop(const Loops& loops, std::size_t loop) {
+    gather(loops, loop);
+    const double area = gatheredArea();
+    if (!join()) gather(loops, loop);
+    dropSpikes();
+    if (m_items.empty()) return;
+    for (const Item& item : m_items) {
+        m_elements.push_back(item.element);
+        appendOrigins(item);
+    }
+    m_areas.push_back(area);
+    m_ends.push_back(static_cast<Index>(m_elements.size()));
 }
 
 /// All origins of a piece, each once.
 void SetWriter::appendOrigins(const Item& item) {
     const std::size_t first = m_origins.size();
     m_source->append(item.tag, m_origins);
-    for (Index run = m_fans->nextSame(item.run); run != kNone; run = m_fans->nextSame(run))
+    for (Index run = m_fans->nextSame(runOf(item.half)); run != kNone; run = m_fans->nextSame(run))
         m_source->append(m_arrangement->pieces()[m_arrangement->runs()[run].first].tag, m_origins);
     std::size_t end = first + 1;
     for (std::size_t i = first + 1; i < m_origins.size(); ++i) {
@@ -178,6 +192,14 @@ bool SetWriter::nest() {
         m_halfEnds.push_back(static_cast<Index>(m_halves.size()));
     }
     return m_nesting.find(m_halves, m_halfEnds, m_areas, m_arrangement->tolerance());
+}
+
+/// Hands one outline over as it is.
+void SetWriter::handOver(RegionSet& set) {
+    std::swap(set.m_elements, m_elements);
+    std::swap(set.m_originEnds, m_originEnds);
+    std::swap(set.m_origins, m_origins);
+    set.m_loops.push_back({0, m_ends[0], 0, false});
 }
 
 /// Puts outlines in their order, each with its holes behind it.

@@ -23,25 +23,26 @@ public:
 
     /// Makes a set empty.
     static void clear(RegionSet& set, double tolerance);
-    /// Lets a set have another tolerance than it was made with.
-    static void setTolerance(RegionSet& set, double tolerance) { set.m_tolerance = tolerance; }
 
 private:
     /// An element on its way into the set.
     struct Item {
         Element element;
         Index tag;
-        Index run;
-        bool backward;
+        Half half;  ///< the run that it is a piece of, and its sense
     };
 
-    void gather(const Arrangement& arrangement, const Loops& loops, std::size_t loop);
+    void gather(const Loops& loops, std::size_t loop);
+    double gatheredArea() const;
     bool joins(const Item& a, const Item& b) const;
     bool sameOrigins(const Item& a, const Item& b) const;
-    void emitLoop();
-    void emitParts(std::size_t first);
+    bool join();
+    bool returns(const Element& there, const Element& back) const;
+    void dropSpikes();
+    void emitLoop(const Loops& loops, std::size_t loop);
     void appendOrigins(const Item& item);
     bool nest();
+    void handOver(RegionSet& set);
     void arrange(RegionSet& set);
 
     const Arrangement* m_arrangement = nullptr;

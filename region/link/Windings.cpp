@@ -71,37 +71,59 @@ bool Windings::findPart(Index run) {
     return false;
 }
 
-/// What lies on the right of a run, by a ray from the middle of its longest piece.
+/// What lies on the right of a run, by a ray from the middle of its longest piece. Runs count with
+/// the weights of their own strands, so that whole stretches of strands are passed by their ends;
+/// those that are the same all count as the one that stands for them.
 Weight Windings::castFrom(Index run) {
     if (m_casts++ == 0) raiseBoxes();
+    const auto& pieces = m_arrangement->pieces();
+    const auto& strands = m_arrangement->strandsCut();
     const StrandElement& e = longestPiece(*m_arrangement, run);
-    const std::size_t own = static_cast<std::size_t>(&e - m_arrangement->pieces().data());
+    const std::size_t own = static_cast<std::size_t>(&e - pieces.data());
     const Vec2 p = middleOf(e);
     Weight sum = times(m_fans->weight(run), windingRightOf(e));
-    const Box ray{{m_farLeft, p.y}, p};
-    m_boxes.visitOverlapping(ray, [&](std::size_t i) {
+    const auto passPart = [&](Index strand, std::size_t first, std::size_t last) {
+        const int winding = windingOfChain(pieces[first].sp, pieces[last - 1].ep, p);
+        sum = sum + times(strands[strand].weight, winding);
+    };
+    const auto passRange = [&](std::size_t first, std::size_t last) {
+        m_strands.visitParts(first, last, passPart);
+    };
+    const auto passPiece = [&](std::size_t i) {
         const Index other = m_runOfPiece[i];
-        if (i == own || !m_fans->stands(other)) return;
-        sum = sum + times(m_fans->weight(other), windingOf(m_arrangement->pieces()[i], p));
-    });
+        if (i == own || (other != run && m_fans->standIn(other) == run)) return;
+        sum = sum + times(m_arrangement->runs()[other].weight, windingOfStandIn(i, p));
+    };
+    m_boxes.castLeft(p, passRange, passPiece);
     return sum;
+}
+
+/// What a piece adds to a winding, or what the piece of the run that stands for its run does.
+int Windings::windingOfStandIn(std::size_t piece, Vec2 p) const {
+    const StrandElement& e = m_arrangement->pieces()[piece];
+    const Index run = m_runOfPiece[piece];
+    const Index standIn = m_fans->standIn(run);
+    if (standIn == run) return windingOf(e, p);
+    const Run& other = m_arrangement->runs()[standIn];
+    const int winding = windingOf(m_arrangement->pieces()[other.first], p);
+    return other.from == m_arrangement->runs()[run].from ? winding : -winding;
 }
 
 void Windings::raiseBoxes() {
     const auto& pieces = m_arrangement->pieces();
     m_boxes.begin(pieces.size());
     m_runOfPiece.resize(pieces.size());
-    m_farLeft = 0.0;
     for (Index run = 0; run < m_arrangement->runs().size(); ++run) {
         const Run& r = m_arrangement->runs()[run];
         for (Index i = r.first; i < r.last; ++i) {
             m_runOfPiece[i] = run;
-            const Box box = boxAbout(pieces[i]).grown(m_arrangement->tolerance());
-            m_farLeft = std::min(m_farLeft, box.low.x);
-            m_boxes.add(box);
+            m_boxes.add(boxAbout(pieces[i]).grown(m_arrangement->tolerance()));
         }
     }
     m_boxes.finish();
+    m_strands.clear();
+    for (const Strand& strand : m_arrangement->strandsCut())
+        m_strands.endChain(strand.last);
 }
 
 bool Windings::spreadFrom(Index run) {

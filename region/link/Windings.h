@@ -5,6 +5,7 @@
 
 #include "region/link/Fans.h"
 #include "region/search/BoxRow.h"
+#include "region/search/ChainRow.h"
 
 namespace gmregion {
 
@@ -31,6 +32,7 @@ private:
     bool carryRound(Index node, Half known);
     bool carryTo(Half half, Weight clockwiseOfIt);
     void raiseBoxes();
+    int windingOfStandIn(std::size_t piece, Vec2 p) const;
 
     const Arrangement* m_arrangement = nullptr;
     Fans* m_fans = nullptr;
@@ -39,11 +41,11 @@ private:
     std::vector<std::uint8_t> m_isDone;  ///< nodes that were gone round
     std::vector<Half> m_waiting;
     std::vector<Index> m_runOfPiece;
+    ChainRow m_strands;
     BoxRow m_boxes;
     std::size_t m_casts = 0;
     Index m_longest = kNone;  ///< of the part in hand, the run with the longest piece
     double m_longestSquared = 0.0;
-    double m_farLeft = 0.0;
     Vec2 m_conflict;
 };
 

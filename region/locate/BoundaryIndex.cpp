@@ -11,31 +11,34 @@ namespace gmregion {
 
 void BoundaryIndex::take(const RegionSet& set) {
     m_pieces.clear();
+    m_loops.clear();
     for (std::size_t loop = 0; loop < set.loops().size(); ++loop) {
         for (Index i = set.loops()[loop].first; i < set.loops()[loop].last; ++i)
-            append(set.elements()[i], i, static_cast<Index>(loop));
+            append(set.elements()[i], i);
+        m_loops.endChain(static_cast<Index>(m_pieces.size()));
     }
     index();
 }
 
 void BoundaryIndex::take(const LoopsView& view) {
     m_pieces.clear();
+    m_loops.clear();
     Index i = 0;
     for (std::size_t loop = 0; loop < view.loopEnds->size(); ++loop) {
         for (; i < (*view.loopEnds)[loop]; ++i)
-            append((*view.elements)[i], i, static_cast<Index>(loop));
+            append((*view.elements)[i], i);
+        m_loops.endChain(static_cast<Index>(m_pieces.size()));
     }
     index();
 }
 
-void BoundaryIndex::append(const Element& e, Index element, Index loop) {
+void BoundaryIndex::append(const Element& e, Index element) {
     visitHalves(e, [&](const Element& half) {
         if (half.sp == half.ep) return;
         BoundaryPiece piece;
         static_cast<Element&>(piece) = half;
         piece.carrier = carrierOf(half);
         piece.element = element;
-        piece.loop = loop;
         m_pieces.push_back(piece);
     });
 }
@@ -45,10 +48,6 @@ void BoundaryIndex::index() {
     for (const BoundaryPiece& piece : m_pieces)
         m_boxes.add(boxAbout(piece));
     m_boxes.finish();
-}
-
-int BoundaryIndex::pieceWinding(std::size_t piece, Vec2 p) const {
-    return windingOf(m_pieces[piece], p);
 }
 
 int BoundaryIndex::windingAbout(Vec2 p) const {
@@ -79,15 +78,24 @@ BoundaryIndex::Near BoundaryIndex::nearest(Vec2 p, double limit) const {
 
 bool BoundaryIndex::isNear(std::size_t piece, Vec2 p, double limit) const {
     const BoundaryPiece& e = m_pieces[piece];
-    if (!(std::fabs(signedDistance(e.carrier, p)) <= limit)) return false;
+    if (!isWithin(e.carrier, p, limit)) return false;
     const Vec2 way = nearestOn(e, e.carrier, p) - p;
     return dot(way, way) <= limit * limit;
 }
 
 bool BoundaryIndex::isAnyNear(Vec2 p, double limit) const {
+    Index guess = kNone;
+    return isAnyNear(p, limit, guess);
+}
+
+bool BoundaryIndex::isAnyNear(Vec2 p, double limit, Index& guess) const {
+    if (guess < m_pieces.size() && isNear(guess, p, limit)) return true;
     const Vec2 by{limit, limit};
-    return m_boxes.anyOverlapping({p - by, p + by},
-                                  [&](std::size_t i) { return isNear(i, p, limit); });
+    return m_boxes.anyOverlapping({p - by, p + by}, [&](std::size_t i) {
+        if (!isNear(i, p, limit)) return false;
+        guess = static_cast<Index>(i);
+        return true;
+    });
 }
 
 }  // namespace gmregion

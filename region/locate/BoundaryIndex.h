@@ -6,7 +6,9 @@
 #include "gmregion/RegionSet.h"
 #include "region/model/Index.h"
 #include "region/plane/Carrier.h"
+#include "region/plane/ElementWinding.h"
 #include "region/search/BoxRow.h"
+#include "region/search/ChainRow.h"
 
 namespace gmregion {
 
@@ -20,7 +22,6 @@ struct LoopsView {
 struct BoundaryPiece : Element {
     Carrier carrier;
     Index element = 0;  ///< the element that it is, or that it is half of
-    Index loop = 0;
 };
 
 /// The pieces of loops with their boxes: windings about points, and what is nearest to them.
@@ -37,12 +38,14 @@ public:
     void take(const LoopsView& view);
 
     const std::vector<BoundaryPiece>& pieces() const { return m_pieces; }
+    Index loopOf(std::size_t piece) const { return m_loops.chainOf(piece); }
     const BoxRow& boxes() const { return m_boxes; }
 
     /// How often the loops run round a point. Every point is on one side of every element: the sums
     /// are whole for points right on the boundary, too.
     int windingAbout(Vec2 p) const;
-    /// Calls visit(loop, winding) for every piece that has a part in the winding about a point.
+    /// Calls visit(loop, winding) for pieces and ranges of pieces of a loop that have a part in its
+    /// winding about a point.
     template <class Visit>
     void visitWindings(Vec2 p, const Visit& visit) const;
 
@@ -53,21 +56,30 @@ public:
     /// Whether a piece is not farther off than a limit.
     bool isNear(std::size_t piece, Vec2 p, double limit) const;
     bool isAnyNear(Vec2 p, double limit) const;
+    /// The same, asking first the piece that was near the last time.
+    bool isAnyNear(Vec2 p, double limit, Index& guess) const;
 
 private:
-    void append(const Element& e, Index element, Index loop);
-    int pieceWinding(std::size_t piece, Vec2 p) const;
+    void append(const Element& e, Index element);
     void index();
 
     std::vector<BoundaryPiece> m_pieces;
+    ChainRow m_loops;
     BoxRow m_boxes;
 };
 
 template <class Visit>
 void BoundaryIndex::visitWindings(Vec2 p, const Visit& visit) const {
-    m_boxes.visitOverlapping({{-HUGE_VAL, p.y}, p}, [&](std::size_t i) {
-        const int winding = pieceWinding(i, p);
-        if (winding != 0) visit(m_pieces[i].loop, winding);
+    const auto ofPart = [&](Index loop, std::size_t first, std::size_t last) {
+        const int winding = windingOfChain(m_pieces[first].sp, m_pieces[last - 1].ep, p);
+        if (winding != 0) visit(loop, winding);
+    };
+    const auto ofRange = [&](std::size_t first, std::size_t last) {
+        m_loops.visitParts(first, last, ofPart);
+    };
+    m_boxes.castLeft(p, ofRange, [&](std::size_t i) {
+        const int winding = windingOf(m_pieces[i], p);
+        if (winding != 0) visit(m_loops.chainOf(i), winding);
     });
 }
 

@@ -102,7 +102,8 @@ std::optional<BoundaryPoint> Locator::nearest(Point p) const {
     if (!isOfUse(p) || m_store->set->empty()) return std::nullopt;
     const BoundaryIndex::Near near = m_store->boundary.nearest(p, kFarthest);
     const BoundaryPiece& piece = m_store->boundary.pieces()[near.piece];
-    return BoundaryPoint{near.at, near.distance, piece.element, piece.loop};
+    return BoundaryPoint{near.at, near.distance, piece.element,
+                         m_store->boundary.loopOf(near.piece)};
 }
 
 std::optional<double> Locator::signedDistance(Point p) const {

@@ -35,15 +35,15 @@ StrandElement part(const StrandElement& e, Vec2 from, Vec2 to) {
 
 }  // namespace
 
-bool Arrangement::settle(double tolerance, Index split) {
+bool Arrangement::settle(double tolerance, Index split, Care care) {
     m_tolerance = tolerance;
     m_settled.clear();
-    m_meetings.find(m_in, tolerance, {split, nullptr});
+    if (!m_meetings.find(m_in, tolerance, {split, nullptr, care})) return false;
     cutRound(true);
     for (int round = 1;; ++round) {
         const bool any = std::find(m_moved.begin(), m_moved.end(), 1) != m_moved.end();
         if (!any) return true;
-        m_meetings.find(m_in, tolerance, {kNone, &m_moved});
+        if (!m_meetings.find(m_in, tolerance, {kNone, &m_moved, care})) return false;
         if (!m_meetings.foundAny()) return true;
         if (round == kRounds) return false;
         const std::size_t before = m_in.elements.size();
@@ -57,6 +57,7 @@ void Arrangement::cutRound(bool first) {
     gatherPoints(first);
     m_runs.clear();
     m_out.clear();
+    m_out.elements.reserve(m_in.elements.size() + m_meetings.stopCount());
     m_movedOut.clear();
     for (const Strand& strand : m_in.strands)
         cutStrand(strand);

@@ -28,16 +28,25 @@ public:
     /// strands as they were, cut at nodes.
     Strands& strands() { return m_in; }
 
-    /// Cuts the strands. False when nodes have not come to rest after three rounds.
+    /// Lets the next calls compare so many pairs of elements altogether.
+    void allow(std::uint64_t pairs) { m_meetings.allow(pairs); }
+    /// Whether that many have been compared.
+    bool isAtLimit() const { return m_meetings.isAtLimit(); }
+
+    /// Cuts the strands. False when nodes have not come to rest after three rounds, or when there
+    /// are more pairs than allowed.
     /// @param tolerance in length units, positive
     /// @param split where it is not kNone, elements before and from that number on are two clean
     /// sets, and those of one of them are not compared with each other
-    bool settle(double tolerance, Index split = kNone);
+    /// @param care see Care
+    bool settle(double tolerance, Index split = kNone, Care care = Care::kUsual);
 
     const std::vector<Vec2>& nodes() const { return m_clusters.nodes(); }
     /// Along each strand in their order.
     const std::vector<Run>& runs() const { return m_runs; }
     const std::vector<StrandElement>& pieces() const { return m_in.elements; }
+    /// The strands as ranges of the pieces.
+    const std::vector<Strand>& strandsCut() const { return m_in.strands; }
     double tolerance() const { return m_tolerance; }
 
 private:

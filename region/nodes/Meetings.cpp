@@ -12,6 +12,7 @@
 #include <cmath>
 #include <optional>
 
+#include "region/plane/Apart.h"
 #include "region/plane/Crossing.h"
 #include "region/plane/ElementBox.h"
 #include "region/plane/Nearest.h"
@@ -22,38 +23,70 @@ namespace {
 
 /// Crossings at a smaller sine lie where rounding lets them along the elements.
 constexpr double kShallow = 1e-4;
+constexpr double kAnySine = 2.0;
 
 double squaredLength(Vec2 v) {
     return dot(v, v);
 }
 
-bool isShallow(const Carrier& a, const Carrier& b, Vec2 p) {
-    return std::fabs(cross(sideOf(a, p).gradient, sideOf(b, p).gradient)) < kShallow;
+double sineBetween(const Carrier& a, const Carrier& b, Vec2 p) {
+    return std::fabs(cross(sideOf(a, p).gradient, sideOf(b, p).gradient));
 }
 
 }  // namespace
 
-void Meetings::find(const Strands& strands, double tolerance, const Scope& scope) {
+bool Meetings::find(const Strands& strands, double tolerance, const Scope& scope) {
     m_strands = &strands;
     m_tolerance = tolerance;
+    m_shallow = scope.care == Care::kThorough ? kAnySine : kShallow;
     m_points.clear();
     m_found.clear();
-    m_shallow.clear();
+    m_shallowPoints.clear();
     m_turnsBack = false;
     prepare(strands);
     raiseBoxes(scope);
-    if (scope.split != kNone) {
-        m_boxes.visitPairsWith(m_otherBoxes, [&](std::size_t i, std::size_t j) {
-            meet(static_cast<Index>(i), static_cast<Index>(j) + scope.split);
-        });
-    } else {
-        m_boxes.visitPairs([&](std::size_t i, std::size_t j) {
-            if (scope.moved && (*scope.moved)[i] == 0 && (*scope.moved)[j] == 0) return;
-            meet(static_cast<Index>(i), static_cast<Index>(j));
-        });
-    }
+    if (!meetPairs(scope)) return false;
     stopAtShallow(scope.split);
     sortStops();
+    return true;
+}
+
+bool Meetings::takePair() {
+    if (m_pairsLeft == 0) return false;
+    --m_pairsLeft;
+    return true;
+}
+
+/// False when there are more pairs than allowed.
+bool Meetings::meetPairs(const Scope& scope) {
+    if (scope.split != kNone) {
+        return m_boxes.visitPairsWith(m_otherBoxes, [&](std::size_t i, std::size_t j) {
+            if (!takePair()) return false;
+            meet(static_cast<Index>(i), static_cast<Index>(j) + scope.split);
+            return true;
+        });
+    }
+    if (scope.moved) return meetMoved(*scope.moved);
+    return m_boxes.visitPairs([&](std::size_t i, std::size_t j) {
+        if (!takePair()) return false;
+        meet(static_cast<Index>(i), static_cast<Index>(j));
+        return true;
+    });
+}
+
+/// The same for pairs of which one has moved: mostly few have.
+bool Meetings::meetMoved(const std::vector<std::uint8_t>& moved) {
+    for (std::size_t i = 0; i < moved.size(); ++i) {
+        if (moved[i] == 0) continue;
+        const bool isAtLimit = m_boxes.anyOverlapping(m_boxes[i], [&](std::size_t j) {
+            if (j == i || (j < i && moved[j] != 0)) return false;
+            if (!takePair()) return true;
+            meet(static_cast<Index>(std::min(i, j)), static_cast<Index>(std::max(i, j)));
+            return false;
+        });
+        if (isAtLimit) return false;
+    }
+    return true;
 }
 
 Vec2 Meetings::vertex(Index v) const {
@@ -117,6 +150,8 @@ void Meetings::meet(Index i, Index j) {
     const bool thenB = m_endVertex[i] == j;
     const bool thenA = m_endVertex[j] == i;
     if ((thenB && a.joined) || (thenA && b.joined)) return;
+    if (!thenA && !thenB && areApart(carrier(i), boxOf(i), carrier(j), boxOf(j), m_tolerance))
+        return;
     const std::size_t before = m_found.size();
     const bool endsOfA = stopAtEnds(i, j);
     const bool endsOfB = stopAtEnds(j, i);
@@ -151,13 +186,12 @@ void Meetings::meetBetween(Index i, Index j, bool areNeighbours) {
     const Carrier& onB = carrier(j);
     bool crossed = false;
     for (const Vec2 p : crossings(onA, onB)) {
-        const double placeOnA = placeOn(a, p);
-        const double placeOnB = placeOn(b, p);
-        if (placeOnA < 0.0 || placeOnA > 1.0 || placeOnB < 0.0 || placeOnB > 1.0) continue;
+        if (!spans(a, p) || !spans(b, p)) continue;
         if (!isNear(onA, p) || !isNear(onB, p)) continue;
         crossed = true;
         if (isNearCommonEnd(a, b, p)) continue;
-        if (isShallow(onA, onB, p)) m_shallow.push_back(static_cast<Index>(m_points.size()));
+        if (sineBetween(onA, onB, p) < m_shallow)
+            m_shallowPoints.push_back(static_cast<Index>(m_points.size()));
         stopBoth(i, j, p);
     }
     if (crossed || areNeighbours) return;
@@ -166,7 +200,7 @@ void Meetings::meetBetween(Index i, Index j, bool areNeighbours) {
     const Vec2 gap = nearestOn(a, onA, *p) - nearestOn(b, onB, *p);
     const bool near = squaredLength(gap) <= m_tolerance * m_tolerance;
     if (!near || squaredLength(nearestOn(a, onA, *p) - *p) > m_tolerance * m_tolerance) return;
-    m_shallow.push_back(static_cast<Index>(m_points.size()));
+    m_shallowPoints.push_back(static_cast<Index>(m_points.size()));
     stopBoth(i, j, *p);
     // The place is on neither, so an end near it need not be near the other element.
     for (const Index v : {i, m_endVertex[i], j, m_endVertex[j]}) {
@@ -176,7 +210,7 @@ void Meetings::meetBetween(Index i, Index j, bool areNeighbours) {
 
 /// Crossings of carriers that are nearly the same may lie anywhere.
 bool Meetings::isNear(const Carrier& c, Vec2 p) const {
-    return std::fabs(signedDistance(c, p)) <= m_tolerance;
+    return isWithin(c, p, m_tolerance);
 }
 
 /// Whether a point is an end that both elements have in common, bit by bit, but for the tolerance.
@@ -222,7 +256,7 @@ void Meetings::stopBoth(Index i, Index j, Vec2 p) {
 /// Lets whatever comes near a shallow crossing stop there: what runs along one of the two elements
 /// may cross the other one far from there, or not at all.
 void Meetings::stopAtShallow(Index split) {
-    for (const Index number : m_shallow) {
+    for (const Index number : m_shallowPoints) {
         const Vec2 p = m_points[number];
         const Index point = static_cast<Index>(m_isMet.size()) + number;
         const auto stopHere = [&](std::size_t i) {
@@ -236,10 +270,14 @@ void Meetings::stopAtShallow(Index split) {
     }
 }
 
-/// A point beside an end comes between the start and the end, too.
+/// At a point beyond an end the element stops already, at that end: going to the point and back
+/// would be a way of its own.
 void Meetings::addStop(Index element, Index point, Vec2 p) {
     const double place = placeOn(m_strands->elements[element], p);
-    m_found.push_back({element, point, std::clamp(place, 0.0, 1.0)});
+    if (place > 0.0 && place < 1.0)
+        m_found.push_back({element, point, place});
+    else
+        m_isMet[place < 0.5 ? element : m_endVertex[element]] = 1;
 }
 
 /// By element, then by place: counted into their elements, then sorted within each.

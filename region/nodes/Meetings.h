@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include <cstdint>
 #include <vector>
 
 #include "region/nodes/Strands.h"
@@ -16,6 +17,9 @@ struct Stop {
     double place;  ///< along the element, 0..1
 };
 
+/// What else comes near a crossing stops there, too: where the crossing is shallow, or anywhere.
+enum class Care : std::uint8_t { kUsual, kThorough };
+
 /// Finds where elements of strands meet: where they cross, where one ends on another, and where
 /// they come nearest without crossing, if that is within the tolerance.
 ///
@@ -23,18 +27,26 @@ struct Stop {
 /// strand do not meet in their common end.
 class Meetings {
 public:
-    /// Which elements are compared.
+    /// Which elements are compared, and how.
     struct Scope {
         Index split = kNone;  ///< see Arrangement::settle
         const std::vector<std::uint8_t>* moved =
             nullptr;  ///< if given, of each two one that is set
+        Care care = Care::kUsual;
     };
 
-    /// Cost: that of the pairs of elements whose boxes come near.
-    void find(const Strands& strands, double tolerance, const Scope& scope);
+    /// Lets the next calls compare so many pairs of elements altogether.
+    void allow(std::uint64_t pairs) { m_pairsLeft = pairs; }
+
+    bool isAtLimit() const { return m_pairsLeft == 0; }
+
+    /// False when that needs more pairs than allowed. Cost: that of the pairs of elements whose
+    /// boxes come near.
+    bool find(const Strands& strands, double tolerance, const Scope& scope);
 
     /// Whether anything was found but that elements end at common points.
     bool foundAny() const { return !m_stops.empty() || m_turnsBack; }
+    std::size_t stopCount() const { return m_stops.size(); }
     Index endVertex(Index element) const { return m_endVertex[element]; }
     std::size_t vertexCount() const { return m_isMet.size(); }
     Vec2 vertex(Index v) const;
@@ -48,6 +60,9 @@ public:
 private:
     void prepare(const Strands& strands);
     void raiseBoxes(const Scope& scope);
+    bool takePair();
+    bool meetPairs(const Scope& scope);
+    bool meetMoved(const std::vector<std::uint8_t>& moved);
     const Box& boxOf(Index element) const;
     const Carrier& carrier(Index element);
     void meet(Index i, Index j);
@@ -66,6 +81,8 @@ private:
 
     const Strands* m_strands = nullptr;
     double m_tolerance = 0.0;
+    std::uint64_t m_pairsLeft = UINT64_MAX;
+    double m_shallow = 0.0;  ///< the sine of a crossing that is called shallow
     bool m_turnsBack = false;
     BoxRow m_boxes;
     BoxRow m_otherBoxes;
@@ -74,7 +91,7 @@ private:
     std::vector<Index> m_endVertex;
     std::vector<std::uint8_t> m_isMet;
     std::vector<Vec2> m_points;
-    std::vector<Index> m_shallow;  ///< points where elements cross at a small angle
+    std::vector<Index> m_shallowPoints;  ///< where elements cross at a small angle
     std::vector<Stop> m_found;
     std::vector<Stop> m_stops;
     std::vector<Index> m_firstStop;

@@ -35,10 +35,8 @@ double distanceFrom(const SourceElement& e, Vec2 p, double limit) {
         return found < limit * limit ? std::sqrt(found) : limit;
     }
     const Carrier carrier = e.carrier();
-    const double aside = std::fabs(signedDistance(carrier, p));
-    if (!(aside < limit)) return limit;
-    const double place = placeOn(e, footOn(carrier, p));
-    if (place >= 0.0 && place <= 1.0) return aside;
+    if (!isWithin(carrier, p, limit)) return limit;
+    if (spans(e, footOn(carrier, p))) return std::min(limit, std::fabs(signedDistance(carrier, p)));
     return std::min(limit, std::sqrt(std::min(squared(p - e.sp), squared(p - e.ep))));
 }
 
@@ -56,6 +54,7 @@ void OffsetSource::clear() {
 
 void OffsetSource::take(const RegionSet& set) {
     clear();
+    m_elements.reserve(set.elements().size());
     for (const Loop& loop : set.loops()) {
         for (Index i = loop.first; i < loop.last; ++i)
             append(set.elements()[i], i);
@@ -114,11 +113,15 @@ void OffsetSource::finish() {
     }
 }
 
-double OffsetSource::distanceBelow(Vec2 p, double limit, double nearEnough) const {
+double OffsetSource::distanceBelow(Vec2 p, double limit, double nearEnough, Index& guess) const {
     double nearest = limit;
-    m_boxes.anyOverlapping(about(p, limit), [&](std::size_t i) {
+    if (guess < m_elements.size()) nearest = distanceFrom(m_elements[guess], p, limit);
+    if (nearest < nearEnough) return nearest;
+    m_boxes.anyOverlapping(about(p, nearest), [&](std::size_t i) {
         nearest = distanceFrom(m_elements[i], p, nearest);
-        return nearest < nearEnough;
+        if (!(nearest < nearEnough)) return false;
+        guess = static_cast<Index>(i);
+        return true;
     });
     return nearest;
 }

@@ -37,11 +37,13 @@ public:
     /// The area that the loops enclose, and no less than the length along them.
     double area() const { return m_area; }
     double length() const { return m_length; }
+    /// The box about all elements.
+    Box bounds() const { return m_boxes.bounds(); }
 
     /// The distance from a point to the nearest element, if that is below a limit; else the limit.
-    /// The search ends at the first element that is nearer than what is near enough. Cost:
-    /// logarithmic, and the elements about as near.
-    double distanceBelow(Vec2 p, double limit, double nearEnough = 0.0) const;
+    /// The search ends at the first element that is nearer than what is near enough, and begins at
+    /// a guess, which becomes that element. Cost: logarithmic, and the elements about as near.
+    double distanceBelow(Vec2 p, double limit, double nearEnough, Index& guess) const;
 
 private:
     void clear();

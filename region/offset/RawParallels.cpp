@@ -39,9 +39,7 @@ void RawParallels::make(const OffsetSource& source, double distance, double tole
     m_trims = trims;
     m_sweptArea = 0.0;
     m_source = source.elements().data();
-    m_sources.clear();
-    m_owners.clear();
-    m_kinds.clear();
+    m_madeOf.clear();
     strands.clear();
     Index first = 0;
     for (const Index last : source.loopEnds()) {
@@ -52,6 +50,7 @@ void RawParallels::make(const OffsetSource& source, double distance, double tole
 
 void RawParallels::makeLoop(const SourceElement* first, std::size_t count, Strands& strands) {
     m_parallels.clear();
+    m_parallels.reserve(count);
     for (std::size_t i = 0; i < count; ++i) {
         m_parallels.push_back(parallelOf(first[i]));
         const double chord = std::sqrt(squared(first[i].ep - first[i].sp));
@@ -132,9 +131,19 @@ Element RawParallels::cornerArc(const SourceElement& before, const SourceElement
             bulge};
 }
 
+/// Room for the parallels in hand and their corner arcs, and no more where that is all there is.
+void RawParallels::makeRoom(Strands& strands) const {
+    std::size_t needed = strands.elements.size();
+    for (const Parallel& p : m_parallels)
+        needed += (p.exists ? 1U : 0U) + (p.joint == Joint::kCorner ? 1U : 0U);
+    const std::size_t capacity = strands.elements.capacity();
+    if (needed > capacity) strands.elements.reserve(std::max(needed, 2 * capacity));
+}
+
 /// Lists the parallels of a loop and its corner arcs, and ends its strands.
 void RawParallels::emit(const SourceElement* first, std::size_t count, Strands& strands) {
     const Index begin = static_cast<Index>(strands.elements.size());
+    makeRoom(strands);
     for (std::size_t i = 0; i < count; ++i) {
         const std::size_t next = i + 1 < count ? i + 1 : 0;
         const Parallel& p = m_parallels[i];
@@ -153,17 +162,14 @@ void RawParallels::emitElement(const Element& e, const SourceElement& of, Origin
                                bool goesOn, Strands& strands) {
     StrandElement s;
     static_cast<Element&>(s) = e;
-    s.tag = static_cast<Index>(m_owners.size());
+    s.tag = m_madeOf.add(static_cast<Index>(&of - m_source), of.owner, kind);
     s.joined = goesOn;
-    m_sources.push_back(static_cast<Index>(&of - m_source));
-    m_owners.push_back(of.owner);
-    m_kinds.push_back(kind);
     strands.elements.push_back(s);
 }
 
 double RawParallels::ownDistance(const OffsetSource& source, Index tag, Vec2 p) const {
-    const SourceElement& e = source.elements()[m_sources[tag]];
-    if (m_kinds[tag] == OriginKind::kCorner) return std::sqrt(squared(p - e.ep));
+    const SourceElement& e = source.elements()[m_madeOf.sources[tag]];
+    if (m_madeOf.kinds[tag] == OriginKind::kCorner) return std::sqrt(squared(p - e.ep));
     return std::fabs(signedDistance(e.carrier(), p));
 }
 

@@ -5,6 +5,7 @@
 
 #include "gmregion/RegionSet.h"
 #include "region/nodes/Strands.h"
+#include "region/offset/MadeOf.h"
 #include "region/offset/OffsetSource.h"
 
 namespace gmregion {
@@ -20,9 +21,8 @@ public:
     void make(const OffsetSource& source, double distance, double tolerance, bool trims,
               Strands& strands);
 
-    /// What the tags of the strands' elements are: the owner, and the kind.
-    const std::vector<Index>& owners() const { return m_owners; }
-    const std::vector<OriginKind>& kinds() const { return m_kinds; }
+    /// What the tags of the strands' elements are.
+    const MadeOf& madeOf() const { return m_madeOf; }
     /// The distance of a point from what the element with a tag is the parallel or the corner of.
     double ownDistance(const OffsetSource& source, Index tag, Vec2 p) const;
     /// An upper bound of the area between the source and its offset: the sum of the areas that the
@@ -50,6 +50,7 @@ private:
     bool meetInMiddle(Parallel& a, Parallel& b) const;
     bool trimToCrossing(Parallel& a, Parallel& b) const;
     void emit(const SourceElement* first, std::size_t count, Strands& strands);
+    void makeRoom(Strands& strands) const;
     void emitElement(const Element& e, const SourceElement& of, OriginKind kind, bool goesOn,
                      Strands& strands);
     Element cornerArc(const SourceElement& before, const SourceElement& after) const;
@@ -61,9 +62,7 @@ private:
     double m_sweptArea = 0.0;
     std::vector<Parallel> m_parallels;
     const SourceElement* m_source = nullptr;  ///< the first element of the source
-    std::vector<Index> m_sources;             ///< of each tag, the number of its source element
-    std::vector<Index> m_owners;
-    std::vector<OriginKind> m_kinds;
+    MadeOf m_madeOf;
 };
 
 }  // namespace gmregion

@@ -40,10 +40,9 @@ bool areasAgree(const OffsetScratch& offsets, double result, double distance, do
     return result <= most + slack && result >= source - swept - slack;
 }
 
-template <class Maker>
-OriginSource withKinds(OriginSource origins, const Maker& maker) {
-    origins.owners = &maker.owners();
-    origins.kinds = &maker.kinds();
+OriginSource withKinds(OriginSource origins, const MadeOf& madeOf) {
+    origins.owners = &madeOf.owners;
+    origins.kinds = &madeOf.kinds;
     return origins;
 }
 
@@ -54,7 +53,7 @@ bool roundOffset(OverlayScratch& scratch, OffsetScratch& offsets, const OriginSo
     Arrangement& arrangement = scratch.arrangement;
     offsets.raw.make(offsets.source, distance, tolerance, trims, arrangement.strands());
     beginOutcome(outcome, tolerance);
-    if (!arrangement.settle(tolerance)) return refuse(outcome, {Reason::kUnsettled, {}, 0});
+    if (!arrangement.settle(tolerance)) return refuseUnsettled(arrangement, outcome);
     scratch.fans.build(arrangement);
     scratch.loops.begin(arrangement, scratch.fans);
     if (!offsets.choice.choose(arrangement, scratch.fans, offsets.source, offsets.raw,
@@ -63,7 +62,7 @@ bool roundOffset(OverlayScratch& scratch, OffsetScratch& offsets, const OriginSo
     if (!scratch.loops.link())
         return refuse(outcome, {Reason::kUncertified, scratch.loops.conflict(), 0});
     if (!scratch.writer.write(arrangement, scratch.fans, scratch.loops,
-                              withKinds(origins, offsets.raw), outcome.regions))
+                              withKinds(origins, offsets.raw.madeOf()), outcome.regions))
         return refuse(outcome, {Reason::kUncertified, scratch.writer.conflict(), 0});
     if (!areasAgree(offsets, scratch.writer.area(), distance, tolerance))
         return refuse(outcome, {Reason::kUncertified, {}, 0});
@@ -81,7 +80,8 @@ bool stripOffset(OverlayScratch& scratch, OffsetScratch& offsets, const OriginSo
     offsets.strips.addSource(offsets.source, {1, 0}, strands);
     const Covers covers = grows ? Covers([](Weight w) { return w.a > 0; })
                                 : Covers([](Weight w) { return w.a > 0 && w.b <= 0; });
-    return overlay(scratch, tolerance, kNone, withKinds(origins, offsets.strips), covers, outcome);
+    return overlay(scratch, tolerance, kNone, Care::kThorough,
+                   withKinds(origins, offsets.strips.madeOf()), covers, outcome);
 }
 
 }  // namespace gmregion

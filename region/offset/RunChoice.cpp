@@ -47,6 +47,7 @@ bool RunChoice::choose(const Arrangement& arrangement, Fans& fans, const OffsetS
     m_states.assign(runs().size(), {});
     m_surplus.assign(arrangement.nodes().size(), 0);
     m_marginal.clear();
+    m_guess = kNone;
     for (Index run = 0; run < runs().size(); ++run) {
         if (!fans.stands(run)) continue;
         m_states[run] = judge(run, source, raw);
@@ -65,8 +66,7 @@ bool RunChoice::choose(const Arrangement& arrangement, Fans& fans, const OffsetS
     return true;
 }
 
-RunChoice::State RunChoice::judge(Index run, const OffsetSource& source,
-                                  const RawParallels& raw) const {
+RunChoice::State RunChoice::judge(Index run, const OffsetSource& source, const RawParallels& raw) {
     const auto& pieces = m_arrangement->pieces();
     Index longest = runs()[run].first;
     double width = -1.0;
@@ -93,12 +93,11 @@ RunChoice::State RunChoice::judge(Index run, const OffsetSource& source,
 }
 
 /// By how many tolerances something else of the source is nearer to a point of a parallel.
-double RunChoice::excessAt(Vec2 p, Index tag, const OffsetSource& source,
-                           const RawParallels& raw) const {
+double RunChoice::excessAt(Vec2 p, Index tag, const OffsetSource& source, const RawParallels& raw) {
     const double tolerance = m_arrangement->tolerance();
     const double own = raw.ownDistance(source, tag, p);
     const double nearest =
-        source.distanceBelow(p, own - kCertain * tolerance, own - kSurelyOut * tolerance);
+        source.distanceBelow(p, own - kCertain * tolerance, own - kSurelyOut * tolerance, m_guess);
     return (own - nearest) / tolerance;
 }
 

@@ -34,8 +34,8 @@ private:
         float excess = 0.0F;  ///< by how many tolerances something else of the source is nearer
     };
 
-    State judge(Index run, const OffsetSource& source, const RawParallels& raw) const;
-    double excessAt(Vec2 p, Index tag, const OffsetSource& source, const RawParallels& raw) const;
+    State judge(Index run, const OffsetSource& source, const RawParallels& raw);
+    double excessAt(Vec2 p, Index tag, const OffsetSource& source, const RawParallels& raw);
     const std::vector<Run>& runs() const { return m_arrangement->runs(); }
     Index start(Index run) const {
         return m_states[run].backward ? runs()[run].to : runs()[run].from;
@@ -54,6 +54,7 @@ private:
     std::vector<State> m_states;
     std::vector<int> m_surplus;  ///< of each node, chosen runs that leave less those that arrive
     std::vector<Vec2> m_marginal;
+    Index m_guess = kNone;  ///< what of the source was near last
     Vec2 m_conflict;
 };
 

@@ -23,8 +23,8 @@ void Strips::make(const OffsetSource& source, double distance, const OffsetOptio
     m_options = options;
     m_weight = weight;
     m_strands = &strands;
-    m_owners.clear();
-    m_kinds.clear();
+    m_source = source.elements().data();
+    m_madeOf.clear();
     strands.clear();
     Index first = 0;
     for (std::size_t loop = 0; loop < source.loopEnds().size(); ++loop) {
@@ -114,11 +114,10 @@ void Strips::addCorner(const SourceElement& before, const SourceElement& after, 
 
 void Strips::edge(Vec2 from, Vec2 to, double bulge, OriginKind kind) {
     const std::size_t before = m_strands->elements.size();
-    const Index tag = static_cast<Index>(m_owners.size());
+    const Index tag = static_cast<Index>(m_madeOf.owners.size());
     appendElement(m_strands->elements, {from, to, bulge}, tag);
     if (m_strands->elements.size() == before) return;
-    m_owners.push_back(m_of->owner);
-    m_kinds.push_back(kind);
+    m_madeOf.add(static_cast<Index>(m_of - m_source), m_of->owner, kind);
 }
 
 void Strips::endLoop() {

@@ -5,6 +5,7 @@
 
 #include "gmregion/Offset.h"
 #include "region/nodes/Strands.h"
+#include "region/offset/MadeOf.h"
 #include "region/offset/OffsetSource.h"
 
 namespace gmregion {
@@ -22,9 +23,8 @@ public:
     /// Appends the loops of the source itself, each of a weight.
     void addSource(const OffsetSource& source, Weight weight, Strands& strands);
 
-    /// What the tags of the strands' elements are: the owner, and the kind.
-    const std::vector<Index>& owners() const { return m_owners; }
-    const std::vector<OriginKind>& kinds() const { return m_kinds; }
+    /// What the tags of the strands' elements are.
+    const MadeOf& madeOf() const { return m_madeOf; }
 
 private:
     void addStrip(const SourceElement& e);
@@ -38,8 +38,8 @@ private:
     Weight m_weight;
     Strands* m_strands = nullptr;
     const SourceElement* m_of = nullptr;
-    std::vector<Index> m_owners;
-    std::vector<OriginKind> m_kinds;
+    const SourceElement* m_source = nullptr;  ///< the first element of the source
+    MadeOf m_madeOf;
 };
 
 }  // namespace gmregion

@@ -28,7 +28,7 @@ Covers coveredBy(Combination combination) {
 
 bool combine(const RegionSet& first, const RegionSet& second, Combination combination,
              Workspace& workspace, Outcome& outcome) {
-    OverlayScratch& scratch = workspace.scratch().overlay;
+    OverlayScratch& scratch = workspace.begin().overlay;
     const double tolerance = std::max(first.tolerance(), second.tolerance());
     const Index split = static_cast<Index>(first.elements().size());
     OriginSource source;
@@ -39,9 +39,10 @@ bool combine(const RegionSet& first, const RegionSet& second, Combination combin
         takeSet(first, {1, 0}, 0, strands);
         const Index firstOfSecond = static_cast<Index>(strands.elements.size());
         takeSet(second, {0, 1}, split, strands);
-        return firstOfSecond;
+        // At a coarser tolerance than its own a set is compared with itself as well.
+        return first.tolerance() == second.tolerance() ? firstOfSecond : kNone;
     };
-    return overlayTwice(scratch, tolerance, fill, source, coveredBy(combination), outcome);
+    return overlayInAttempts(scratch, tolerance, fill, source, coveredBy(combination), outcome);
 }
 
 Outcome combine(const RegionSet& first, const RegionSet& second, Combination combination) {
@@ -52,7 +53,7 @@ Outcome combine(const RegionSet& first, const RegionSet& second, Combination com
 }
 
 bool uniteAll(const RegionSet* sets, std::size_t count, Workspace& workspace, Outcome& outcome) {
-    OverlayScratch& scratch = workspace.scratch().overlay;
+    OverlayScratch& scratch = workspace.begin().overlay;
     scratch.origins.clear();
     scratch.originEnds.clear();
     double tolerance = 0.0;
@@ -76,7 +77,7 @@ bool uniteAll(const RegionSet* sets, std::size_t count, Workspace& workspace, Ou
         return kNone;
     };
     const Covers covers = [](Weight w) { return w.a > 0; };
-    return overlayTwice(scratch, tolerance, fill, source, covers, outcome);
+    return overlayInAttempts(scratch, tolerance, fill, source, covers, outcome);
 }
 
 }  // namespace gmregion

@@ -28,7 +28,7 @@ double defaultTolerance(const Paths& paths) {
 
 bool cleanUp(const Paths& paths, const CleanUpOptions& options, Workspace& workspace,
              Outcome& outcome) {
-    OverlayScratch& scratch = workspace.scratch().overlay;
+    OverlayScratch& scratch = workspace.begin().overlay;
     const Extent extent = extentOf(paths);
     if (extent.refusal) return refuse(outcome, extent.refusal);
     const double tolerance = toleranceFor(extent, options.tolerance);
@@ -38,12 +38,12 @@ bool cleanUp(const Paths& paths, const CleanUpOptions& options, Workspace& works
     source.list = &scratch.origins;
     const auto fill = [&](Strands& strands) {
         scratch.origins.clear();
-        refusal = takePaths(paths, tolerance, true, strands, scratch.origins);
+        refusal = takePaths(paths, tolerance, true, {1, 0}, strands, scratch.origins);
         if (refusal) strands.clear();
         return kNone;
     };
     const bool found =
-        overlayTwice(scratch, tolerance, fill, source, coveredBy(options.rule), outcome);
+        overlayInAttempts(scratch, tolerance, fill, source, coveredBy(options.rule), outcome);
     return refusal ? refuse(outcome, refusal) : found;
 }
 

@@ -1,16 +1,14 @@
 // SPDX-License-Identifier: MIT
 /// @file
-/// Offsets, with what is tried in which order.
+/// Offsets of sets and of paths.
 ///
-/// Round joins and ends go by raw parallels. Should the result not pass its check, the same is
-/// tried without trimmed neighbours, then a third of a tolerance beside the distance, where no
-/// threshold is the same, then as a union of strips, and at last so with half the tolerance. Other
-/// joins and ends are unions of strips from the start.
+/// What is near a threshold, or was found with another tolerance, is laid over itself once more.
 #include "gmregion/Offset.h"
 
 #include <algorithm>
 #include <cmath>
 
+#include "region/offset/OffsetAttempts.h"
 #include "region/operations/Scratch.h"
 #include "region/overlay/Intake.h"
 #include "region/overlay/Overlay.h"
@@ -19,47 +17,17 @@ namespace gmregion {
 
 namespace {
 
-/// In distances: the coarsest tolerance that an offset is computed with.
-constexpr double kCoarsest = 1.0 / 64.0;
 /// In tolerances: an offset by no more is a copy.
 constexpr double kCopies = 0.5;
-/// In tolerances: how far beside the distance a second attempt goes.
-constexpr double kBeside = 1.0 / 3.0;
-
-Refusal checked(double distance, const OffsetOptions& options) {
-    if (!std::isfinite(distance) || !std::isfinite(options.miterLimit))
-        return {Reason::kNotFinite, {}, 0};
-    if (std::fabs(distance) > kLargestCoordinate || options.miterLimit < 1.0)
-        return {Reason::kOutOfRange, {}, 0};
-    return {};
-}
-
-bool isRound(const OffsetOptions& options, bool isOpen) {
-    return options.join == Join::kRound && (!isOpen || options.end == End::kRound);
-}
-
-/// Tries one way after the other.
-bool attempt(Scratch& scratch, const OriginSource& origins, double distance, double fine,
-             const OffsetOptions& options, bool isOpen, Outcome& outcome) {
-    OverlayScratch& overlay = scratch.overlay;
-    OffsetScratch& offsets = scratch.offset;
-    const double beside = distance > 0.0 ? kBeside * fine : -kBeside * fine;
-    if (isRound(options, isOpen)) {
-        if (roundOffset(overlay, offsets, origins, distance, fine, true, outcome)) return true;
-        if (roundOffset(overlay, offsets, origins, distance, fine, false, outcome)) return true;
-        if (roundOffset(overlay, offsets, origins, distance + beside, fine, false, outcome))
-            return true;
-    }
-    return stripOffset(overlay, offsets, origins, distance, fine, options, outcome) ||
-           stripOffset(overlay, offsets, origins, distance + beside, 0.5 * fine, options, outcome);
-}
 
 /// The offset of the source that a scratch holds.
 bool offsetSource(Scratch& scratch, const OriginSource& origins, double distance, double tolerance,
                   const OffsetOptions& options, bool isOpen, Outcome& outcome) {
-    const double fine = std::min(tolerance, std::fabs(distance) * kCoarsest);
-    if (!attempt(scratch, origins, distance, fine, options, isOpen, outcome)) return false;
-    SetWriter::setTolerance(outcome.regions, tolerance);
+    if (!offsetInAttempts(scratch.overlay, scratch.offset, origins, distance, tolerance, options,
+                          isOpen, outcome))
+        return false;
+    if (outcome.regions.tolerance() < tolerance || !outcome.marginal.empty())
+        consolidate(scratch.overlay, std::max(tolerance, outcome.regions.tolerance()), outcome);
     return true;
 }
 
@@ -79,12 +47,12 @@ Outcome offset(const RegionSet& source, double distance, const OffsetOptions& op
 
 bool offsetSeries(const RegionSet& source, const double* distances, std::size_t count,
                   const OffsetOptions& options, Workspace& workspace, Outcome* outcomes) {
-    Scratch& scratch = workspace.scratch();
+    Scratch& scratch = workspace.begin();
     scratch.offset.source.take(source);
     OriginSource origins;
     origins.first = &source;
     for (std::size_t i = 0; i < count; ++i) {
-        const Refusal refusal = checked(distances[i], options);
+        const Refusal refusal = checkedOffset(distances[i], options);
         if (refusal) return refuse(outcomes[i], refusal);
         const bool isCopy = std::fabs(distances[i]) <= kCopies * source.tolerance();
         if (source.empty() || isCopy) {
@@ -101,18 +69,21 @@ bool offsetSeries(const RegionSet& source, const double* distances, std::size_t 
 
 bool thicken(const Paths& paths, double halfWidth, double tolerance, const OffsetOptions& options,
              Workspace& workspace, Outcome& outcome) {
-    Scratch& scratch = workspace.scratch();
+    Scratch& scratch = workspace.begin();
     const Extent extent = extentOf(paths);
-    Refusal refusal = extent.refusal ? extent.refusal : checked(halfWidth, options);
+    Refusal refusal = extent.refusal ? extent.refusal : checkedOffset(halfWidth, options);
     if (!refusal && !(halfWidth > 0.0)) refusal = {Reason::kOutOfRange, {}, 0};
     const double coincident = toleranceFor(extent, tolerance);
     if (!refusal) refusal = checkedTolerance(extent, coincident);
+    if (!refusal && extent.size > 0.0 && halfWidth <= kCopies * coincident)
+        refusal = {Reason::kTolerance, {}, 0};
     if (refusal) return refuse(outcome, refusal);
     Strands& strands = scratch.overlay.arrangement.strands();
     strands.clear();
     scratch.overlay.origins.clear();
-    refusal = takePaths(paths, coincident, false, strands, scratch.overlay.origins);
+    refusal = takePaths(paths, coincident, false, {1, 0}, strands, scratch.overlay.origins);
     if (refusal) return refuse(outcome, refusal);
+    scratch.overlay.order.improve(strands, kNone);
     scratch.offset.source.take(strands);
     if (scratch.offset.source.elements().empty()) {
         beginOutcome(outcome, coincident);

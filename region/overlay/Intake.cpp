@@ -46,6 +46,8 @@ Extent extentOf(const Paths& paths) {
     }
     if (box.isEmpty()) return extent;
     extent.size = std::max(box.size().x, box.size().y);
+    if (extent.size > 0.0 && extent.size < kSmallestSize)
+        extent.refusal = {Reason::kOutOfRange, box.low, 0};
     extent.largest = std::max(largestOf(box.low), largestOf(box.high));
     if (!(extent.largest <= 4.0 * kLargestCoordinate))
         extent.refusal = {Reason::kOutOfRange, {}, 0};
@@ -73,8 +75,8 @@ void appendElement(std::vector<StrandElement>& elements, const Element& e, Index
     });
 }
 
-Refusal takePaths(const Paths& paths, double tolerance, bool wantClosed, Strands& strands,
-                  std::vector<Origin>& origins) {
+Refusal takePaths(const Paths& paths, double tolerance, bool wantClosed, Weight weight,
+                  Strands& strands, std::vector<Origin>& origins) {
     auto& elements = strands.elements;
     for (std::size_t i = 0; i < paths.size(); ++i) {
         const PathView path = paths[i];
@@ -93,7 +95,7 @@ Refusal takePaths(const Paths& paths, double tolerance, bool wantClosed, Strands
             if (!(dot(gap, gap) <= tolerance * tolerance)) return {Reason::kGap, e.ep, i};
             appendElement(elements, {e.ep, next, 0.0}, tag);
         }
-        strands.endStrand(path.closed, {1, 0});
+        strands.endStrand(path.closed, weight);
     }
     return {};
 }

@@ -11,6 +11,8 @@ namespace gmregion {
 
 /// The largest coordinate that operations take.
 constexpr double kLargestCoordinate = 1e12;
+/// The smallest size of a drawing that operations take: areas and their squares are numbers yet.
+constexpr double kSmallestSize = 1e-60;
 /// The tolerance is at least the largest coordinate times this.
 constexpr double kFinestTolerance = 1.0 / 17592186044416.0;  // 2^-44
 
@@ -33,10 +35,10 @@ Refusal checkedTolerance(const Extent& extent, double tolerance);
 /// length.
 void appendElement(std::vector<StrandElement>& elements, const Element& e, Index tag);
 
-/// Appends the paths, each a strand of weight a = 1, and an origin for each of their elements,
+/// Appends the paths, each a strand of that weight, and an origin for each of their elements,
 /// whose number is the tag. Gaps up to the tolerance are closed.
-Refusal takePaths(const Paths& paths, double tolerance, bool wantClosed, Strands& strands,
-                  std::vector<Origin>& origins);
+Refusal takePaths(const Paths& paths, double tolerance, bool wantClosed, Weight weight,
+                  Strands& strands, std::vector<Origin>& origins);
 
 /// Appends the loops of a set as strands; tags are the numbers of elements, counted from
 /// `firstTag`.

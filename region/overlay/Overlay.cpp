@@ -6,6 +6,10 @@
 /// runs that are covered on one side only bound the result.
 #include "region/overlay/Overlay.h"
 
+#include <utility>
+
+#include "region/overlay/Intake.h"
+
 namespace gmregion {
 
 bool refuse(Outcome& outcome, const Refusal& refusal) {
@@ -15,18 +19,23 @@ bool refuse(Outcome& outcome, const Refusal& refusal) {
     return false;
 }
 
+bool refuseUnsettled(const Arrangement& arrangement, Outcome& outcome) {
+    const Reason reason = arrangement.isAtLimit() ? Reason::kWorkLimit : Reason::kUnsettled;
+    return refuse(outcome, {reason, {}, 0});
+}
+
 void beginOutcome(Outcome& outcome, double tolerance) {
     SetWriter::clear(outcome.regions, tolerance);
     outcome.marginal.clear();
     outcome.refusal = {};
 }
 
-bool overlay(OverlayScratch& scratch, double tolerance, Index split, const OriginSource& source,
-             Covers covers, Outcome& outcome) {
+bool overlay(OverlayScratch& scratch, double tolerance, Index split, Care care,
+             const OriginSource& source, Covers covers, Outcome& outcome) {
     Arrangement& arrangement = scratch.arrangement;
     beginOutcome(outcome, tolerance);
     if (arrangement.strands().elements.empty()) return true;
-    if (!arrangement.settle(tolerance, split)) return refuse(outcome, {Reason::kUnsettled, {}, 0});
+    if (!arrangement.settle(tolerance, split, care)) return refuseUnsettled(arrangement, outcome);
     scratch.fans.build(arrangement);
     if (!scratch.windings.find(arrangement, scratch.fans))
         return refuse(outcome, {Reason::kUncertified, scratch.windings.conflict(), 0});
@@ -42,6 +51,20 @@ bool overlay(OverlayScratch& scratch, double tolerance, Index split, const Origi
     if (scratch.writer.write(arrangement, scratch.fans, scratch.loops, source, outcome.regions))
         return true;
     return refuse(outcome, {Reason::kUncertified, scratch.writer.conflict(), 0});
+}
+
+void consolidate(OverlayScratch& scratch, double tolerance, Outcome& outcome) {
+    std::swap(scratch.loose, outcome);
+    OriginSource source;
+    source.first = &scratch.loose.regions;
+    Strands& strands = scratch.arrangement.strands();
+    strands.clear();
+    takeSet(scratch.loose.regions, {1, 0}, 0, strands);
+    const Covers covers = [](Weight w) { return w.a > 0; };
+    if (overlay(scratch, tolerance, kNone, Care::kUsual, source, covers, outcome))
+        std::swap(outcome.marginal, scratch.loose.marginal);
+    else
+        std::swap(scratch.loose, outcome);
 }
 
 }  // namespace gmregion

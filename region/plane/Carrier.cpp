@@ -48,6 +48,15 @@ double signedDistance(const Carrier& c, Vec2 p) {
     return 2.0 * value / (1.0 + std::sqrt(squared));
 }
 
+// At the distance d, G = d - k/2 d^2, which grows up to the centre; a limit beyond the centre takes
+// in all of the inside.
+bool isWithin(const Carrier& c, Vec2 p, double limit) {
+    const double value = sideOf(c, p).value;
+    const double bend = c.curvature * limit;
+    const bool isBelow = value <= limit - 0.5 * bend * limit || bend > 1.0;
+    return isBelow && (value >= -limit - 0.5 * bend * limit || bend < -1.0);
+}
+
 Vec2 footOn(const Carrier& c, Vec2 p) {
     const Side side = sideOf(c, p);
     const double steepness = std::sqrt(dot(side.gradient, side.gradient));

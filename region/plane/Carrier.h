@@ -32,6 +32,10 @@ std::optional<Carrier> parallel(const Carrier& c, double d);
 /// The signed distance of a point, positive on the left of the direction of travel. Cost: constant.
 double signedDistance(const Carrier& c, Vec2 p);
 
+/// Whether that distance, of whatever sign, is at most the limit. Cost: less than that of the
+/// distance.
+bool isWithin(const Carrier& c, Vec2 p, double limit);
+
 /// The point of the carrier nearest to p. For the centre of a circle any of its points.
 Vec2 footOn(const Carrier& c, Vec2 p);
 

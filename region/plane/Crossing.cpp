@@ -18,6 +18,7 @@
 /// point by which its own carrier is given: it takes out what the common origin cost in digits.
 #include "region/plane/Crossing.h"
 
+#include <algorithm>
 #include <cmath>
 #include <optional>
 
@@ -40,7 +41,12 @@ Form formFrom(const Carrier& c, Vec2 origin) {
     return {side.value, side.gradient, c.curvature};
 }
 
-/// One step towards the common zero of both sides; the point itself where they run alongside.
+/// Above this sine a step of Newton's method is taken as it is.
+constexpr double kSteep = 1e-3;
+
+/// One step towards the common zero of both sides; the point itself where they run alongside. Where
+/// carriers touch, a step is the quotient of two roundings and may lead far away: there it is taken
+/// only when it comes nearer to both.
 Vec2 improved(const Carrier& a, const Carrier& b, Vec2 p) {
     const Side sideA = sideOf(a, p);
     const Side sideB = sideOf(b, p);
@@ -48,7 +54,13 @@ Vec2 improved(const Carrier& a, const Carrier& b, Vec2 p) {
     const Vec2 step{sideA.value * sideB.gradient.y - sideB.value * sideA.gradient.y,
                     sideB.value * sideA.gradient.x - sideA.value * sideB.gradient.x};
     const Vec2 better = p - (1.0 / determinant) * step;
-    return std::isfinite(better.x) && std::isfinite(better.y) ? better : p;
+    if (!std::isfinite(better.x) || !std::isfinite(better.y)) return p;
+    if (std::fabs(determinant) > kSteep) return better;
+    const auto away = [](double atA, double atB) {
+        return std::max(std::fabs(atA), std::fabs(atB));
+    };
+    const double before = away(sideA.value, sideB.value);
+    return away(sideOf(a, better).value, sideOf(b, better).value) <= before ? better : p;
 }
 
 /// The line through both crossings of two carriers, and where along it the more bent one is: in the
@@ -127,34 +139,52 @@ CrossingPoints crossings(const Carrier& a, const Carrier& b) {
     return points;
 }
 
-double placeOn(const Element& e, Vec2 p) {
+namespace {
+
+/// Where a point of a carrier lies beside the element: before its start, behind its end, or on the
+/// far side of the circle.
+struct Beside {
+    bool before;
+    bool behind;
+    bool across;
+};
+
+Beside besideOf(const Element& e, Vec2 p) {
     const Vec2 chord = e.ep - e.sp;
+    const Vec2 fromStart = p - e.sp;
+    const double aside = cross(chord, fromStart);
+    // Of a circle, the arc is what lies on its own side of the chord.
+    if (std::fabs(e.bulge) > kBent) return {false, false, aside * e.bulge > 0.0};
+    // Of the circle's points beside the chord, those beyond the centre are not on the arc. The
+    // centre lies at the height L (1 - b^2) / (4 b).
+    const double heights = 4.0 * e.bulge * aside;
+    const bool beyond = heights > dot(chord, chord) * (1.0 - e.bulge) * (1.0 + e.bulge);
+    return {dot(chord, fromStart) < 0.0, dot(chord, e.ep - p) < 0.0, beyond};
+}
+
+}  // namespace
+
+double placeOn(const Element& e, Vec2 p) {
     const Vec2 fromStart = p - e.sp;
     const Vec2 toEnd = e.ep - p;
     const double a = std::sqrt(dot(fromStart, fromStart));
     const double b = std::sqrt(dot(toEnd, toEnd));
     const double place = a + b > 0.0 ? a / (a + b) : 0.0;
-    if (std::fabs(e.bulge) > kBent) {
-        // Of a circle, the arc is what lies on its own side of the chord.
-        const bool onArc = (cross(chord, fromStart) > 0.0) != (e.bulge > 0.0);
-        if (onArc) return place;
-        return a < b ? -place : 2.0 - place;
-    }
-    // Of the circle's points beside the chord, those beyond the centre are not on the arc. The
-    // centre lies at the height L (1 - b^2) / (4 b).
-    const double heights = 4.0 * e.bulge * cross(chord, fromStart);
-    const bool beyond = heights > dot(chord, chord) * (1.0 - e.bulge) * (1.0 + e.bulge);
-    if (dot(chord, fromStart) < 0.0 || (beyond && a < b)) return -place;
-    if (dot(chord, toEnd) < 0.0 || beyond) return 2.0 - place;
+    const Beside beside = besideOf(e, p);
+    if (beside.before || (beside.across && a < b)) return -place;
+    if (beside.behind || beside.across) return 2.0 - place;
     return place;
+}
+
+bool spans(const Element& e, Vec2 p) {
+    const Beside beside = besideOf(e, p);
+    return !(beside.before || beside.behind || beside.across);
 }
 
 CrossingPoints crossings(const Element& a, const Element& b) {
     CrossingPoints points;
     for (const Vec2 p : crossings(carrierOf(a), carrierOf(b))) {
-        const double onA = placeOn(a, p);
-        const double onB = placeOn(b, p);
-        if (onA >= 0.0 && onA <= 1.0 && onB >= 0.0 && onB <= 1.0) points.add(p);
+        if (spans(a, p) && spans(b, p)) points.add(p);
     }
     return points;
 }

@@ -37,6 +37,9 @@ std::optional<Vec2> nearestApproach(const Carrier& a, const Carrier& b);
 /// element turns by half a turn at the most.
 double placeOn(const Element& e, Vec2 p);
 
+/// Whether that place is from 0 to 1. Cost: less than that of the place.
+bool spans(const Element& e, Vec2 p);
+
 /// The points in which two elements cross, ends included exactly: a crossing beside an end, by
 /// rounding, may be missing. Whoever needs it looks at the ends as well.
 CrossingPoints crossings(const Element& a, const Element& b);

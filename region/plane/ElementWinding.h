@@ -12,6 +12,12 @@ namespace gmregion {
 /// turns by half a turn at the most.
 int windingOf(const Element& e, Vec2 p);
 
+/// What a chain between two points adds for a point that its box lies left of: however it runs, the
+/// same.
+inline int windingOfChain(Vec2 from, Vec2 to, Vec2 p) {
+    return static_cast<int>(from.y > p.y) - static_cast<int>(to.y > p.y);
+}
+
 /// What an element adds for points beside its middle, on its right; on its left it is one more.
 int windingRightOf(const Element& e);
 

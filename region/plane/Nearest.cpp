@@ -7,8 +7,7 @@ namespace gmregion {
 
 Vec2 nearestOn(const Element& e, const Carrier& c, Vec2 p) {
     const Vec2 foot = footOn(c, p);
-    const double place = placeOn(e, foot);
-    if (place >= 0.0 && place <= 1.0) return foot;
+    if (spans(e, foot)) return foot;
     const Vec2 toStart = e.sp - p;
     const Vec2 toEnd = e.ep - p;
     return dot(toStart, toStart) <= dot(toEnd, toEnd) ? e.sp : e.ep;

@@ -30,6 +30,8 @@ public:
 
     std::size_t size() const { return m_ends.empty() ? 0 : m_ends.front(); }
     const Box& operator[](std::size_t index) const { return m_boxes[index]; }
+    /// The box about all; empty for an empty row.
+    Box bounds() const { return size() > 0 ? boxOf(top(), 0) : Box{}; }
 
     /// Calls visit(index) for the boxes that overlap a box, in the order of the row.
     template <class Visit>
@@ -42,6 +44,15 @@ public:
     template <class IsWanted>
     bool anyOverlapping(const Box& box, const IsWanted& isWanted) const {
         return size() > 0 && anyUnder(top(), 0, box, isWanted);
+    }
+
+    /// Goes from a point to the left, x falling, for what adds up along the way: calls
+    /// whole(first, last) for ranges of the row whose boxes lie left of the point, and one(index)
+    /// for boxes that hold it; not for those above, below and to the right. Cost: mostly
+    /// logarithmic.
+    template <class Whole, class One>
+    void castLeft(Vec2 from, const Whole& whole, const One& one) const {
+        if (size() > 0) castUnder(top(), 0, from, whole, one);
     }
 
     /// Looks from a point to the left, x falling: calls hitAt(index), which answers the x of a hit
@@ -62,16 +73,19 @@ public:
     }
 
     /// Calls visit(i, j) once for every two boxes of the row that overlap, i < j, in an order that
-    /// depends on the boxes alone. Cost: the number of boxes, and of pairs near each other.
+    /// depends on the boxes alone, until it answers false; whether it never did. Cost: the number
+    /// of boxes, and of pairs near each other.
     template <class Visit>
-    void visitPairs(const Visit& visit) const {
-        if (size() > 0) pairsUnder(top(), 0, visit);
+    bool visitPairs(const Visit& visit) const {
+        return size() == 0 || pairsUnder(top(), 0, visit);
     }
 
-    /// Calls visit(i, j) for the boxes i of this row and j of another that overlap.
+    /// Calls visit(i, j) for the boxes i of this row and j of another that overlap, until it
+    /// answers false; whether it never did.
     template <class Visit>
-    void visitPairsWith(const BoxRow& other, const Visit& visit) const {
-        if (size() > 0 && other.size() > 0) pairsAcross(top(), 0, other, other.top(), 0, visit);
+    bool visitPairsWith(const BoxRow& other, const Visit& visit) const {
+        return size() == 0 || other.size() == 0 ||
+               pairsAcross(top(), 0, other, other.top(), 0, visit);
     }
 
 private:
@@ -109,6 +123,22 @@ private:
             if (anyUnder(level - 1, i, box, isWanted)) return true;
         }
         return false;
+    }
+
+    template <class Whole, class One>
+    void castUnder(std::size_t level, std::size_t index, Vec2 from, const Whole& whole,
+                   const One& one) const {
+        const Box& box = boxOf(level, index);
+        if (box.low.y > from.y || box.high.y < from.y || box.low.x > from.x) return;
+        if (box.high.x < from.x) {
+            const std::size_t bits = kBits * level;
+            whole(index << bits, std::min((index + 1) << bits, size()));
+        } else if (level == 0) {
+            one(index);
+        } else {
+            for (std::size_t i = index << kBits; i < endUnder(level, index); ++i)
+                castUnder(level - 1, i, from, whole, one);
+        }
     }
 
     template <class HitAt>
@@ -161,45 +191,48 @@ private:
 
     /// The pairs of which both are under one box.
     template <class Visit>
-    void pairsUnder(std::size_t level, std::size_t index, const Visit& visit) const {
-        if (level == 0) return;
+    bool pairsUnder(std::size_t level, std::size_t index, const Visit& visit) const {
+        if (level == 0) return true;
         const std::size_t end = endUnder(level, index);
         for (std::size_t i = index << kBits; i < end; ++i) {
-            pairsUnder(level - 1, i, visit);
-            for (std::size_t j = i + 1; j < end; ++j)
-                pairsBetween(level - 1, i, j, visit);
+            if (!pairsUnder(level - 1, i, visit)) return false;
+            for (std::size_t j = i + 1; j < end; ++j) {
+                if (!pairsBetween(level - 1, i, j, visit)) return false;
+            }
         }
+        return true;
     }
 
     /// The pairs of which one is under the one box and the other under the other, of one level.
     template <class Visit>
-    void pairsBetween(std::size_t level, std::size_t a, std::size_t b, const Visit& visit) const {
-        if (!boxOf(level, a).overlaps(boxOf(level, b))) return;
-        if (level == 0) {
-            visit(a, b);
-            return;
-        }
+    bool pairsBetween(std::size_t level, std::size_t a, std::size_t b, const Visit& visit) const {
+        if (!boxOf(level, a).overlaps(boxOf(level, b))) return true;
+        if (level == 0) return visit(a, b);
         for (std::size_t i = a << kBits; i < endUnder(level, a); ++i) {
             if (!boxOf(level - 1, i).overlaps(boxOf(level, b))) continue;
-            for (std::size_t j = b << kBits; j < endUnder(level, b); ++j)
-                pairsBetween(level - 1, i, j, visit);
+            for (std::size_t j = b << kBits; j < endUnder(level, b); ++j) {
+                if (!pairsBetween(level - 1, i, j, visit)) return false;
+            }
         }
+        return true;
     }
 
     template <class Visit>
-    void pairsAcross(std::size_t level, std::size_t index, const BoxRow& other,
+    bool pairsAcross(std::size_t level, std::size_t index, const BoxRow& other,
                      std::size_t otherLevel, std::size_t otherIndex, const Visit& visit) const {
-        if (!boxOf(level, index).overlaps(other.boxOf(otherLevel, otherIndex))) return;
-        if (level == 0 && otherLevel == 0) {
-            visit(index, otherIndex);
-        } else if (level >= otherLevel) {
-            for (std::size_t i = index << kBits; i < endUnder(level, index); ++i)
-                pairsAcross(level - 1, i, other, otherLevel, otherIndex, visit);
-        } else {
-            const std::size_t end = other.endUnder(otherLevel, otherIndex);
-            for (std::size_t i = otherIndex << kBits; i < end; ++i)
-                pairsAcross(level, index, other, otherLevel - 1, i, visit);
+        if (!boxOf(level, index).overlaps(other.boxOf(otherLevel, otherIndex))) return true;
+        if (level == 0 && otherLevel == 0) return visit(index, otherIndex);
+        const bool isThis = level >= otherLevel;
+        const std::size_t first = (isThis ? index : otherIndex) << kBits;
+        const std::size_t end =
+            isThis ? endUnder(level, index) : other.endUnder(otherLevel, otherIndex);
+        for (std::size_t i = first; i < end; ++i) {
+            const bool goesOn =
+                isThis ? pairsAcross(level - 1, i, other, otherLevel, otherIndex, visit)
+                       : pairsAcross(level, index, other, otherLevel - 1, i, visit);
+            if (!goesOn) return false;
         }
+        return true;
     }
 
     std::vector<Box> m_boxes;         ///< the row, then level after level what stands over it

@@ -56,15 +56,12 @@ Vec2 extremeOn(const Piece& piece, double before, double behind) {
     return e.sp + radius * rightNormal(dir - piece.startDir);
 }
 
-bool isWithin(const Carrier& c, Vec2 p, double t) {
-    return std::fabs(signedDistance(c, p)) <= t * (1.0 - kMargin);
-}
-
 }  // namespace
 
 bool Ring::holdsPart(const Piece& piece, double t, bool wantAlong) const {
     const Element& e = piece.e;
-    if (!isWithin(m_carrier, e.sp, t) || !isWithin(m_carrier, e.ep, t)) return false;
+    const double reach = t * (1.0 - kMargin);
+    if (!isWithin(m_carrier, e.sp, reach) || !isWithin(m_carrier, e.ep, reach)) return false;
     const Vec2 start = sideOf(m_carrier, e.sp).gradient;
     const Vec2 end = sideOf(m_carrier, e.ep).gradient;
     if (wantAlong && !(cross(piece.startDir, start) > 0.0 && cross(piece.endDir, end) > 0.0))
@@ -73,7 +70,7 @@ bool Ring::holdsPart(const Piece& piece, double t, bool wantAlong) const {
     const double behind = dot(end, piece.endDir);
     if (before == 0.0 || behind == 0.0 || (before > 0.0) == (behind > 0.0)) return true;
     const Vec2 p = extremeOn(piece, before, behind);
-    if (!isWithin(m_carrier, p, t)) return false;
+    if (!isWithin(m_carrier, p, reach)) return false;
     if (!wantAlong || !isArc(e)) return true;
     const Vec2 there = sideOf(m_carrier, p).gradient;
     const Vec2 dir = std::fabs(behind) * piece.startDir + std::fabs(before) * piece.endDir;

@@ -15,9 +15,19 @@
 
 namespace gmregion {
 
+namespace {
+
+/// For rounding, in reaches.
+constexpr double kSlack = 1e-6;
+
+}  // namespace
+
 void Cuts::begin(const Element& e) {
     m_element = e;
     m_carrier = carrierOf(e);
+    m_middle = middleOf(e);
+    const Vec2 reach = e.ep - m_middle;
+    m_reach = (1.0 + kSlack) * std::sqrt(dot(reach, reach));
     m_cuts.clear();
     m_cuts.push_back({0.0, e.sp});
     m_cuts.push_back({1.0, e.ep});
@@ -33,6 +43,8 @@ void Cuts::cut(const BoundaryPiece& piece, double reach) {
 }
 
 void Cuts::cutAt(const Carrier& c) {
+    // No point of the element is farther from its middle than its ends.
+    if (!isWithin(c, m_middle, m_reach)) return;
     for (const Vec2 crossing : crossings(m_carrier, c)) {
         // Where both run along each other crossings are anywhere; on the element they do no harm.
         // The foot from far away is rounded, its own foot is not.

@@ -29,6 +29,8 @@ private:
 
     Element m_element;
     Carrier m_carrier;
+    Vec2 m_middle;
+    double m_reach = 0.0;  ///< from the middle to the ends
     std::vector<Cut> m_cuts;
 };
 

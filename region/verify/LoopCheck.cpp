@@ -10,6 +10,7 @@
 #include <algorithm>
 #include <cmath>
 
+#include "region/plane/Apart.h"
 #include "region/plane/Crossing.h"
 #include "region/plane/ElementWinding.h"
 #include "region/plane/Measures.h"
@@ -29,19 +30,21 @@ Vec2 between(const BoundaryPiece& e, Vec2 a, Vec2 b) {
 }
 
 bool isOn(const BoundaryPiece& e, Vec2 p, double within) {
-    return std::fabs(signedDistance(e.carrier, p)) <= within &&
+    return isWithin(e.carrier, p, within) &&
            squared(nearestOn(e, e.carrier, p) - p) <= within * within;
 }
 
-/// Whether the shorter piece runs along the longer one.
+/// Whether the shorter piece runs along the longer one. Sides of a wedge whose ends are two nodes
+/// do not: at three quarters of their length they are farther apart than half the tolerance.
 bool runAlong(const BoundaryPiece& a, const BoundaryPiece& b, double within) {
     const bool aIsShorter = squared(a.ep - a.sp) < squared(b.ep - b.sp);
     const BoundaryPiece& shorter = aIsShorter ? a : b;
     const BoundaryPiece& longer = aIsShorter ? b : a;
     if (squared(shorter.ep - shorter.sp) < 64.0 * within * within) return false;
     const Vec2 m = middleOf(shorter);
-    return isOn(longer, between(shorter, shorter.sp, m), within) &&
-           isOn(longer, between(shorter, m, shorter.ep), within) && isOn(longer, m, within);
+    const auto isBeside = [&](Vec2 p) { return isOn(longer, p, 0.5 * within); };
+    return isBeside(between(shorter, shorter.sp, m)) && isBeside(between(shorter, m, shorter.ep)) &&
+           isBeside(m);
 }
 
 /// Whether a piece passes from one side of another to the other at a point of both.
@@ -56,7 +59,7 @@ bool isNear(Vec2 a, Vec2 b, double within) {
     return squared(a - b) <= within * within;
 }
 
-bool checkPair(const BoundaryPiece& a, const BoundaryPiece& b, double tolerance,
+void checkPair(const BoundaryPiece& a, const BoundaryPiece& b, double tolerance,
                FaultList& faults) {
     const auto isEnd = [&](Vec2 p) {
         const double within = 4.0 * tolerance;
@@ -64,18 +67,16 @@ bool checkPair(const BoundaryPiece& a, const BoundaryPiece& b, double tolerance,
                isNear(p, b.ep, within);
     };
     const bool follows = a.ep == b.sp || b.ep == a.sp;
-    if (follows && a.bulge == 0.0 && b.bulge == 0.0 && dot(a.ep - a.sp, b.ep - b.sp) >= 0.0)
-        return true;
-    for (const Vec2 p : crossings(a, b)) {
+    if (follows && a.bulge == 0.0 && b.bulge == 0.0 && dot(a.ep - a.sp, b.ep - b.sp) >= 0.0) return;
+    for (const Vec2 p : crossings(a.carrier, b.carrier)) {
+        if (!spans(a, p) || !spans(b, p)) continue;
         if (isEnd(p) || !passes(a, b, p, tolerance)) continue;
         faults.add(FaultKind::kCrossing, p, 0.0, a.element);
-        return false;
+        return;
     }
     // Two that follow each other smoothly lie beside each other, but not along.
-    if (follows && dot(a.carrier.normal, b.carrier.normal) > 0.0) return true;
-    if (!runAlong(a, b, tolerance)) return true;
-    faults.add(FaultKind::kCrossing, middleOf(a), 0.0, a.element);
-    return false;
+    if (follows && dot(a.carrier.normal, b.carrier.normal) > 0.0) return;
+    if (runAlong(a, b, tolerance)) faults.add(FaultKind::kCrossing, middleOf(a), 0.0, a.element);
 }
 
 void checkEnds(const LoopsView& view, double tolerance, FaultList& faults) {
@@ -136,7 +137,12 @@ void checkLoops(const LoopsView& view, const BoundaryIndex& index, double tolera
                 FaultList& faults) {
     checkEnds(view, tolerance, faults);
     index.boxes().visitPairs([&](std::size_t i, std::size_t j) {
-        checkPair(index.pieces()[i], index.pieces()[j], tolerance, faults);
+        const BoundaryPiece& a = index.pieces()[i];
+        const BoundaryPiece& b = index.pieces()[j];
+        const Box& aboutA = index.boxes()[i];
+        if (!areApart(a.carrier, aboutA, b.carrier, index.boxes()[j], tolerance))
+            checkPair(a, b, tolerance, faults);
+        return true;
     });
     checkNesting(view, index, faults);
 }

@@ -45,7 +45,7 @@ constexpr double kRounding = 1.0 / 64.0;
 /// result must be found.
 constexpr double kBehind = 4.0;
 constexpr double kFound = 4.0;
-/// How often what is missing is halved before it is cut.
+/// How often what is not proven as a whole is halved before it is cut.
 constexpr int kHalvings = 3;
 /// Corners that turn by less than this sine have no arc worth asking for.
 constexpr double kTurns = 1e-9;
@@ -73,6 +73,7 @@ void OffsetVerifier::verify(const LoopsView& source, double distance, const Loop
     m_margin = kMargin * tolerance;
     m_options = options;
     m_faults = &faults;
+    m_guess = kNone;
     m_source.take(source);
     m_result.take(result);
     checkLoops(result, m_result, tolerance, faults);
@@ -101,9 +102,9 @@ void OffsetVerifier::linkFeatures() {
     const auto& pieces = m_source.pieces();
     Index first = 0;
     for (Index i = 0; i < pieces.size(); ++i) {
-        if (i > 0 && pieces[i].loop != pieces[i - 1].loop) first = i;
+        if (i > 0 && m_source.loopOf(i) != m_source.loopOf(i - 1)) first = i;
         if (i > first) m_features[i].before = i - 1;
-        const bool isLast = i + 1 == pieces.size() || pieces[i + 1].loop != pieces[i].loop;
+        const bool isLast = i + 1 == pieces.size() || m_source.loopOf(i + 1) != m_source.loopOf(i);
         if (isLast) m_features[first].before = i;
         m_features[i].after = isLast ? first : i + 1;
     }
@@ -142,7 +143,26 @@ bool OffsetVerifier::staysAway(const BoundaryPiece& piece, const BoundaryPiece& 
     if (std::fabs(signedDistance(piece.carrier, s.sp)) < least &&
         squared(nearestOn(piece, piece.carrier, s.sp) - s.sp) < least * least)
         return false;
-    if (isBeside(s, f, p)) return true;
+    return isClear(piece, piece.carrier, s, f, p, kHalvings);
+}
+
+/// Whether a part of a piece of the result avoids what lies between the parallels and the normals
+/// of one of the source: as a whole, or by halves.
+bool OffsetVerifier::isClear(const Element& part, const Carrier& carrier, const BoundaryPiece& s,
+                             const Feature& f, const Probe& p, int halvings) const {
+    if (isBeside(s, f, p) || isBeyond(s, p)) return true;
+    if (halvings == 0) return false;
+    const Vec2 m = p.mid;
+    const double half = part.bulge / (1.0 + std::sqrt(1.0 + part.bulge * part.bulge));
+    for (const Element& e : {Element{part.sp, m, half}, Element{m, part.ep, half}}) {
+        if (!isClear(e, carrier, s, f, Probe(e, carrier), halvings - 1)) return false;
+    }
+    return true;
+}
+
+/// Whether a probe lies on the outer side of one of the parallels of a piece.
+bool OffsetVerifier::isBeyond(const BoundaryPiece& s, const Probe& p) const {
+    const double least = m_radius - m_margin;
     const bool isOnRight = sideOf(s.carrier, p.sp).value < 0.0;
     const std::optional<Carrier> limit = parallel(s.carrier, isOnRight ? least : -least);
     if (!limit) return false;
@@ -314,8 +334,8 @@ void OffsetVerifier::findMissing(const Element& wanted, Index feature, int halvi
     if (wanted.sp == wanted.ep) return;
     const Vec2 q = middleOf(wanted);
     const double reach = apart(q, wanted.sp);
-    if (reach < m_radius && m_source.isAnyNear(q, m_radius - reach)) return;
-    if (halvings == 0 || !m_source.isAnyNear(q, m_radius - m_margin)) {
+    if (reach < m_radius && m_source.isAnyNear(q, m_radius - reach, m_guess)) return;
+    if (halvings == 0 || !m_source.isAnyNear(q, m_radius - m_margin, m_guess)) {
         cutMissing(wanted, feature);
         return;
     }
@@ -341,14 +361,14 @@ void OffsetVerifier::cutMissing(const Element& wanted, Index feature) {
     });
 }
 
-bool OffsetVerifier::isMissing(Vec2 q, Vec2 outward, Index feature) const {
+bool OffsetVerifier::isMissing(Vec2 q, Vec2 outward, Index feature) {
     const double behind = kBehind * m_margin;
     const Vec2 p = q + behind * outward;
     const double limit = m_radius + 0.5 * behind;
     // Mostly what cuts a parallel off is the next element or the one before.
     const Feature& f = m_features[feature];
     if (m_source.isNear(f.before, p, limit) || m_source.isNear(f.after, p, limit)) return false;
-    if (m_source.isAnyNear(p, limit)) return false;
+    if (m_source.isAnyNear(p, limit, m_guess)) return false;
     if (m_result.isAnyNear(q, kFound * m_margin)) return false;
     if ((m_source.windingAbout(p) > 0) != (m_distance < 0.0)) return false;
     if (m_options.join != Join::kMiter) return true;

@@ -42,6 +42,9 @@ private:
     void probe(std::size_t piece, std::size_t feature, const Probe& p);
     bool staysAway(const BoundaryPiece& piece, const BoundaryPiece& s, const Feature& f,
                    const Probe& p) const;
+    bool isClear(const Element& part, const Carrier& carrier, const BoundaryPiece& s,
+                 const Feature& f, const Probe& p, int halvings) const;
+    bool isBeyond(const BoundaryPiece& s, const Probe& p) const;
     bool isBeside(const BoundaryPiece& s, const Feature& f, const Probe& p) const;
     bool runsAlong(const BoundaryPiece& s, Feature& f, const Probe& p) const;
     bool runsAbout(const BoundaryPiece& s, Feature& f, const Probe& p) const;
@@ -56,7 +59,7 @@ private:
     bool isHidden(const Element& e, const Carrier& c, Index by) const;
     void findMissing(const Element& wanted, Index feature, int halvings);
     void cutMissing(const Element& wanted, Index feature);
-    bool isMissing(Vec2 q, Vec2 outward, Index feature) const;
+    bool isMissing(Vec2 q, Vec2 outward, Index feature);
 
     double m_distance = 0.0;
     double m_radius = 0.0;  ///< the distance without its sign
@@ -69,6 +72,7 @@ private:
     std::vector<State> m_states;      ///< one a piece of the result
     Cuts m_cuts;
     FaultList* m_faults = nullptr;
+    Index m_guess = kNone;  ///< the piece of the source that was near last
 };
 
 }  // namespace gmregion

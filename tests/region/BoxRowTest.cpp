@@ -84,6 +84,7 @@ TEST(BoxRow, VisitsEveryPairAndEveryBoxThatOverlapsOnce) {
         row.visitPairs([&](std::size_t i, std::size_t j) {
             found.emplace(i, j);
             ++visits;
+            return true;
         });
         EXPECT_EQ(found, overlappingPairs(boxes)) << count;
         EXPECT_EQ(visits, found.size()) << count;

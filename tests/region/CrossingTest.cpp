@@ -185,6 +185,25 @@ TEST(Crossing, CountsWhatLiesOnBothElements) {
     EXPECT_EQ(crossings(upper, Element{{2, 0}, {0, 0}, 1}).size(), 1u) << "of two circles";
 }
 
+/// A step of Newton's method led as far as 0.7 along the common tangent.
+TEST(Crossing, LiesOnBothElementsWhereTheyTouch) {
+    int found = 0;
+    for (int degrees = 0; degrees < 3600; ++degrees) {
+        const double angle = degrees * 0.1 * kPi / 180.0;
+        const Vec2 along{std::cos(angle), std::sin(angle)};
+        const Vec2 m{3.0, 4.0};
+        const Vec2 touch = m + 3.5 * rightNormal(along);
+        const Element half{m - 3.5 * rightNormal(along), touch, 1.0};
+        const Element line{touch, touch + 30.0 * along, 0.0};
+        for (const Vec2 p : crossings(carrierOf(half), carrierOf(line))) {
+            EXPECT_LT(std::fabs(signedDistance(carrierOf(half), p)), 256 * kEpsilon) << degrees;
+            EXPECT_LT(std::fabs(signedDistance(carrierOf(line), p)), 256 * kEpsilon) << degrees;
+            ++found;
+        }
+    }
+    EXPECT_GT(found, 100);
+}
+
 TEST(Carrier, MeasuresAsTheElementDoes) {
     Draw draw(4);
     for (int i = 0; i < 20000; ++i) {

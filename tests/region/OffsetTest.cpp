@@ -49,7 +49,8 @@ int comparePoints(const RegionSet& source, double d, const RegionSet& result, do
     for (int k = 0; k < 40; ++k) {
         const Vec2 p{uniform(engine, -0.3 * size, 1.3 * size),
                      uniform(engine, -0.3 * size, 1.3 * size)};
-        const double away = index.distanceBelow(p, 10 * size);
+        Index guess = kNone;
+        const double away = index.distanceBelow(p, 10 * size, 0.0, guess);
         if (std::fabs(away - std::fabs(d)) < 8 * source.tolerance()) continue;
         const bool inside = winding(source, p) > 0;
         const bool expected = d > 0 ? inside || away < d : inside && away > -d;
@@ -73,8 +74,8 @@ TEST(Offset, AgreesWithDistancesAtRandomPoints) {
 TEST(Offset, ByParallelsIsTheOneByStrips) {
     std::mt19937 engine(6);
     Workspace workspace;
-    OverlayScratch& overlay = workspace.scratch().overlay;
-    OffsetScratch& offsets = workspace.scratch().offset;
+    OverlayScratch& overlay = workspace.begin().overlay;
+    OffsetScratch& offsets = workspace.begin().offset;
     Outcome parallels;
     Outcome strips;
     for (int round = 0; round < 100; ++round) {

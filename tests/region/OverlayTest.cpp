@@ -290,4 +290,98 @@ TEST(Boolean, ElementsKnowWhereTheyComeFrom) {
     }
 }
 
+TEST(CleanUp, RefusesMoreWorkThanAllowedAndGoesOnAfterwards) {
+    Paths heap;
+    std::mt19937 engine(11);
+    heap.add(tangle(engine, 40, 10.0), true);
+    Workspace workspace;
+    Outcome free;
+    ASSERT_TRUE(cleanUp(heap, {}, workspace, free));
+    workspace.setWorkLimit(20);
+    Outcome limited;
+    EXPECT_FALSE(cleanUp(heap, {}, workspace, limited));
+    EXPECT_EQ(limited.refusal.reason, Reason::kWorkLimit);
+    EXPECT_TRUE(limited.regions.empty());
+    workspace.setWorkLimit(1000000);
+    ASSERT_TRUE(cleanUp(heap, {}, workspace, limited));
+    EXPECT_EQ(area(limited.regions), area(free.regions));
+}
+
+/// Loops in a row, and loops in each other: none of them is allowed to cost a look at all others.
+TEST(CleanUp, FindsWindingsAndNestingOfManyLoops) {
+    Paths row;
+    Paths rings;
+    for (int i = 0; i < 300; ++i) {
+        row.add(circle({3.0 * i, 0.0}, 1.0), true);
+        rings.add(circle({0.0, 0.0}, 1.0 + i), true);
+    }
+    EXPECT_EQ(cleaned(row).regionCount(), 300U);
+    const RegionSet nested = cleaned(rings, FillRule::kEvenOdd);
+    EXPECT_EQ(nested.regionCount(), 150U);
+    EXPECT_EQ(nested.loops().size(), 300U);
+    EXPECT_NEAR(area(nested), 3.14159265358979 * (300.0 * 301.0 / 2.0), 1e-5);
+}
+
+/// Where a look for the nesting would meet two loops in one point, or an arc that is flat.
+TEST(CleanUp, NestsLoopsThatTouchAtTheHeightOfTheirMiddle) {
+    struct Case {
+        Elements loop;
+        double area;
+    };
+    const Elements square = rectangle(0, 0, 4, 4);
+    const std::array<Case, 4> cases{{
+        {polygon({{0, 2}, {-2, 1}, {-2, 3}}), 18.0},        // a tip from outside
+        {polygon({{0, 2}, {1, 3}, {2, 2}, {1, 1}}), 14.0},  // the corner of a hole
+        {polygon({{4, 2}, {3, 3}, {2, 2}, {3, 1}}), 14.0},
+        {{{{1, 2}, {2, 2}, 0.05}, {{2, 2}, {1, 2}, 0.05}}, 16.0 - 0.0333499941},  // flat arcs
+    }};
+    for (const Case& c : cases) {
+        for (const double angle : {0.0, 1.5707963267948966, 3.1415926535897931}) {
+            Paths heap;
+            heap.add(placed(square, {}, angle), true);
+            heap.add(placed(c.loop, {}, angle), true);
+            const RegionSet set = cleaned(heap, FillRule::kEvenOdd);
+            EXPECT_EQ(set.loops().size(), 2U) << c.area << " " << angle;
+            EXPECT_NEAR(area(set), c.area, 1e-8) << angle;
+        }
+    }
+    std::mt19937 engine(5);
+    for (int i = 0; i < 300; ++i) {
+        Paths heap;
+        for (int k = 0; k < 6; ++k) {
+            std::vector<Vec2> corners;
+            for (int c = 0; c < 3; ++c)
+                corners.push_back({double(engine() % 7), double(engine() % 7)});
+            heap.add(polygon(corners), true);
+        }
+        const RegionSet set = cleaned(heap, FillRule::kEvenOdd);
+        EXPECT_NEAR(area(set), area(combine(set, set, Combination::kUnion).regions), 1e-8);
+    }
+}
+
+/// Where two crossing sides are there twice, a part of the tolerance apart, their crossings lie
+/// farther apart than the sides.
+TEST(CleanUp, TakesCrossingBarsThatAreThereTwice) {
+    constexpr double kTolerance = 1e-6;
+    std::mt19937 engine(3);
+    for (const double angle : {0.5, 0.2, 0.05, 0.01}) {
+        for (const double apart : {0.02, 0.3, 0.9}) {
+            for (int i = 0; i < 20; ++i) {
+                Paths heap;
+                for (const double turn : {0.0, angle}) {
+                    const Elements bar = placed(rectangle(-5, -0.5, 10, 1), {}, turn);
+                    const double way = apart * kTolerance;
+                    const double to = uniform(engine, 0.0, 6.28);
+                    heap.add(bar, true);
+                    heap.add(placed(bar, {way * std::cos(to), way * std::sin(to)}, 0.0), true);
+                }
+                const RegionSet set = cleaned(heap, FillRule::kNonZero, kTolerance);
+                const double common = std::min(10.0, 1.0 / std::sin(angle));
+                EXPECT_EQ(set.regionCount(), 1U) << angle << " " << apart;
+                EXPECT_LE(area(set), 20.0 - 0.5 * common);
+            }
+        }
+    }
+}
+
 }  // namespace

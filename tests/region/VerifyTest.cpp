@@ -242,6 +242,22 @@ TEST(Verify, AnswersEmptyAndUndefined) {
         EXPECT_EQ(verifyOffset(square, d, square).faults.at(0).kind, FaultKind::kUndefined);
 }
 
+TEST(Verify, TellsWedgesFromSidesThatRunAlong) {
+    const auto wedge = [](double width) {
+        return cleaned({rectangle(-30, 0, 5, 5), shapes::polygon({{0, 0}, {20, 0}, {20, width}})});
+    };
+    const double t = wedge(1.0).tolerance();
+    const RegionSet thin = wedge(1.1 * t);
+    ASSERT_EQ(thin.loops().size(), 2U);
+    EXPECT_TRUE(verifyOffset(thin, 0.0, thin).isSound());
+    LooseLoops along(thin);
+    for (Element& e : along.elements) {
+        for (Vec2* p : {&e.sp, &e.ep})
+            p->y = p->x == 20.0 ? 0.3 * p->y : p->y;
+    }
+    EXPECT_TRUE(found(verified(thin, 0.0, along), FaultKind::kCrossing, {10, 0}, 10));
+}
+
 TEST(Verify, PassesSoundBooleansAlone) {
     std::mt19937 engine(5);
     const Combination all[]{Combination::kUnion, Combination::kIntersection,

@@ -119,11 +119,11 @@ void AddCorner(GmCurve const& before, GmCurve const& after, double d, std::vecto
                          d * kQuarterTurn * in * std::polar(1.0, turn * k / kSamples));
 }
 
-int ExpectRightDistance(GmContour const& source, double d) {
+int ExpectRightDistance(GmContour const& source, Contours const& results, double d) {
     int checked = 0;
     const std::vector<GmPoint> polygon = shapes::Samples(source, 65);
     const bool insideExpected = d * Area(source) < 0;
-    for (GmContour const* result : Results(source)) {
+    for (GmContour const* result : results) {
         for (GmPoint const& p : shapes::Samples(*result, kSamples)) {
             EXPECT_NEAR(DistanceFrom(source, p), std::fabs(d), kAccuracy) << p.GetTraceString();
             const bool rightSide = !source.IsClosed() || IsInside(polygon, p) == insideExpected;
@@ -134,7 +134,7 @@ int ExpectRightDistance(GmContour const& source, double d) {
     return checked;
 }
 
-int ExpectNothingMissing(GmContour const& source, double d) {
+int ExpectNothingMissing(GmContour const& source, Contours const& results, double d) {
     std::vector<Xy> points;
     const int n = static_cast<int>(source.ElementCount());
     for (int i = 0; i < n; ++i) {
@@ -147,7 +147,7 @@ int ExpectNothingMissing(GmContour const& source, double d) {
         const GmPoint p(xy.real(), xy.imag());
         if (DistanceFrom(source, p) < std::fabs(d) - kRounding) continue;
         double nearest = std::numeric_limits<double>::max();
-        for (GmContour const* result : Results(source))
+        for (GmContour const* result : results)
             nearest = std::min(nearest, DistanceFrom(*result, p));
         EXPECT_LT(nearest, kAccuracy) << "missing at " << p.GetTraceString();
         ++checked;
@@ -155,9 +155,9 @@ int ExpectNothingMissing(GmContour const& source, double d) {
     return checked;
 }
 
-int ExpectChains(GmContour const& source) {
+int ExpectChains(GmContour const& source, Contours const& results) {
     int checked = 0;
-    for (GmContour const* result : Results(source)) {
+    for (GmContour const* result : results) {
         const int n = static_cast<int>(result->ElementCount());
         EXPECT_GT(n, 0);
         EXPECT_TRUE(result->IsClosed() || !source.IsClosed());
@@ -188,15 +188,20 @@ double Area(GmContour const& contour) {
     return doubled / 2;
 }
 
-std::vector<GmContour const*> Results(GmContour const& source) {
-    std::vector<GmContour const*> results;
+Contours Results(GmContour const& source) {
+    Contours results;
     for (int i = 0; source.GetSubContour(i) != nullptr; ++i)
         results.push_back(source.GetSubContour(i));
     return results;
 }
 
+int ExpectOffsetLaws(GmContour const& source, Contours const& results, double d) {
+    return ExpectRightDistance(source, results, d) + ExpectNothingMissing(source, results, d) +
+           ExpectChains(source, results);
+}
+
 int ExpectOffsetLaws(GmContour const& source, double d) {
-    return ExpectRightDistance(source, d) + ExpectNothingMissing(source, d) + ExpectChains(source);
+    return ExpectOffsetLaws(source, Results(source), d);
 }
 
 }  // namespace offset_laws

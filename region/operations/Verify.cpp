@@ -2,29 +2,25 @@
 #include "gmregion/Verify.h"
 
 #include <algorithm>
+#include <array>
 #include <cmath>
 
+#include "region/operations/Scratch.h"
 #include "region/verify/BooleanVerifier.h"
-#include "region/verify/LoopCheck.h"
 #include "region/verify/OffsetVerifier.h"
 
 namespace gmregion {
 
 namespace {
 
-/// The loops of a set as a view; owns their ends.
-class SetView {
-public:
-    explicit SetView(const RegionSet& set) : m_set(&set) {
-        for (const Loop& loop : set.loops())
-            m_ends.push_back(loop.last);
-    }
-    LoopsView view() const { return {&m_set->elements(), &m_ends}; }
-
-private:
-    const RegionSet* m_set;
-    std::vector<Index> m_ends;
-};
+/// The loops of a set as a view.
+/// @param ends gets the ends of the loops
+LoopsView viewOf(const RegionSet& set, std::vector<Index>& ends) {
+    ends.clear();
+    for (const Loop& loop : set.loops())
+        ends.push_back(loop.last);
+    return {&set.elements(), &ends};
+}
 
 }  // namespace
 
@@ -62,31 +58,37 @@ const char* textOf(FaultKind kind) {
 
 Verdict verifyOffset(const RegionSet& source, double distance, const RegionSet& result,
                      const OffsetOptions& options) {
+    Workspace workspace;
     Verdict verdict;
+    verifyOffset(source, distance, result, options, workspace, verdict);
+    return verdict;
+}
+
+bool verifyOffset(const RegionSet& source, double distance, const RegionSet& result,
+                  const OffsetOptions& options, Workspace& workspace, Verdict& verdict) {
+    verdict.faults.clear();
+    verdict.count = 0;
     FaultList faults(verdict);
     if (!(std::fabs(distance) <= 1e12)) {
         faults.add(FaultKind::kUndefined, {}, 0.0, 0);
-        return verdict;
+        return false;
     }
-    const SetView sourceView(source);
-    const SetView resultView(result);
-    OffsetVerifier verifier;
-    verifier.verify(sourceView.view(), distance, resultView.view(), options,
-                    std::max(source.tolerance(), result.tolerance()), faults);
-    return verdict;
+    VerifyScratch& scratch = workspace.begin().verify;
+    scratch.offset.verify(viewOf(source, scratch.sourceEnds), distance,
+                          viewOf(result, scratch.resultEnds), options,
+                          std::max(source.tolerance(), result.tolerance()), faults);
+    return verdict.isSound();
 }
 
 Verdict verifyBoolean(const RegionSet& first, const RegionSet& second, Combination combination,
                       const RegionSet& result) {
     Verdict verdict;
     FaultList faults(verdict);
-    const SetView firstView(first);
-    const SetView secondView(second);
-    const SetView resultView(result);
+    std::array<std::vector<Index>, 3> ends;
     const double tolerance = std::max({first.tolerance(), second.tolerance(), result.tolerance()});
     BooleanVerifier verifier;
-    verifier.verify(firstView.view(), secondView.view(), combination, resultView.view(), tolerance,
-                    faults);
+    verifier.verify(viewOf(first, ends[0]), viewOf(second, ends[1]), combination,
+                    viewOf(result, ends[2]), tolerance, faults);
     return verdict;
 }
 
