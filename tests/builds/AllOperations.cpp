@@ -5,7 +5,9 @@
 
 #include "gmregion/Boolean.h"
 #include "gmregion/CleanUp.h"
+#include "gmregion/Clip.h"
 #include "gmregion/Offset.h"
+#include "gmregion/Parallels.h"
 #include "tests/support/RegionShapes.h"
 
 namespace gmregion {
@@ -134,6 +136,18 @@ void callAll(const Sources& sources, Workspace& workspace, ResultBits& bits) {
     for (const End end : {End::kRound, End::kSquare, End::kButt}) {
         thicken(sources.open, 0.2, 0.0, {Join::kRound, end, 3.0}, workspace, outcome);
         bits.add(outcome);
+    }
+    Parallels parallels;
+    for (const double d : kDistances) {
+        makeParallels(sources.open, d, 0.0, {}, workspace, parallels);
+        for (const Element& e : parallels.elements)
+            bits.add(e);
+    }
+    Clipping clipping;
+    for (const RegionSet& set : sources.sets) {
+        clip(sources.open, set, workspace, clipping);
+        for (const Element& e : clipping.elements)
+            bits.add(e);
     }
     for (std::size_t i = 0; i < sources.sets.size(); ++i)
         ask(sources.sets[i], sources.locators[i], bits);

@@ -12,7 +12,10 @@
 
 #include "gmregion/Boolean.h"
 #include "gmregion/CleanUp.h"
+#include "gmregion/Clip.h"
 #include "gmregion/Offset.h"
+#include "gmregion/Parallels.h"
+#include "gmregion/Verify.h"
 #include "tests/builds/AllOperations.h"
 
 namespace {
@@ -113,6 +116,18 @@ TEST_F(Allocations, AreNotMadeByOffsets) {
         };
         EXPECT_EQ(allocationsOfLaterCalls(call), 0U);
     }
+    Parallels parallels;
+    const auto beside = [&] {
+        makeParallels(m_sources.open, 0.2, 0.0, {}, m_workspace, parallels);
+    };
+    EXPECT_EQ(allocationsOfLaterCalls(beside), 0U);
+    Clipping clipping;
+    expectNone("clip",
+               [&](const RegionSet& set) { clip(m_sources.open, set, m_workspace, clipping); });
+    Verdict verdict;
+    expectNone("verify", [&](const RegionSet& set) {
+        verifyOffset(set, 0.0, set, {}, m_workspace, verdict);
+    });
     const double distances[]{0.2, 0.4, -0.2};
     Outcome series[3];
     expectNone("series", [&](const RegionSet& set) {

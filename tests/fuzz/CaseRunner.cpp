@@ -15,8 +15,6 @@ namespace gmregion::fuzz {
 
 namespace {
 
-/// Where an attempt fails, another one is made with half the tolerance.
-constexpr double kRetry = 0.5;
 /// In slacks of operands: what areas of booleans and offsets may be off by. Points move by up to a
 /// tolerance a round, and there are three.
 constexpr double kAreaSlack = 8.0;
@@ -26,11 +24,6 @@ constexpr std::size_t kMostElements = 400;
 constexpr Combination kCombinations[]{Combination::kUnion, Combination::kIntersection,
                                       Combination::kDifference, Combination::kSymmetricDifference};
 
-/// The least length of elements in an offset: small distances go with finer tolerances.
-double shortestOf(const RegionSet& source, double distance) {
-    return kRetry * std::min(source.tolerance(), std::fabs(distance) / 64.0);
-}
-
 /// Whether elements are long enough and nest is asked of the set. Sides within the tolerance of
 /// each other may be left by crossings of either with a third one.
 void complain(const Verdict& verdict, double tolerance, Complaints& complaints) {
@@ -39,21 +32,6 @@ void complain(const Verdict& verdict, double tolerance, Complaints& complaints) 
             fault.kind != FaultKind::kNesting)
             complaints.expect(false, textOf(fault.kind), fault.by / tolerance);
     }
-}
-
-/// In distances: sets of a smaller size may be lost on the way out and back.
-constexpr double kSmall = 1e-6;
-
-/// Whether lengths of a tolerance have digits where an offset of a set lies, and the set is not
-/// small beside the distance.
-bool hasDigits(const RegionSet& set, double tolerance, double distance) {
-    const std::optional<Bounds> box = bounds(set);
-    if (!box) return true;
-    const double largest = std::max({std::fabs(box->low.x), std::fabs(box->low.y),
-                                     std::fabs(box->high.x), std::fabs(box->high.y)});
-    const double size = std::max(box->high.x - box->low.x, box->high.y - box->low.y);
-    return (largest + std::fabs(distance)) * kFinestTolerance <= 8.0 * tolerance &&
-           size >= kSmall * std::fabs(distance);
 }
 
 }  // namespace
@@ -70,10 +48,10 @@ const std::vector<std::string>& CaseRunner::run() {
 }
 
 void CaseRunner::take(const Step& step) {
-    const Made first = m_made[step.first % m_made.size()];
-    const Made second = m_made[step.second % m_made.size()];
+    const RegionSet first = m_made[step.first % m_made.size()];
+    const RegionSet second = m_made[step.second % m_made.size()];
     const Heap& heap = m_case.heaps[step.first % m_case.heaps.size()];
-    if (first.set.elements().size() + second.set.elements().size() > kMostElements) return;
+    if (first.elements().size() + second.elements().size() > kMostElements) return;
     switch (step.task) {
         case Task::kCombine:
             return combineBoth(first, second, step);
@@ -91,7 +69,7 @@ void CaseRunner::take(const Step& step) {
             return openOrClose(first, step.size, false);
         case Task::kQuestions:
             m_complaints.begin("questions");
-            return checkQuestions(first.set, step.at, m_complaints);
+            return checkQuestions(first, step.at, m_complaints);
         case Task::kSimplify:
             return simplifyHeap(heap, step);
         case Task::kSimplifyCurve:
@@ -100,14 +78,14 @@ void CaseRunner::take(const Step& step) {
 }
 
 /// Checks an outcome and keeps its set for the steps to come.
-bool CaseRunner::accept(const Outcome& outcome, bool answered, double shortest) {
+bool CaseRunner::accept(const Outcome& outcome, bool answered) {
     checkOutcome(outcome, answered, m_complaints);
     if (!answered) {
         m_refusals.push_back(outcome.refusal.reason);
         return false;
     }
-    checkSet(outcome.regions, m_sizes, shortest, m_complaints);
-    m_made.push_back({outcome.regions, shortest});
+    checkSet(outcome.regions, m_sizes, m_complaints);
+    m_made.push_back(outcome.regions);
     return true;
 }
 
@@ -117,7 +95,7 @@ void CaseRunner::cleanUpHeap(const Heap& heap) {
     const bool answered = cleanUp(heap.paths, heap.options, m_workspace, outcome);
     m_complaints.expect(isSame(outcome.regions, cleanUp(heap.paths, heap.options).regions),
                         "results do not depend on the workspace");
-    if (accept(outcome, answered, kRetry * outcome.regions.tolerance()))
+    if (accept(outcome, answered))
         cleanUpAgain(outcome.regions);
     else
         m_made.push_back({});  // so that there is something to take for every step
@@ -144,28 +122,27 @@ void CaseRunner::cleanUpAgain(const RegionSet& set) {
                         "it keeps the elements");
 }
 
-void CaseRunner::combineBoth(const Made& a, const Made& b, const Step& step) {
-    const double tolerance = std::max(a.set.tolerance(), b.set.tolerance());
+void CaseRunner::combineBoth(const RegionSet& a, const RegionSet& b, const Step& step) {
+    const double tolerance = std::max(a.tolerance(), b.tolerance());
     std::vector<Outcome> all(std::size(kCombinations));
     std::size_t answers = 0;
     for (std::size_t i = 0; i < all.size(); ++i) {
         m_complaints.begin("boolean");
-        const bool answered = combine(a.set, b.set, kCombinations[i], m_workspace, all[i]);
+        const bool answered = combine(a, b, kCombinations[i], m_workspace, all[i]);
         checkOutcome(all[i], answered, m_complaints);
         if (!answered) {
             m_refusals.push_back(all[i].refusal.reason);
             continue;
         }
         ++answers;
-        checkSet(all[i].regions, m_sizes, kRetry * tolerance, m_complaints);
+        checkSet(all[i].regions, m_sizes, m_complaints);
         m_complaints.begin("verified boolean");
-        complain(verifyBoolean(a.set, b.set, kCombinations[i], all[i].regions), tolerance,
-                 m_complaints);
+        complain(verifyBoolean(a, b, kCombinations[i], all[i].regions), tolerance, m_complaints);
     }
     m_complaints.begin("areas of booleans");
-    if (answers == all.size()) checkAreas(a.set, b.set, all);
+    if (answers == all.size()) checkAreas(a, b, all);
     const Outcome& kept = all[static_cast<unsigned>(step.first + step.second) % all.size()];
-    if (!kept.refusal) m_made.push_back({kept.regions, kRetry * tolerance});
+    if (!kept.refusal) m_made.push_back(kept.regions);
 }
 
 void CaseRunner::checkAreas(const RegionSet& a, const RegionSet& b,
@@ -190,36 +167,36 @@ void CaseRunner::uniteMade() {
     double slack = 0.0;
     double largest = 0.0;
     double sum = 0.0;
-    for (const Made& made : m_made) {
-        tolerance = std::max(tolerance, made.set.tolerance());
-        largest = std::max(largest, area(made.set));
-        sum += area(made.set);
-        slack += perimeter(made.set);
-        sets.push_back(made.set);
+    for (const RegionSet& made : m_made) {
+        tolerance = std::max(tolerance, made.tolerance());
+        largest = std::max(largest, area(made));
+        sum += area(made);
+        slack += perimeter(made);
+        sets.push_back(made);
     }
     Outcome outcome;
     const bool answered = uniteAll(sets.data(), sets.size(), m_workspace, outcome);
-    if (!accept(outcome, answered, kRetry * tolerance)) return;
+    if (!accept(outcome, answered)) return;
     slack = kAreaSlack * tolerance * (slack + kAreaSlack * tolerance);
     const double found = area(outcome.regions);
     m_complaints.expect(found >= largest - slack && found <= sum + slack,
                         "a union covers what its sets cover", (found - largest) / slack);
 }
 
-void CaseRunner::offsetOne(const Made& source, const Step& step) {
+void CaseRunner::offsetOne(const RegionSet& source, const Step& step) {
     m_complaints.begin("offset");
     Outcome outcome;
-    const bool answered = offset(source.set, step.size, step.offset, m_workspace, outcome);
-    m_complaints.expect(isSame(outcome.regions, offset(source.set, step.size, step.offset).regions),
+    const bool answered = offset(source, step.size, step.offset, m_workspace, outcome);
+    m_complaints.expect(isSame(outcome.regions, offset(source, step.size, step.offset).regions),
                         "results do not depend on the workspace");
     checkOffset(source, step.size, step.offset, outcome, answered);
 }
 
-void CaseRunner::offsetMany(const Made& source, const Step& step) {
+void CaseRunner::offsetMany(const RegionSet& source, const Step& step) {
     m_complaints.begin("offset series");
     const std::vector<double> distances{step.size, 2.0 * step.size, -step.size};
     std::vector<Outcome> outcomes(distances.size());
-    const bool answered = offsetSeries(source.set, distances.data(), distances.size(), step.offset,
+    const bool answered = offsetSeries(source, distances.data(), distances.size(), step.offset,
                                        m_workspace, outcomes.data());
     for (std::size_t i = 0; i < distances.size(); ++i) {
         checkOffset(source, distances[i], step.offset, outcomes[i], !outcomes[i].refusal);
@@ -230,18 +207,15 @@ void CaseRunner::offsetMany(const Made& source, const Step& step) {
     m_complaints.expect(answered, "a series without a refusal is answered");
 }
 
-void CaseRunner::checkOffset(const Made& source, double distance, const OffsetOptions& options,
+void CaseRunner::checkOffset(const RegionSet& source, double distance, const OffsetOptions& options,
                              const Outcome& outcome, bool answered) {
-    const bool isCopy = std::fabs(distance) <= 0.5 * source.set.tolerance();
-    const double shortest = isCopy ? source.shortest : shortestOf(source.set, distance);
-    if (!hasDigits(source.set, isCopy ? source.set.tolerance() : shortest, distance)) return;
-    if (!accept(outcome, answered, shortest)) return;
-    const double slack = kAreaSlack * (slackOf(source.set) + slackOf(outcome.regions));
-    const double growth = area(outcome.regions) - area(source.set);
+    if (!accept(outcome, answered)) return;
+    const double slack = kAreaSlack * (slackOf(source) + slackOf(outcome.regions));
+    const double growth = area(outcome.regions) - area(source);
     m_complaints.expect(distance < 0.0 ? growth <= slack : growth >= -slack,
                         "outward grows, inward shrinks", growth / slack);
     m_complaints.begin("verified offset");
-    complain(verifyOffset(source.set, distance, outcome.regions, options), source.set.tolerance(),
+    complain(verifyOffset(source, distance, outcome.regions, options), source.tolerance(),
              m_complaints);
 }
 
@@ -251,21 +225,17 @@ void CaseRunner::thickenHeap(const Heap& heap, const Step& step) {
     Outcome outcome;
     const bool answered =
         thicken(heap.paths, step.size, tolerance, step.offset, m_workspace, outcome);
-    const double shortest = shortestOf(outcome.regions, step.size);
-    if (hasDigits(outcome.regions, shortest, step.size)) accept(outcome, answered, shortest);
+    accept(outcome, answered);
 }
 
-void CaseRunner::openOrClose(const Made& source, double radius, bool opens) {
+void CaseRunner::openOrClose(const RegionSet& source, double radius, bool opens) {
     m_complaints.begin(opens ? "opening" : "closing");
     Outcome outcome;
-    const bool answered = opens ? opened(source.set, radius, m_workspace, outcome)
-                                : closed(source.set, radius, m_workspace, outcome);
-    const bool isCopy = std::fabs(radius) <= 0.5 * source.set.tolerance();
-    const double shortest = isCopy ? source.shortest : shortestOf(source.set, radius);
-    if (!hasDigits(source.set, isCopy ? source.set.tolerance() : shortest, radius)) return;
-    if (!accept(outcome, answered, shortest)) return;
-    const double slack = kAreaSlack * (slackOf(source.set) + slackOf(outcome.regions));
-    const double growth = area(outcome.regions) - area(source.set);
+    const bool answered = opens ? opened(source, radius, m_workspace, outcome)
+                                : closed(source, radius, m_workspace, outcome);
+    if (!accept(outcome, answered)) return;
+    const double slack = kAreaSlack * (slackOf(source) + slackOf(outcome.regions));
+    const double growth = area(outcome.regions) - area(source);
     m_complaints.expect(opens ? growth <= slack : growth >= -slack,
                         "opening takes away, closing adds", growth / slack);
 }

@@ -24,25 +24,19 @@ public:
     const std::vector<Reason>& refusals() const { return m_refusals; }
 
 private:
-    /// A set that was made, and the least length of its elements.
-    struct Made {
-        RegionSet set;
-        double shortest = 0.0;
-    };
-
     void cleanUpHeap(const Heap& heap);
     void cleanUpAgain(const RegionSet& set);
     void take(const Step& step);
-    bool accept(const Outcome& outcome, bool answered, double shortest);
-    void combineBoth(const Made& a, const Made& b, const Step& step);
+    bool accept(const Outcome& outcome, bool answered);
+    void combineBoth(const RegionSet& a, const RegionSet& b, const Step& step);
     void checkAreas(const RegionSet& a, const RegionSet& b, const std::vector<Outcome>& all);
     void uniteMade();
-    void offsetOne(const Made& source, const Step& step);
-    void offsetMany(const Made& source, const Step& step);
-    void checkOffset(const Made& source, double distance, const OffsetOptions& options,
+    void offsetOne(const RegionSet& source, const Step& step);
+    void offsetMany(const RegionSet& source, const Step& step);
+    void checkOffset(const RegionSet& source, double distance, const OffsetOptions& options,
                      const Outcome& outcome, bool answered);
     void thickenHeap(const Heap& heap, const Step& step);
-    void openOrClose(const Made& source, double radius, bool opens);
+    void openOrClose(const RegionSet& source, double radius, bool opens);
     void simplifyHeap(const Heap& heap, const Step& step);
     void simplifyPoints(const Heap& heap, const Step& step);
 
@@ -51,7 +45,7 @@ private:
     Complaints m_complaints;
     std::vector<Reason> m_refusals;
     Workspace m_workspace;
-    std::vector<Made> m_made;
+    std::vector<RegionSet> m_made;
 };
 
 }  // namespace gmregion::fuzz

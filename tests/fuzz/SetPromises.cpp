@@ -55,7 +55,7 @@ void checkOrigins(const RegionSet& set, const PathSizes& sizes, Complaints& comp
     }
 }
 
-void checkLoop(const RegionSet& set, std::size_t number, double shortest, Complaints& complaints) {
+void checkLoop(const RegionSet& set, std::size_t number, Complaints& complaints) {
     const Loop& loop = set.loops()[number];
     const std::vector<Element>& elements = set.elements();
     complaints.expect(loop.last - loop.first >= 2, "a loop has two elements at least");
@@ -65,8 +65,8 @@ void checkLoop(const RegionSet& set, std::size_t number, double shortest, Compla
         if (!complaints.expect(isFinite(e), "numbers are finite")) return;
         complaints.expect(sameBits(before.ep, e.sp), "a loop is closed bit by bit");
         const double length = lengthAlong(e);
-        complaints.expect(length >= shortest, "no element is shorter than the tolerance",
-                          length / shortest);
+        complaints.expect(length >= set.tolerance(), "no element is shorter than the tolerance",
+                          length / set.tolerance());
     }
     // Of what is hardly wider than the tolerance rounding decides the sense.
     const double sense = loop.hole ? -1.0 : 1.0;
@@ -165,11 +165,10 @@ void checkOutcome(const Outcome& outcome, bool answered, Complaints& complaints)
     complaints.expect(outcome.marginal.empty(), "a refusal goes without marginal points");
 }
 
-void checkSet(const RegionSet& set, const PathSizes& sizes, double shortest,
-              Complaints& complaints) {
+void checkSet(const RegionSet& set, const PathSizes& sizes, Complaints& complaints) {
     checkOrder(set, complaints);
     for (std::size_t i = 0; i < set.loops().size(); ++i)
-        checkLoop(set, i, shortest, complaints);
+        checkLoop(set, i, complaints);
     checkOrigins(set, sizes, complaints);
     checkSides(set, complaints);
 }

@@ -32,8 +32,6 @@ void checkOutcome(const Outcome& outcome, bool answered, Complaints& complaints)
 /// What every set must hold: numbers are finite, loops close bit by bit and have their sense, each
 /// outline stands before its holes, origins name elements that there are, and what lies on the left
 /// of every element is covered.
-/// @param shortest the least length of an element
-void checkSet(const RegionSet& set, const PathSizes& sizes, double shortest,
-              Complaints& complaints);
+void checkSet(const RegionSet& set, const PathSizes& sizes, Complaints& complaints);
 
 }  // namespace gmregion::fuzz
