@@ -15,6 +15,7 @@
 #include "region/plane/Apart.h"
 #include "region/plane/Crossing.h"
 #include "region/plane/ElementBox.h"
+#include "region/plane/ElementWinding.h"
 #include "region/plane/Nearest.h"
 
 namespace gmregion {
@@ -153,13 +154,15 @@ void Meetings::meet(Index i, Index j) {
     if (!thenA && !thenB && areApart(carrier(i), boxOf(i), carrier(j), boxOf(j), m_tolerance))
         return;
     const std::size_t before = m_found.size();
+    m_contacts.clear();
     const bool endsOfA = stopAtEnds(i, j);
     const bool endsOfB = stopAtEnds(j, i);
     const bool straight = a.bulge == 0.0 && b.bulge == 0.0;
     const bool backAndForth = a.sp == b.ep && a.ep == b.sp;
     if (backAndForth && (thenA || thenB)) meetBackAndForth(i, j);
     if (backAndForth || (a.sp == b.sp && a.ep == b.ep)) return;
-    if (!straight || !(thenA || thenB || (endsOfA && endsOfB))) meetBetween(i, j, thenA || thenB);
+    const bool isAlong = straight ? thenA || thenB || (endsOfA && endsOfB) : runAlong(i, j);
+    if (!isAlong) meetBetween(i, j, thenA || thenB);
     if (m_found.size() == before) return;
     // Neighbours that meet again lie side by side from there to their common end, which is where
     // they turn back.
@@ -176,6 +179,20 @@ void Meetings::meetBackAndForth(Index i, Index j) {
     m_turnsBack = m_turnsBack || m_isMet[i] == 0 || m_isMet[j] == 0;
     m_isMet[i] = 1;
     m_isMet[j] = 1;
+}
+
+/// Whether two elements lie beside each other from one end that is on both to another one: then
+/// they have nothing else in common, and where within the tolerance they cross says nothing.
+bool Meetings::runAlong(Index i, Index j) {
+    if (m_contacts.size() < 2) return false;
+    const Vec2 from = m_contacts.front();
+    Vec2 to = from;
+    for (const Vec2 p : m_contacts) {
+        if (squaredLength(p - from) > squaredLength(to - from)) to = p;
+    }
+    if (squaredLength(to - from) <= m_tolerance * m_tolerance) return false;
+    const Vec2 middle = middleOf({from, to, bulgeBetween(carrier(i), from, to)});
+    return isNear(carrier(j), middle);
 }
 
 /// Lets elements stop where they cross, or where they come nearest.
@@ -232,6 +249,7 @@ bool Meetings::stopAtEnds(Index ends, Index on) {
         const Index v = atEnd ? m_endVertex[ends] : ends;
         if (isVertexOf(v, on)) continue;
         if (p == e.sp || p == e.ep) {
+            m_contacts.push_back(p);
             m_isMet[v] = 1;
             m_isMet[p == e.sp ? on : m_endVertex[on]] = 1;
             any = true;
@@ -240,6 +258,7 @@ bool Meetings::stopAtEnds(Index ends, Index on) {
         if (!isNear(carrier(on), p)) continue;
         if (squaredLength(nearestOn(e, carrier(on), p) - p) > m_tolerance * m_tolerance) continue;
         m_isMet[v] = 1;
+        m_contacts.push_back(p);
         addStop(on, v, p);
         any = true;
     }

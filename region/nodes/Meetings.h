@@ -70,6 +70,7 @@ private:
     void meetBetween(Index i, Index j, bool areNeighbours);
     bool stopAtEnds(Index ends, Index on);
     void stopBoth(Index i, Index j, Vec2 p);
+    bool runAlong(Index i, Index j);
     bool isNear(const Carrier& c, Vec2 p) const;
     bool isNearCommonEnd(const Element& a, const Element& b, Vec2 p) const;
     bool isVertexOf(Index v, Index element) const {
@@ -86,6 +87,7 @@ private:
     bool m_turnsBack = false;
     BoxRow m_boxes;
     BoxRow m_otherBoxes;
+    std::vector<Vec2> m_contacts;     ///< of the pair in hand, ends that are on both
     std::vector<Carrier> m_carriers;  ///< of elements that were asked for it
     std::vector<std::uint8_t> m_hasCarrier;
     std::vector<Index> m_endVertex;

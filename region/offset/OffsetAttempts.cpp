@@ -4,8 +4,8 @@
 ///
 /// Round joins and ends go by raw parallels. Should the result not pass its check, the same is
 /// tried without trimmed neighbours, then a third of a tolerance beside the distance, where no
-/// threshold is the same, then as a union of strips, and at last so with parts of the tolerance.
-/// Other joins and ends are unions of strips from the start.
+/// threshold is the same, then with parts of the tolerance, then as a union of strips, and at last
+/// so with parts of the tolerance. Other joins and ends are unions of strips from the start.
 #include "region/offset/OffsetAttempts.h"
 
 #include <algorithm>
@@ -51,15 +51,19 @@ const MadeOf* offsetInAttempts(OverlayScratch& scratch, OffsetScratch& offsets,
     const double fine = std::max(std::min(tolerance, std::fabs(distance) * kCoarsest),
                                  finestFor(offsets.source, distance));
     const double beside = distance + (distance > 0.0 ? kBeside * fine : -kBeside * fine);
-    const auto byParallels = [&](double d, bool trims) {
-        return roundOffset(scratch, offsets, origins, d, fine, trims, outcome);
+    const auto byParallels = [&](double d, double share, bool trims) {
+        return roundOffset(scratch, offsets, origins, d, share * fine, trims, outcome);
     };
     const auto byStrips = [&](double d, double share) {
         return stripOffset(scratch, offsets, origins, d, share * fine, options, outcome);
     };
-    if (isRound(options, isOpen) &&
-        (byParallels(distance, true) || byParallels(distance, false) || byParallels(beside, false)))
-        return &offsets.raw.madeOf();
+    if (isRound(options, isOpen)) {
+        bool isMade = byParallels(distance, 1.0, true) || byParallels(distance, 1.0, false);
+        isMade = isMade || byParallels(beside, 1.0, false);
+        for (std::size_t i = 0; !isMade && i < kFinerShares.size(); ++i)
+            isMade = byParallels(beside, kFinerShares[i], false);
+        if (isMade) return &offsets.raw.madeOf();
+    }
     bool isMade = byStrips(distance, 1.0);
     for (std::size_t i = 0; !isMade && i < kFinerShares.size(); ++i)
         isMade = byStrips(beside, kFinerShares[i]);
