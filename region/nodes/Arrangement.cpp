@@ -22,6 +22,8 @@ namespace gmregion {
 namespace {
 
 constexpr int kRounds = 3;
+/// In tolerances: arcs of a longer chord keep their height, however small.
+constexpr double kShort = 4.0;
 
 /// The part of an element between two points of it, or of one that was bent a little.
 StrandElement part(const StrandElement& e, Vec2 from, Vec2 to) {
@@ -31,6 +33,16 @@ StrandElement part(const StrandElement& e, Vec2 from, Vec2 to) {
     if (e.bulge == 0.0 || (from == e.sp && to == e.ep)) return piece;
     piece.bulge = bulgeBetween(carrierOf(e), from, to);
     return piece;
+}
+
+/// Short arcs within the tolerance of their chord become segments: next to what nodes have moved,
+/// their directions at the ends say nothing, and may turn a corner inside out.
+StrandElement flattened(StrandElement e, double tolerance) {
+    const Vec2 chord = e.ep - e.sp;
+    const double squared = dot(chord, chord);
+    const bool isShort = squared <= kShort * kShort * tolerance * tolerance;
+    if (isShort && 0.25 * e.bulge * e.bulge * squared <= tolerance * tolerance) e.bulge = 0.0;
+    return e;
 }
 
 }  // namespace
@@ -137,8 +149,8 @@ void Arrangement::cutStrand(const Strand& strand) {
 }
 
 void Arrangement::cutFreeStrand(const Strand& strand) {
-    const auto first = m_in.elements.begin() + strand.first;
-    m_out.elements.insert(m_out.elements.end(), first, m_in.elements.begin() + strand.last);
+    for (Index i = strand.first; i < strand.last; ++i)
+        m_out.elements.push_back(flattened(m_in.elements[i], m_tolerance));
     m_runs.push_back(
         {kNone, kNone, m_runFirst, static_cast<Index>(m_out.elements.size()), m_weight});
 }
@@ -159,7 +171,7 @@ void Arrangement::cutElement(Index element, Index firstStop, Index lastStop) {
 void Arrangement::advance(Index element, Vec2 to, Index node) {
     if (node != kNone && node == m_node && m_out.elements.size() == m_runFirst) return;
     const StrandElement& e = m_in.elements[element];
-    m_out.elements.push_back(part(e, m_at, to));
+    m_out.elements.push_back(flattened(part(e, m_at, to), m_tolerance));
     m_movedOut.resize(m_out.elements.size(), 0);
     if (hasMoved(e, e.sp, m_at) || hasMoved(e, e.ep, to)) m_movedOut.back() = 1;
     m_at = to;

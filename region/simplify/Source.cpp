@@ -73,6 +73,7 @@ Refusal measure(const Paths& paths, double& largest) {
                 largest = std::max({largest, std::fabs(p.x), std::fabs(p.y)});
             }
             if (!std::isfinite(e.bulge)) return {Reason::kNotFinite, e.sp, i};
+            if (std::fabs(e.bulge) > kLargest) return {Reason::kOutOfRange, e.sp, i};
         }
     }
     return {};

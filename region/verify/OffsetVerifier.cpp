@@ -255,8 +255,8 @@ void OffsetVerifier::judgePart(const BoundaryPiece& piece, Vec2 from, Vec2 q, Ve
 /// Whether a point of the source is a corner that the result may cut off, nearer than the distance.
 bool OffsetVerifier::isCutOff(const BoundaryIndex::Near& near) const {
     const BoundaryPiece& s = m_source.pieces()[near.piece];
-    return (near.at == s.sp && isCutOff(near.piece)) ||
-           (near.at == s.ep && isCutOff(m_features[near.piece].after));
+    return (apart(near.at, s.sp) <= m_tolerance && isCutOff(near.piece)) ||
+           (apart(near.at, s.ep) <= m_tolerance && isCutOff(m_features[near.piece].after));
 }
 
 /// The same for the start of a piece: corners that open, with miters those beyond the limit.
