@@ -34,6 +34,22 @@ void complain(const Verdict& verdict, double tolerance, Complaints& complaints) 
     }
 }
 
+/// In distances: sets of a smaller size may be lost on the way out and back.
+constexpr double kSmall = 1e-6;
+/// Up to here numbers are far from the largest that are taken.
+constexpr double kFar = 1e9;
+
+double sizeOf(const RegionSet& set) {
+    const std::optional<Bounds> box = bounds(set);
+    return box ? std::max(box->high.x - box->low.x, box->high.y - box->low.y) : 0.0;
+}
+
+/// Whether a set is neither small beside a distance nor out of the usual range.
+bool isUsual(const RegionSet& set, double distance) {
+    const double size = sizeOf(set);
+    return set.empty() || (size >= kSmall * std::fabs(distance) && size <= kFar);
+}
+
 }  // namespace
 
 CaseRunner::CaseRunner(const FuzzCase& fuzzCase)
@@ -115,7 +131,7 @@ void CaseRunner::cleanUpAgain(const RegionSet& set) {
     const double change = std::fabs(area(again.regions) - area(set));
     if (answered) m_complaints.expect(change <= slack, "it keeps the area", change / slack);
     // A default tolerance may be the least that is allowed, up to rounding.
-    if (again.refusal.reason == Reason::kTolerance || !isRoomy(set)) return;
+    if (again.refusal.reason == Reason::kTolerance || !isRoomy(set) || !isUsual(set, 0.0)) return;
     m_complaints.expect(answered, "it is not refused");
     m_complaints.expect(again.regions.loops().size() == set.loops().size(), "it keeps the loops");
     m_complaints.expect(again.regions.elements().size() == set.elements().size(),
@@ -209,7 +225,7 @@ void CaseRunner::offsetMany(const RegionSet& source, const Step& step) {
 
 void CaseRunner::checkOffset(const RegionSet& source, double distance, const OffsetOptions& options,
                              const Outcome& outcome, bool answered) {
-    if (!accept(outcome, answered)) return;
+    if (!accept(outcome, answered) || !isUsual(source, distance)) return;
     const double slack = kAreaSlack * (slackOf(source) + slackOf(outcome.regions));
     const double growth = area(outcome.regions) - area(source);
     m_complaints.expect(distance < 0.0 ? growth <= slack : growth >= -slack,
@@ -233,7 +249,7 @@ void CaseRunner::openOrClose(const RegionSet& source, double radius, bool opens)
     Outcome outcome;
     const bool answered = opens ? opened(source, radius, m_workspace, outcome)
                                 : closed(source, radius, m_workspace, outcome);
-    if (!accept(outcome, answered)) return;
+    if (!accept(outcome, answered) || !isUsual(source, radius)) return;
     const double slack = kAreaSlack * (slackOf(source) + slackOf(outcome.regions));
     const double growth = area(outcome.regions) - area(source);
     m_complaints.expect(opens ? growth <= slack : growth >= -slack,

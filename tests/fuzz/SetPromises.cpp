@@ -91,6 +91,13 @@ void checkOrder(const RegionSet& set, Complaints& complaints) {
     complaints.expect(outlines == set.regionCount(), "regions are counted by outlines");
 }
 
+/// Whether another element comes near a point of one.
+bool isBesideAnother(const RegionSet& set, const Element& e, Point p, double near) {
+    return std::any_of(set.elements().begin(), set.elements().end(), [&](const Element& other) {
+        return &other != &e && shapes::distanceFrom({other}, p) <= near;
+    });
+}
+
 /// Asks beside the middle of each element, where nothing else is near: what lies on its left must
 /// be covered once, what lies on its right not at all. So crossings, doubled loops and loops that
 /// do not nest are seen.
@@ -99,6 +106,7 @@ void checkSides(const RegionSet& set, Complaints& complaints) {
     const double away = 2.0 * set.tolerance();
     for (const Element& e : set.elements()) {
         const Point m = middleOf(e);
+        if (isBesideAnother(set, e, m, 4.0 * away)) continue;
         const Carrier carrier = carrierOf(halved(e).second);
         for (const double side : {1.0, -1.0}) {
             const Point p = m + side * away * carrier.normal;
