@@ -14,7 +14,7 @@ packages=(
 )
 case "${1:-}" in
     "") ;;
-    --ci) packages+=(clang clang-format clang-tidy doxygen libxml2-utils valgrind) ;;
+    --ci) packages+=(clang clang-format clang-tidy doxygen libclang-rt-dev libxml2-utils valgrind) ;;
     *) echo "usage: $0 [--ci]" >&2; exit 2 ;;
 esac
 
