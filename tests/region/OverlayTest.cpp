@@ -3,6 +3,7 @@
 
 #include <algorithm>
 #include <array>
+#include <chrono>
 #include <cmath>
 #include <limits>
 #include <random>
@@ -25,10 +26,10 @@ RegionSet cleaned(const Paths& paths, FillRule rule = FillRule::kNonZero, double
     return outcome.regions;
 }
 
-RegionSet cleaned(const Elements& loop) {
+RegionSet cleaned(const Elements& loop, double tolerance = 0.0) {
     Paths paths;
     paths.add(loop, true);
-    return cleaned(paths);
+    return cleaned(paths, FillRule::kNonZero, tolerance);
 }
 
 /// The areas of all four combinations, in their order.
@@ -246,6 +247,51 @@ TEST(Boolean, HoldsWhereSidesNearlyCoincide) {
             }
         }
     }
+}
+
+/// At the coarser tolerance the finer set has elements that are too short and sides that are too
+/// near.
+TEST(Boolean, OfUnlikeTolerancesLeavesNothingThin) {
+    for (unsigned seed = 0; seed < 150; ++seed) {
+        std::mt19937 engine(seed);
+        const RegionSet coarse = cleaned(tangle(engine, 10, 10.0), 1e-2);
+        const RegionSet fine = cleaned(tangle(engine, 16, 10.0), 1e-9);
+        for (const auto combination : {Combination::kUnion, Combination::kDifference}) {
+            const Outcome outcome = combine(coarse, fine, combination);
+            ASSERT_FALSE(outcome.refusal) << seed;
+            const RegionSet& set = outcome.regions;
+            for (const Element& e : set.elements())
+                EXPECT_GE(lengthAlong(e), set.tolerance()) << seed;
+            for (const Loop& loop : set.loops()) {
+                double twice = 0.0;
+                double length = 0.0;
+                for (std::uint32_t i = loop.first; i < loop.last; ++i) {
+                    twice += sweptTwice(set.elements()[i], set.elements()[loop.first].sp);
+                    length += lengthAlong(set.elements()[i]);
+                }
+                EXPECT_GT(std::fabs(twice), 0.02 * set.tolerance() * length) << seed;
+            }
+        }
+    }
+}
+
+/// Loops in any order cost about what loops in rows do.
+TEST(CleanUp, TakesShuffledLoopsAsQuicklyAsRows) {
+    std::vector<Vec2> centres;
+    for (int i = 0; i < 90 * 90; ++i)
+        centres.push_back({3.0 * (i % 90), 3.0 * (i / 90)});
+    const auto secondsFor = [&] {
+        Paths heap;
+        for (const Vec2 m : centres)
+            heap.add(circle(m, 1), true);
+        const auto start = std::chrono::steady_clock::now();
+        EXPECT_EQ(cleaned(heap).regionCount(), centres.size());
+        return std::chrono::duration<double>(std::chrono::steady_clock::now() - start).count();
+    };
+    const double inRows = secondsFor();
+    std::mt19937 engine(1);
+    std::shuffle(centres.begin(), centres.end(), engine);
+    EXPECT_LT(secondsFor(), 8.0 * inRows);
 }
 
 TEST(Boolean, ManyAtOnceAreWhatOneAfterTheOtherIs) {
