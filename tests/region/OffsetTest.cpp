@@ -136,7 +136,7 @@ TEST(Offset, OfRoundedPlatesComesOutByParallelsAtOnce) {
             EXPECT_TRUE(
                 roundOffset(overlay, offsets, origins, d, source.tolerance(), true, outcome));
             // Tangents stay joined, where the bends that rounding leaves are small enough.
-            const std::size_t corners = decimals < 5 ? 4 : 0;
+            const std::size_t corners = decimals < 6 ? 4 : 0;
             EXPECT_LE(outcome.regions.elements().size(), source.elements().size() + corners);
         }
     }
