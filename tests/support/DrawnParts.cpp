@@ -184,7 +184,9 @@ DrawnPart regularPolygon(int count) {
     std::vector<Vec2> points;
     for (int i = 0; i < count; ++i)
         points.push_back(polar({}, 50, 2.0 * kPi * i / count));
-    return {"polygon of " + std::to_string(count) + " corners", {polygon(points)}, {count > 360 ? 10.0 : 50.0}};
+    return {"polygon of " + std::to_string(count) + " corners",
+            {polygon(points)},
+            {count > 360 ? 10.0 : 50.0}};
 }
 
 double roundingOf(const Drawing& drawing) {
