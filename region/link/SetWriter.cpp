@@ -102,6 +102,7 @@ bool SetWriter::sameOrigins(const Item& a, const Item& b) const {
 /// close a loop; the items are spoilt then.
 bool SetWriter::join() {
     const std::size_t count = m_items.size();
+    if (count == 0) return true;
     std::size_t start = 0;
     while (start < count && joins(m_items[(start + count - 1) % count], m_items[start]))
         ++start;
@@ -133,11 +134,11 @@ bool SetWriter::returns(const Element& there, const Element& back) const {
 /// being joined.
 void SetWriter::dropSpikes() {
     std::size_t kept = 0;
-    for (std::size_t i = 0; i < m_items.size(); ++i) {
-        if (kept > 0 && returns(m_items[kept - 1].element, m_items[i].element))
+    for (const Item& item : m_items) {
+        if (kept > 0 && returns(m_items[kept - 1].element, item.element))
             --kept;
         else
-            m_items[kept++] = m_items[i];
+            m_items[kept++] = item;
     }
     std::size_t first = 0;
     while (kept > first + 1 && returns(m_items[kept - 1].element, m_items[first].element)) {

@@ -154,10 +154,10 @@ bool OffsetVerifier::isClear(const Element& part, const Carrier& carrier, const 
     if (halvings == 0) return false;
     const Vec2 m = p.mid;
     const double half = part.bulge / (1.0 + std::sqrt(1.0 + part.bulge * part.bulge));
-    for (const Element& e : {Element{part.sp, m, half}, Element{m, part.ep, half}}) {
-        if (!isClear(e, carrier, s, f, Probe(e, carrier), halvings - 1)) return false;
-    }
-    return true;
+    const auto isHalfClear = [&](const Element& e) {
+        return isClear(e, carrier, s, f, Probe(e, carrier), halvings - 1);
+    };
+    return isHalfClear({part.sp, m, half}) && isHalfClear({m, part.ep, half});
 }
 
 /// Whether a probe lies on the outer side of one of the parallels of a piece.

@@ -181,6 +181,13 @@ TEST(NearCoincidence, ArcsAlmostFullFlatAndOfTheDistance) {
 }
 
 TEST(NearCoincidence, TinyElementsBesideLargeOnesAndFarAway) {
+    // An arc hardly longer than the tolerance, in a corner that it would turn inside out.
+    const Elements corner{
+        {{20, 20}, {20, 6.75}, 0},
+        {{20, 6.75}, {20.000000014901161, 6.7499999962747097}, -2.4142135623730949},
+        {{20.000000014901161, 6.7499999962747097}, {20, 20}, 0.41421356237309503}};
+    const Elements without{{{20, 20}, {20, 6.75}, 0}, {{20, 6.75}, {20, 20}, 0.41421356237309503}};
+    EXPECT_NEAR(area(offsetOf(cleaned(corner), 20)), area(offsetOf(cleaned(without), 20)), 1e-5);
     // A nick of a billionth in a side of a thousand.
     const Elements nicked = polygon({{0, 0},
                                      {500, 0},
