@@ -9,7 +9,7 @@ packages=(
     libboost-dev libwxgtk3.2-dev          # the library
     libdxflib-dev libcli11-dev            # gmpath
     libutfcpp-dev                         # gmpath and the examples
-    libgtest-dev librapidcheck-dev        # tests
+    libgtest-dev librapidcheck-dev libgeos-dev  # tests
     libbenchmark-dev                      # benchmarks
 )
 case "${1:-}" in
