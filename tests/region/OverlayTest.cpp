@@ -249,28 +249,37 @@ TEST(Boolean, HoldsWhereSidesNearlyCoincide) {
     }
 }
 
+/// Expects no element below the tolerance, and no loop without area.
+void expectNothingThin(const RegionSet& set) {
+    for (const Element& e : set.elements())
+        EXPECT_GE(lengthAlong(e), set.tolerance());
+    for (const Loop& loop : set.loops()) {
+        double twice = 0.0;
+        double length = 0.0;
+        for (std::uint32_t i = loop.first; i < loop.last; ++i) {
+            twice += sweptTwice(set.elements()[i], set.elements()[loop.first].sp);
+            length += lengthAlong(set.elements()[i]);
+        }
+        EXPECT_GT(std::fabs(twice), 0.02 * set.tolerance() * length);
+    }
+}
+
 /// At the coarser tolerance the finer set has elements that are too short and sides that are too
-/// near.
+/// near. In the last of these cases joined pieces come to go there and back.
 TEST(Boolean, OfUnlikeTolerancesLeavesNothingThin) {
-    for (unsigned seed = 0; seed < 150; ++seed) {
+    for (unsigned seed = 600; seed < 700; ++seed) {
+        SCOPED_TRACE(seed);
         std::mt19937 engine(seed);
-        const RegionSet coarse = cleaned(tangle(engine, 10, 10.0), 1e-2);
-        const RegionSet fine = cleaned(tangle(engine, 16, 10.0), 1e-9);
+        const double toleranceOfA = std::pow(10.0, uniform(engine, -9, -2));
+        const double toleranceOfB = std::pow(10.0, uniform(engine, -9, -2));
+        const std::size_t count = 8 + engine() % 10;
+        const RegionSet a = cleaned(tangle(engine, count, 10.0), toleranceOfA);
+        const std::size_t other = 8 + engine() % 10;
+        const RegionSet b = cleaned(tangle(engine, other, 10.0), toleranceOfB);
         for (const auto combination : {Combination::kUnion, Combination::kDifference}) {
-            const Outcome outcome = combine(coarse, fine, combination);
-            ASSERT_FALSE(outcome.refusal) << seed;
-            const RegionSet& set = outcome.regions;
-            for (const Element& e : set.elements())
-                EXPECT_GE(lengthAlong(e), set.tolerance()) << seed;
-            for (const Loop& loop : set.loops()) {
-                double twice = 0.0;
-                double length = 0.0;
-                for (std::uint32_t i = loop.first; i < loop.last; ++i) {
-                    twice += sweptTwice(set.elements()[i], set.elements()[loop.first].sp);
-                    length += lengthAlong(set.elements()[i]);
-                }
-                EXPECT_GT(std::fabs(twice), 0.02 * set.tolerance() * length) << seed;
-            }
+            const Outcome outcome = combine(a, b, combination);
+            ASSERT_FALSE(outcome.refusal);
+            expectNothingThin(outcome.regions);
         }
     }
 }
