@@ -15,7 +15,6 @@
 #include "region/plane/Apart.h"
 #include "region/plane/Crossing.h"
 #include "region/plane/ElementBox.h"
-#include "region/plane/ElementWinding.h"
 #include "region/plane/Nearest.h"
 
 namespace gmregion {
@@ -164,8 +163,8 @@ void Meetings::meet(Index i, Index j) {
     const bool backAndForth = a.sp == b.ep && a.ep == b.sp;
     if (backAndForth && (thenA || thenB)) meetBackAndForth(i, j);
     if (backAndForth || (a.sp == b.sp && a.ep == b.ep)) return;
-    const bool isAlong = straight ? thenA || thenB || (endsOfA && endsOfB) : runAlong(i, j);
-    if (!isAlong) meetBetween(i, j, thenA || thenB);
+    const bool areDone = straight ? thenA || thenB || (endsOfA && endsOfB) : meetInTwoEnds();
+    if (!areDone) meetBetween(i, j, thenA || thenB);
     if (m_found.size() == before) {
         if (m_reach > m_tolerance && !thenA && !thenB) noteNearMiss(i, j);
         return;
@@ -205,18 +204,12 @@ void Meetings::noteNearMiss(Index i, Index j) {
         m_nearMisses.push_back(*p);
 }
 
-/// Whether two elements lie beside each other from one end that is on both to another one: then
-/// they have nothing else in common, and where within the tolerance they cross says nothing.
-bool Meetings::runAlong(Index i, Index j) {
-    if (m_contacts.size() < 2) return false;
-    const Vec2 from = m_contacts.front();
-    Vec2 to = from;
-    for (const Vec2 p : m_contacts) {
-        if (squaredLength(p - from) > squaredLength(to - from)) to = p;
-    }
-    if (squaredLength(to - from) <= m_tolerance * m_tolerance) return false;
-    const Vec2 middle = middleOf({from, to, bulgeBetween(carrier(i), from, to)});
-    return isNear(carrier(j), middle);
+/// Whether ends at two places are on both of two elements. Carriers cross twice at the most: there,
+/// or within the tolerance of each other in between, where it says nothing.
+bool Meetings::meetInTwoEnds() const {
+    return std::any_of(m_contacts.begin(), m_contacts.end(), [&](Vec2 p) {
+        return squaredLength(p - m_contacts.front()) > m_tolerance * m_tolerance;
+    });
 }
 
 /// Lets elements stop where they cross, or where they come nearest.

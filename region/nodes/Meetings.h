@@ -75,7 +75,7 @@ private:
     bool stopAtEnds(Index ends, Index on);
     void stopBoth(Index i, Index j, Vec2 p);
     void noteNearMiss(Index i, Index j);
-    bool runAlong(Index i, Index j);
+    bool meetInTwoEnds() const;
     bool isNear(const Carrier& c, Vec2 p) const;
     bool isNearCommonEnd(const Element& a, const Element& b, Vec2 p) const;
     bool isVertexOf(Index v, Index element) const {

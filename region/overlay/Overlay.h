@@ -22,11 +22,12 @@ struct OverlayAttempt {
     double share;  ///< of the tolerance
     Care care;
 };
-constexpr std::array<OverlayAttempt, 5> kOverlayAttempts{{{1.0, Care::kUsual},
+constexpr std::array<OverlayAttempt, 6> kOverlayAttempts{{{1.0, Care::kUsual},
                                                           {1.0, Care::kThorough},
                                                           {1.0 / 2.0, Care::kThorough},
                                                           {1.0 / 8.0, Care::kThorough},
-                                                          {1.0 / 64.0, Care::kThorough}}};
+                                                          {1.0 / 64.0, Care::kThorough},
+                                                          {1.0 / 1024.0, Care::kThorough}}};
 
 /// Lays a result over itself once more, so that it holds for a tolerance: no element shorter,
 /// nothing nearer to each other. Where that does not work out it stays as it is, with the tolerance
