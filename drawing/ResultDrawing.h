@@ -5,14 +5,14 @@
 #include <string>
 #include <vector>
 
-#include "region/model/Path.h"
+#include "part/model/Path.h"
 
 namespace gmdrawing {
 
 /// A path that came of a source contour.
 struct ResultPath {
     std::size_t pass;  ///< index of the pass
-    gmregion::Path path;
+    gmpart::Path path;
     bool doubtful = false;  ///< there is a fault in what it belongs to
 };
 
@@ -24,7 +24,7 @@ struct PassName {
 
 /// Source contours and what came of them, as the writers put them into a file.
 struct ResultDrawing {
-    std::vector<gmregion::Path> contours;          ///< at least one
+    std::vector<gmpart::Path> contours;          ///< at least one
     std::vector<std::vector<ResultPath>> results;  ///< one entry a contour
     std::vector<PassName> passes;
     /// One entry a contour, of letters and digits; without entries contours are numbered from 1.

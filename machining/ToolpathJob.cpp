@@ -2,70 +2,29 @@
 /// @file
 /// Cutting contours one after the other.
 ///
-/// Runs of all contours are made first. Then, of those that may be cut, the one that starts nearest
-/// to the tool comes next, with all its passes and levels. That is a short way, not the shortest:
-/// no exchange of contours is tried afterwards.
+/// Runs of all contours are made first. Then, of the units that may be cut, the one that starts
+/// nearest to the tool comes next, with all its passes and levels. That is a short way, not the
+/// shortest: no exchange of contours is tried afterwards.
 
 #include "machining/ToolpathJob.h"
 
 #include <algorithm>
+#include <utility>
 
-#include "drawing/contours/Nesting.h"
 #include "machining/moves/MoveRecorder.h"
 #include "machining/order/CutOrder.h"
-#include "region/model/PathStart.h"
+#include "machining/order/CutUnits.h"
+#include "part/model/PathStart.h"
+#include "part/regions/Nesting.h"
 
 namespace gmmachining {
 
-using gmdrawing::enclosingPaths;
-using gmregion::FaultyOffset;
-using gmregion::OffsetFault;
-using gmregion::Path;
-using gmregion::Refusal;
-using gmregion::Side;
+using gmpart::Path;
 using gmregion::Vec2;
 
 namespace {
 
 using Pass = std::vector<ToolRun>;
-
-/// A contour's runs, pass by pass.
-struct ContourRuns {
-    std::vector<Pass> passes;  ///< none of them empty
-    Refusal refusal = Refusal::kNone;
-    bool fits = true;
-    bool bothSides = false;
-    std::vector<FaultyOffset> faults;
-    std::vector<Path> doubtful;
-
-    void setAside(double d, ToolRuns found) {
-        faults.push_back({d, found.fault});
-        for (ToolRun& run : found.runs)
-            doubtful.push_back(std::move(run.path));
-    }
-};
-
-ContourRuns runsOf(const Path& contour, int depth, const ToolpathRequest& request) {
-    ContourRuns result;
-    for (const double distance : request.distances) {
-        const std::vector<double> sides = signedDistances(contour, depth, Side::kWaste, distance);
-        const std::size_t faultsBefore = result.faults.size();
-        Pass pass;
-        for (const double d : sides) {
-            ToolRuns found = toolRuns(contour, d, request.part);
-            if (result.refusal == Refusal::kNone) result.refusal = found.refusal;
-            if (found.fault != OffsetFault::kNone) {
-                result.setAside(d, std::move(found));
-            } else {
-                std::move(found.runs.begin(), found.runs.end(), std::back_inserter(pass));
-            }
-        }
-        result.bothSides = sides.size() > 1;
-        result.fits = !pass.empty() || result.faults.size() > faultsBefore;
-        if (!pass.empty()) result.passes.push_back(std::move(pass));
-    }
-    return result;
-}
 
 double distanceToStart(const ToolRun& run, Vec2 p) {
     return run.startFixed ? distance(run.path.elements.front().sp, p) : distance(run.path, p);
@@ -89,53 +48,56 @@ struct Cut {
 class ToolpathJob {
 public:
     ToolpathJob(const std::vector<Path>& contours, const ToolpathRequest& request)
-        : m_request(request), m_obstacles(contours), m_recorder(request.safeZ) {}
+        : m_request(request),
+          m_obstacles(contours),
+          m_recorder(request.safeZ),
+          m_cuts(contours.size()) {}
 
-    ContourCut cutContour(std::size_t index, const ContourRuns& runs) {
-        m_recorder.serve(index);
-        m_cut = {};
-        m_cut.refusal = runs.refusal;
-        m_cut.fits = runs.fits;
-        m_cut.bothSides = runs.bothSides;
-        m_cut.faults = runs.faults;
-        m_cut.doubtful = runs.doubtful;
-        for (Pass pass : runs.passes) {
+    void cutUnit(const CutUnit& unit) {
+        for (Pass pass : unit.passes) {
             while (!pass.empty()) {
                 const auto nearest = nearestRun(pass, m_recorder.place());
-                m_cut.keepsOthers =
-                    m_cut.keepsOthers && m_obstacles.keepClear(nearest->path, clearance(), index);
-                cutThroughAllLevels(prepared(*nearest));
+                cutRun(*nearest);
                 pass.erase(nearest);
             }
         }
-        return m_cut;
     }
 
     Vec2 place() const { return m_recorder.place(); }
     Toolpath takeMoves() { return m_recorder.takeMoves(); }
+    std::vector<ContourCut> takeCuts() { return std::move(m_cuts); }
 
 private:
     /// What the tool's centre keeps from every contour.
     double clearance() const { return m_request.distances.back(); }
 
-    Cut prepared(const ToolRun& run) {
+    void cutRun(const ToolRun& run) {
+        const std::size_t contour = run.contours.front();
+        m_recorder.serve(contour);
+        const Cut cut = prepared(run, m_cuts[contour].leads);
+        const bool keepsAway = m_obstacles.keepClear(cut.path, clearance());
+        m_cuts[contour].keepsAway = m_cuts[contour].keepsAway && keepsAway;
+        cutThroughAllLevels(cut);
+    }
+
+    Cut prepared(const ToolRun& run, LeadTally& tally) const {
         Cut cut;
         cut.path = run.startFixed ? run.path
                                   : startedAt(run.path, nearestPlace(run.path, m_recorder.place()));
-        cut.approach = lead(cut.path, LeadEnd::kApproach);
-        cut.departure = lead(cut.path, LeadEnd::kDeparture);
+        cut.approach = lead(cut.path, LeadEnd::kApproach, tally);
+        cut.departure = lead(cut.path, LeadEnd::kDeparture, tally);
         return cut;
     }
 
-    Path lead(const Path& cut, LeadEnd end) {
+    Path lead(const Path& cut, LeadEnd end, LeadTally& tally) const {
         if (m_request.lead.kind == LeadKind::kNone) return {};
         Lead lead = clearLead(cut, end, m_request.lead, m_request.part, m_obstacles, clearance());
         const bool made = !lead.path.elements.empty();
-        std::size_t& missing = lead.tooSmall ? m_cut.leads.tooSmall : m_cut.leads.dropped;
-        ++(made ? m_cut.leads.made : missing);
+        std::size_t& missing = lead.tooSmall ? tally.tooSmall : tally.dropped;
+        ++(made ? tally.made : missing);
         if (lead.shortened) {
-            ++m_cut.leads.shortened;
-            m_cut.leads.smallest = std::min(m_cut.leads.smallest, lead.size);
+            ++tally.shortened;
+            tally.smallest = std::min(tally.smallest, lead.size);
         }
         return std::move(lead.path);
     }
@@ -155,19 +117,34 @@ private:
     const ToolpathRequest& m_request;
     Obstacles m_obstacles;
     MoveRecorder m_recorder;
-    ContourCut m_cut;  ///< of the contour being cut
+    std::vector<ContourCut> m_cuts;
 };
 
-/// Of the ready contours the one that starts nearest to p; contours without runs come at once.
-std::size_t nextContour(const std::vector<std::size_t>& ready, const std::vector<ContourRuns>& runs,
-                        Vec2 p) {
+/// Of the ready units the one that starts nearest to p; those without runs come at once.
+std::size_t nextUnit(const std::vector<std::size_t>& ready, const std::vector<CutUnit>& units,
+                     Vec2 p) {
     const auto distanceTo = [&](std::size_t i) {
-        if (runs[i].passes.empty()) return 0.0;
-        return distanceToStart(*nearestRun(runs[i].passes.front(), p), p);
+        for (const Pass& pass : units[i].passes) {
+            if (!pass.empty()) return distanceToStart(*nearestRun(pass, p), p);
+        }
+        return 0.0;
     };
     return *std::min_element(ready.begin(), ready.end(), [&](std::size_t a, std::size_t b) {
         return distanceTo(a) < distanceTo(b);
     });
+}
+
+/// What the runs of the last pass tell of the contours: which fit, and which are cut as one.
+void judgeLastPass(const std::vector<CutUnit>& units, ToolpathResult& result) {
+    for (ContourCut& cut : result.contours)
+        cut.fits = false;
+    for (const CutUnit& unit : units) {
+        for (const ToolRun& run : unit.passes.back()) {
+            if (run.contours.size() > 1) result.together.push_back(run.contours);
+            for (const std::size_t contour : run.contours)
+                result.contours[contour].fits = true;
+        }
+    }
 }
 
 }  // namespace
@@ -175,21 +152,19 @@ std::size_t nextContour(const std::vector<std::size_t>& ready, const std::vector
 ToolpathResult makeToolpath(
     const std::vector<Path>& contours, const ToolpathRequest& request,
     const std::function<void(std::size_t done, std::size_t total)>& progress) {
-    const std::vector<std::vector<std::size_t>> holders = enclosingPaths(contours);
-    std::vector<ContourRuns> runs;
-    for (std::size_t i = 0; i < contours.size(); ++i) {
-        runs.push_back(runsOf(contours[i], static_cast<int>(holders[i].size()), request));
-        progress(i + 1, contours.size());
-    }
-    CutOrder order(holders);
+    ToolRuns runs = toolRuns(contours, request.distances, request.part, progress);
+    const std::vector<CutUnit> units = cutUnits(contours.size(), std::move(runs.passes));
+    CutOrder order(holdersOfUnits(units, gmpart::nestingOf(contours).holders));
     ToolpathJob job(contours, request);
-    ToolpathResult result{{}, std::vector<ContourCut>(contours.size())};
     for (auto ready = order.ready(); !ready.empty(); ready = order.ready()) {
-        const std::size_t next = nextContour(ready, runs, job.place());
-        result.contours[next] = job.cutContour(next, runs[next]);
+        const std::size_t next = nextUnit(ready, units, job.place());
+        job.cutUnit(units[next]);
         order.finish(next);
     }
-    result.moves = job.takeMoves();
+    ToolpathResult result{job.takeMoves(), job.takeCuts(), {}, std::move(runs.rest)};
+    judgeLastPass(units, result);
+    for (std::size_t i = 0; i < contours.size(); ++i)
+        result.contours[i].runRound = !contours[i].closed;
     return result;
 }
 

@@ -1,11 +1,14 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include <cmath>
+#include <cstddef>
 #include <functional>
+#include <vector>
 
 #include "machining/leads/Leads.h"
 #include "machining/moves/Toolpath.h"
-#include "region/offset/OffsetJob.h"
+#include "part/offset/PartOffset.h"
 
 namespace gmmachining {
 
@@ -19,7 +22,7 @@ struct ToolpathRequest {
     double safeZ = 5.0;          ///< height that clears everything, positive
 };
 
-/// What became of the leads of a contour, approaches and departures alike.
+/// What became of leads, approaches and departures alike.
 struct LeadTally {
     std::size_t made = 0;  ///< the shortened ones included
     std::size_t shortened = 0;
@@ -30,26 +33,27 @@ struct LeadTally {
 
 /// What became of a contour.
 struct ContourCut {
-    gmregion::Refusal refusal = gmregion::Refusal::kNone;  ///< why the contour has no offsets
-    bool fits = true;         ///< false when nothing is left for the last pass
-    bool bothSides = false;   ///< the contour has no waste side and is cut on both
-    bool keepsOthers = true;  ///< false when its cuts come too near to another contour
-    std::vector<gmregion::FaultyOffset>
-        faults;  ///< offsets that do not stand the check; they are not cut
-    std::vector<gmregion::Path> doubtful;  ///< the results of those offsets
-    LeadTally leads;
+    bool fits = true;       ///< false when nothing of the last pass comes from it
+    bool runRound = false;  ///< it has no inside and is cut all round
+    bool keepsAway = true;  ///< false when a cut along it comes too near to a contour
+    LeadTally leads;        ///< of the runs of which it is the first contour
 };
 
 struct ToolpathResult {
     Toolpath moves;
     std::vector<ContourCut> contours;  ///< one entry a contour
+    /// Contours between which the tool does not fit in the last pass: they are cut as one.
+    std::vector<std::vector<std::size_t>> together;
+    gmpart::PartOffsets offsets;  ///< what they tell; their paths have faults and are not cut
 };
 
-/// Cuts every contour on its waste side, open ones on both sides. Of the contours that may come
-/// next (`CutOrder`) the one whose start is nearest is cut, in all its passes; a pass is cut
-/// run by run, the nearest first, and a run through all levels at once.
+/// Cuts the part out on its waste side; open contours are run round.
+///
+/// Contours that share a run are cut as one. Of those that may come next (`CutOrder`) the one whose
+/// start is nearest is cut, in all its passes; a pass is cut run by run, the nearest first, and a
+/// run through all levels at once. All cuts and leads are compared with the contours.
 ToolpathResult makeToolpath(
-    const std::vector<gmregion::Path>& contours, const ToolpathRequest& request,
+    const std::vector<gmpart::Path>& contours, const ToolpathRequest& request,
     const std::function<void(std::size_t done, std::size_t total)>& progress);
 
 }  // namespace gmmachining

@@ -22,14 +22,15 @@ declare -A floors=(
     [region/link]=4 [region/overlay]=5 [region/offset]=6 [region/operations]=7
     [region/locate]=5 [region/simplify]=5 [region/verify]=6
     [bridge/public]=1 [bridge]=2
-    [region/bridge]=4 [region/corners]=7 [region/boolean]=7
-    [drawing]=10 [drawing/contours]=11 [drawing/dxf]=11 [drawing/svg]=12 [drawing/files]=13
-    [machining/moves]=14 [machining/runs]=14 [machining/obstacles]=14 [machining/order]=14
-    [machining/gcode]=15 [machining/leads]=15 [machining]=16 [machining/picture]=17
-    [apps/gmpath]=18
+    [part/model]=8 [part/kernel]=9 [part/regions]=9 [part/offset]=10 [part/boolean]=10
+    [part/corners]=10
+    [drawing]=11 [drawing/contours]=12 [drawing/dxf]=12 [drawing/svg]=13 [drawing/files]=14
+    [machining/moves]=15 [machining/runs]=15 [machining/obstacles]=15 [machining/order]=16
+    [machining/gcode]=16 [machining/leads]=16 [machining]=17 [machining/picture]=18
+    [apps/gmpath]=19
 )
 # Besides the kernel itself these rooms may include its public headers, and those of the bridge.
-kernel_users='^(bridge|bridge/public|region/bridge|machining/leads)$'
+kernel_users='^(bridge|bridge/public|part/kernel|machining/leads)$'
 
 # The room of a header or source by its path, empty when it is in none.
 room_of() {

@@ -4,9 +4,9 @@
 #include <CLI/CLI.hpp>
 #include <vector>
 
+#include "apps/gmpath/CombineCommands.h"
 #include "apps/gmpath/CornersCommand.h"
 #include "apps/gmpath/InfoCommand.h"
-#include "apps/gmpath/MeltCommand.h"
 #include "apps/gmpath/OffsetCommand.h"
 #include "apps/gmpath/ToolpathCommand.h"
 #include "drawing/InputError.h"
@@ -47,9 +47,10 @@ int runCommandLine(int argc, const char* const* argv, const Console& console) {
     program.set_version_flag("--version", std::string("gmpath ") + GMPATH_VERSION);
     program.require_subcommand(1);
     program.footer("Example: gmpath offset bracket.dxf --distance 3 -o bracket.svg");
-    const std::vector<Command> commands = {addInfo(program), addOffset(program),
-                                           addCorners(program), addMelt(program),
-                                           addToolpath(program)};
+    std::vector<Command> commands = {addInfo(program), addOffset(program), addCorners(program),
+                                     addToolpath(program)};
+    for (Command& combination : addCombinations(program))
+        commands.push_back(std::move(combination));
     try {
         program.parse(argc, argv);
         for (const Command& command : commands) {

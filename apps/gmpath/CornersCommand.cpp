@@ -11,7 +11,7 @@
 #include "apps/gmpath/Report.h"
 #include "drawing/Text.h"
 #include "drawing/files/OutputFiles.h"
-#include "region/corners/CornerJob.h"
+#include "part/corners/CornerJob.h"
 
 namespace gmpath {
 
@@ -22,12 +22,12 @@ using gmdrawing::Part;
 using gmdrawing::PassName;
 using gmdrawing::ResultDrawing;
 using gmdrawing::writeOutputs;
-using gmregion::CornerChoice;
-using gmregion::CornerKind;
-using gmregion::CornerRequest;
-using gmregion::CornerResult;
+using gmpart::CornerChoice;
+using gmpart::CornerKind;
+using gmpart::CornerRequest;
+using gmpart::CornerResult;
+using gmpart::KernelRefusal;
 using gmregion::kPi;
-using gmregion::Refusal;
 
 namespace {
 
@@ -92,7 +92,8 @@ PassName nameOf(const CornerRequest& request) {
 
 /// What is to be told about a contour, empty when all went well.
 std::string remark(const CornerResult& result) {
-    if (result.refusal != Refusal::kNone) return "left as it is: " + refusalText(result.refusal);
+    if (result.refusal != KernelRefusal::kNone)
+        return "left as it is: " + refusalText(result.refusal);
     if (result.notDone == 0) return {};
     return "no room at " + std::to_string(result.notDone) + " of " +
            counted(result.done + result.notDone, "corner");
@@ -105,7 +106,7 @@ bool runCorners(const CornersOptions& options, const Console& console) {
     ResultDrawing drawing{part.contours, {}, {nameOf(request)}, {}, true};
     const std::vector<CornerResult> results = breakCorners(part.contours, request);
     for (const CornerResult& result : results)
-        drawing.results.push_back({{0, result.path, result.refusal != Refusal::kNone}});
+        drawing.results.push_back({{0, result.path, result.refusal != KernelRefusal::kNone}});
     writeOutputs(drawing, options.outputs);
 
     const Report report(console.err, options.input.drawing);
@@ -118,8 +119,9 @@ bool runCorners(const CornersOptions& options, const Console& console) {
     }
     console.out << counted(results.size(), "contour") << ", " << counted(done, "corner")
                 << " done, " << notDone << " not done\n";
-    return std::all_of(results.begin(), results.end(),
-                       [](const CornerResult& result) { return result.refusal == Refusal::kNone; });
+    return std::all_of(results.begin(), results.end(), [](const CornerResult& result) {
+        return result.refusal == KernelRefusal::kNone;
+    });
 }
 
 }  // namespace

@@ -6,8 +6,8 @@
 #include <optional>
 
 #include "drawing/Text.h"
-#include "drawing/contours/Nesting.h"
-#include "region/model/Area.h"
+#include "part/model/Area.h"
+#include "part/regions/Nesting.h"
 #include "region/model/Box.h"
 
 namespace gmpath {
@@ -16,15 +16,15 @@ using gmdrawing::characterCount;
 using gmdrawing::counted;
 using gmdrawing::formatFixed;
 using gmdrawing::formatReal;
-using gmdrawing::nestingDepths;
 using gmdrawing::Part;
 using gmdrawing::printable;
 using gmdrawing::SkippedKind;
 using gmdrawing::SkipReport;
+using gmpart::nestingOf;
+using gmpart::Path;
+using gmpart::Sense;
 using gmregion::Box;
 using gmregion::kKernelTolerance;
-using gmregion::Path;
-using gmregion::Sense;
 using gmregion::Vec2;
 
 namespace {
@@ -61,13 +61,13 @@ std::string senseText(const Path& path) {
     return "-";
 }
 
-Row contourRow(std::size_t index, const Path& path, const std::optional<int>& depth) {
+Row contourRow(std::size_t index, const Path& path, std::size_t depth) {
     const std::size_t arcs = arcCount(path);
     const Box box = boundingBox(path);
     return {std::to_string(index + 1),
             printable(path.layer),
             path.closed ? "closed" : "open",
-            depth ? std::to_string(*depth) : "-",
+            path.closed ? std::to_string(depth) : "-",
             std::to_string(path.elements.size() - arcs),
             std::to_string(arcs),
             number(length(path)),
@@ -104,7 +104,7 @@ std::string kindText(const SkippedKind& kind, std::size_t count) {
 }  // namespace
 
 std::string infoTable(const Part& part) {
-    const std::vector<std::optional<int>> depths = nestingDepths(part.contours);
+    const std::vector<std::size_t> depths = nestingOf(part.contours).depths;
     std::vector<Row> rows = {headRow()};
     for (std::size_t i = 0; i < part.contours.size(); ++i) {
         rows.push_back(contourRow(i, part.contours[i], depths[i]));

@@ -14,6 +14,10 @@ using gmdrawing::readPart;
 
 void addInputOptions(CLI::App& command, InputOptions& input) {
     command.add_option("PART", input.drawing, "part drawing (DXF in text form)")->required();
+    addReadOptions(command, input);
+}
+
+void addReadOptions(CLI::App& command, InputOptions& input) {
     command
         .add_option("--join", input.read.joinTolerance,
                     "join ends that lie this far apart, in units of the drawing")

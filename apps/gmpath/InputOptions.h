@@ -19,6 +19,9 @@ struct InputOptions {
 /// Adds the name of the drawing and the options of reading it to a command.
 void addInputOptions(CLI::App& command, InputOptions& input);
 
+/// Those of them that say how drawings are read.
+void addReadOptions(CLI::App& command, InputOptions& input);
+
 /// Reads the drawing and reports what of it cannot be used. Throws InputError for input that cannot
 /// be used.
 gmdrawing::Part readInput(const InputOptions& options, const Console& console);

@@ -14,8 +14,9 @@
 #include "apps/gmpath/Report.h"
 #include "drawing/InputError.h"
 #include "drawing/Text.h"
-#include "drawing/contours/Nesting.h"
 #include "drawing/files/OutputFiles.h"
+#include "part/offset/KernelOffset.h"
+#include "part/offset/PartOffset.h"
 
 namespace gmpath {
 
@@ -23,15 +24,19 @@ using gmdrawing::checkOutputs;
 using gmdrawing::counted;
 using gmdrawing::formatReal;
 using gmdrawing::InputError;
-using gmdrawing::nestingDepths;
 using gmdrawing::Part;
 using gmdrawing::ResultDrawing;
 using gmdrawing::writeOutputs;
-using gmregion::ContourOffsets;
-using gmregion::FaultyOffset;
-using gmregion::OffsetPath;
-using gmregion::Refusal;
-using gmregion::Side;
+using gmpart::OffsetFault;
+using gmpart::offsetPart;
+using gmpart::offsetPartByKernel;
+using gmpart::OffsetPath;
+using gmpart::OffsetRefusal;
+using gmpart::OffsetRequest;
+using gmpart::PartOffsets;
+using gmpart::Side;
+using gmregion::Join;
+using gmregion::Point;
 
 namespace {
 
@@ -45,18 +50,32 @@ struct OffsetOptions {
     std::optional<double> step;  ///< from one pass to the next; the first distance when left out
     int count = 1;               ///< number of passes
     Side side = Side::kWaste;
+    Join join = Join::kRound;
+    bool each = false;      ///< contours by themselves
+    bool byKernel = false;  ///< the kernel makes the offsets
     std::vector<std::string> outputs;
 };
 
 const std::map<std::string, Side>& sideNames() {
     static const std::map<std::string, Side> names = {
-        {"waste", Side::kWaste},   {"right", Side::kRight},     {"left", Side::kLeft},
-        {"inside", Side::kInside}, {"outside", Side::kOutside}, {"both", Side::kBoth}};
+        {"waste", Side::kWaste}, {"material", Side::kMaterial}, {"right", Side::kRight},
+        {"left", Side::kLeft},   {"inside", Side::kInside},     {"outside", Side::kOutside},
+        {"both", Side::kBoth}};
     return names;
 }
 
-void addOptions(CLI::App& offset, OffsetOptions& options) {
-    addInputOptions(offset, options.input);
+const std::map<std::string, Join>& joinNames() {
+    static const std::map<std::string, Join> names = {
+        {"round", Join::kRound}, {"miter", Join::kMiter}, {"bevel", Join::kBevel}};
+    return names;
+}
+
+const std::map<std::string, bool>& engineNames() {
+    static const std::map<std::string, bool> names = {{"regions", false}, {"kernel", true}};
+    return names;
+}
+
+void addPasses(CLI::App& offset, OffsetOptions& options) {
     offset.add_option("-d,--distance", options.distance, "distance of the first pass")
         ->transform(finiteNumber())
         ->required();
@@ -67,10 +86,27 @@ void addOptions(CLI::App& offset, OffsetOptions& options) {
         .add_option("--step", options.step,
                     "distance from one pass to the next [the first distance]")
         ->transform(finiteNumber());
+}
+
+void addOptions(CLI::App& offset, OffsetOptions& options) {
+    addInputOptions(offset, options.input);
+    addPasses(offset, options);
     addNamedOption(offset, "--side", options.side, sideNames(),
-                   "waste (outside of outlines, inside of holes; open contours both), right, left, "
-                   "inside, outside or both [waste]");
+                   "waste (outside of outlines, inside of holes), material (the other way), right, "
+                   "left, inside, outside or both; open contours are run round but for right and "
+                   "left [waste]");
+    addNamedOption(offset, "--join-style", options.join, joinNames(),
+                   "corners that open: round, miter or bevel [round]");
+    offset.add_flag("--each", options.each, "offset every contour by itself: nothing merges");
+    addNamedOption(offset, "--engine", options.byKernel, engineNames(),
+                   "what makes the offsets: regions, or the kernel, contour by contour [regions]");
     addOutputs(offset, options.outputs);
+}
+
+void checkEngine(const OffsetOptions& options) {
+    if (options.byKernel && options.join != Join::kRound) {
+        throw InputError("--engine kernel: its corners are round (--join-style)");
+    }
 }
 
 std::vector<double> distancesOf(const OffsetOptions& options) {
@@ -86,14 +122,13 @@ std::vector<double> distancesOf(const OffsetOptions& options) {
     return distances;
 }
 
-ResultDrawing drawingOf(const Part& part, const std::vector<ContourOffsets>& offsets,
+/// Results stand with the contour that most of their length comes from.
+ResultDrawing drawingOf(const Part& part, const PartOffsets& offsets,
                         const std::vector<double>& distances) {
     ResultDrawing drawing{part.contours, {}, {}};
-    for (const ContourOffsets& found : offsets) {
-        drawing.results.emplace_back();
-        for (const OffsetPath& offset : found.paths)
-            drawing.results.back().push_back({offset.pass, offset.path, offset.doubtful});
-    }
+    drawing.results.resize(part.contours.size());
+    for (const OffsetPath& offset : offsets.paths)
+        drawing.results[offset.main].push_back({offset.pass, offset.path, offset.doubtful});
     for (std::size_t pass = 0; pass < distances.size(); ++pass) {
         drawing.passes.push_back({"offset " + formatReal(distances[pass], kLegendDigits),
                                   "OFFSET_" + std::to_string(pass + 1)});
@@ -101,41 +136,100 @@ ResultDrawing drawingOf(const Part& part, const std::vector<ContourOffsets>& off
     return drawing;
 }
 
-void reportContour(std::size_t contour, const std::vector<double>& distances,
-                   const ContourOffsets& offsets, const Report& report) {
-    if (offsets.refusal != Refusal::kNone) {
-        report.tell(contour, "no offsets: " + refusalText(offsets.refusal));
-        return;
+/// What is told about the offsets of a drawing.
+class OffsetReport {
+public:
+    OffsetReport(const PartOffsets& offsets, const std::vector<double>& distances,
+                 std::size_t contours, const Report& report)
+        : m_offsets(offsets), m_distances(distances), m_contours(contours), m_report(report) {}
+
+    void tellAll() const {
+        for (const OffsetRefusal& refusal : m_offsets.refusals)
+            tell(refusal.contour, "no offset " + passText(refusal.pass) + ": " +
+                                      textOf(refusal.reason) + placeText(refusal.at));
+        for (const OffsetFault& fault : m_offsets.faults)
+            tell(fault.contour, "the offset " + passText(fault.pass) +
+                                    " is faulty: " + faultText(fault.fault, fault.count));
+        for (std::size_t pass = 0; pass < m_distances.size(); ++pass) {
+            tellMerged(pass);
+            tellMissing(pass);
+            tellMarginal(pass);
+        }
     }
-    for (const FaultyOffset& faulty : offsets.faults)
-        report.tell(contour, faultText(faulty));
-    for (const std::size_t pass : offsets.emptyPasses) {
-        report.tell(contour,
-                    "nothing left at distance " + formatReal(distances[pass], kDistanceDigits));
+
+private:
+    std::string passText(std::size_t pass) const {
+        return "at distance " + formatReal(m_distances[pass], kDistanceDigits);
     }
+
+    void tell(std::optional<std::size_t> contour, const std::string& text) const {
+        if (contour) {
+            m_report.tell(*contour, text);
+        } else {
+            m_report.tell(text);
+        }
+    }
+
+    void tellMerged(std::size_t pass) const {
+        for (const OffsetPath& path : m_offsets.paths) {
+            if (path.pass != pass || path.contours.size() < 2) continue;
+            m_report.tell("the offsets " + passText(pass) + " of contours " +
+                          numbersText(path.contours) + " meet and are one");
+        }
+    }
+
+    void tellMissing(std::size_t pass) const {
+        const auto isRefused = [&](const OffsetRefusal& refusal) { return refusal.pass == pass; };
+        if (std::any_of(m_offsets.refusals.begin(), m_offsets.refusals.end(), isRefused)) return;
+        std::vector<bool> found(m_contours, false);
+        for (const OffsetPath& path : m_offsets.paths) {
+            if (path.pass != pass) continue;
+            for (const std::size_t contour : path.contours)
+                found[contour] = true;
+        }
+        for (std::size_t i = 0; i < m_contours; ++i) {
+            if (!found[i]) m_report.tell(i, "nothing left " + passText(pass));
+        }
+    }
+
+    void tellMarginal(std::size_t pass) const {
+        const std::vector<Point>& places = m_offsets.marginal[pass];
+        if (places.empty()) return;
+        m_report.tell(passText(pass) + ", " + counted(places.size(), "place") +
+                      " where a neck or a gap is just twice as wide, the first" +
+                      placeText(places.front()));
+    }
+
+    const PartOffsets& m_offsets;
+    const std::vector<double>& m_distances;
+    std::size_t m_contours;
+    const Report& m_report;
+};
+
+PartOffsets offsetsOf(const Part& part, const OffsetOptions& options, const OffsetRequest& request,
+                      const Console& console) {
+    Progress progress(console.err, console.showProgress);
+    const auto show = [&](std::size_t done, std::size_t total) { progress.show(done, total); };
+    PartOffsets offsets = options.byKernel ? offsetPartByKernel(part.contours, request, show)
+                                           : offsetPart(part.contours, request, show);
+    progress.clear();
+    return offsets;
 }
 
 bool runOffset(const OffsetOptions& options, const Console& console) {
     const std::vector<double> distances = distancesOf(options);
+    checkEngine(options);
     checkOutputs(options.outputs, options.input.drawing);
     const Part part = readInput(options.input, console);
-    Progress progress(console.err, console.showProgress);
-    const std::vector<ContourOffsets> offsets =
-        offsetContours(part.contours, nestingDepths(part.contours), {options.side, distances},
-                       [&](std::size_t done, std::size_t total) { progress.show(done, total); });
+    const OffsetRequest request{
+        options.side, distances, {options.join, gmregion::End::kRound}, options.each};
+    const PartOffsets offsets = offsetsOf(part, options, request, console);
     writeOutputs(drawingOf(part, offsets, distances), options.outputs);
-    progress.clear();
-
     const Report report(console.err, options.input.drawing);
-    std::size_t paths = 0;
-    for (std::size_t i = 0; i < offsets.size(); ++i) {
-        reportContour(i, distances, offsets[i], report);
-        paths += offsets[i].paths.size();
-    }
-    console.out << counted(offsets.size(), "contour") << ", " << counted(paths, "offset") << "\n";
-    return std::all_of(offsets.begin(), offsets.end(), [](const ContourOffsets& of) {
-        return of.refusal == Refusal::kNone && of.faults.empty();
-    });
+    OffsetReport(offsets, distances, part.contours.size(), report).tellAll();
+    console.out << counted(part.contours.size(), "contour") << ", "
+                << counted(offsets.paths.size(), "offset") << "\n";
+    return offsets.refusals.empty() && offsets.faults.empty();
 }
 
 }  // namespace

@@ -1,38 +1,61 @@
 // SPDX-License-Identifier: MIT
 #include "apps/gmpath/Phrases.h"
 
-#include <cmath>
-
 #include "drawing/Text.h"
 
 namespace gmpath {
 
 using gmdrawing::formatReal;
-using gmregion::FaultyOffset;
+using gmpart::KernelRefusal;
+using gmregion::Fault;
 using gmregion::kKernelTolerance;
-using gmregion::Refusal;
+using gmregion::Point;
 
-std::string faultText(const FaultyOffset& faulty) {
-    const std::string side = faulty.distance > 0.0 ? "right" : "left";
-    return "the offset by " + formatReal(std::abs(faulty.distance), kDistanceDigits) + " to the " +
-           side + " " + std::string(faultText(faulty.fault));
+namespace {
+
+constexpr int kPlaceDigits = 7;
+
+/// Contours named in a remark, at most.
+constexpr std::size_t kMostNamed = 10;
+
+}  // namespace
+
+std::string placeText(Point p) {
+    return " near (" + formatReal(p.x, kPlaceDigits) + ", " + formatReal(p.y, kPlaceDigits) + ")";
 }
 
-std::string refusalText(Refusal refusal) {
+std::string faultText(const Fault& fault, std::size_t count) {
+    std::string text = textOf(fault.kind) + placeText(fault.at);
+    if (fault.by > 0.0) text += " by " + formatReal(fault.by, kDistanceDigits);
+    if (count > 1) text += ", and " + std::to_string(count - 1) + " more";
+    return text;
+}
+
+std::string numbersText(const std::vector<std::size_t>& contours) {
+    std::string text;
+    for (std::size_t i = 0; i < contours.size() && i < kMostNamed; ++i) {
+        const bool isLast = i + 1 == contours.size();
+        text += (i == 0 ? "" : isLast ? " and " : ", ") + std::to_string(contours[i] + 1);
+    }
+    if (contours.size() <= kMostNamed) return text;
+    return text + " and " + std::to_string(contours.size() - kMostNamed) + " more";
+}
+
+std::string refusalText(KernelRefusal refusal) {
     const std::string tolerance = formatReal(kKernelTolerance);
     switch (refusal) {
-        case Refusal::kTooSmall:
+        case KernelRefusal::kTooSmall:
             return "an element is shorter than " + tolerance + ": scale the drawing up (--scale)";
-        case Refusal::kJoint:
+        case KernelRefusal::kJoint:
             return "an arc, very flat or far from the origin, misses its neighbour by " +
                    tolerance + " or more: draw a line in its place, or move the part to the origin";
-        case Refusal::kEndsAtStart:
+        case KernelRefusal::kEndsAtStart:
             return "it is open, but its end comes within " + tolerance +
                    " of its start: close it (--join), or draw its ends farther apart";
-        case Refusal::kPassesStart:
+        case KernelRefusal::kPassesStart:
             return "it is open, but passes within " + tolerance +
                    " of its start: begin it elsewhere, or split it there";
-        case Refusal::kNone:
+        case KernelRefusal::kNone:
             break;
     }
     return {};

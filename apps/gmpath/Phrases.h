@@ -2,18 +2,27 @@
 #pragma once
 
 #include <string>
+#include <vector>
 
-#include "region/offset/OffsetJob.h"
+#include "gmregion/Verify.h"
+
+#include "part/kernel/KernelLimits.h"
 
 namespace gmpath {
 
 /// Digits of distances in remarks.
 constexpr int kDistanceDigits = 9;
 
-/// What is wrong with an offset.
-std::string faultText(const gmregion::FaultyOffset& faulty);
+/// Where something is, to be put behind a text.
+std::string placeText(gmregion::Point p);
 
-/// Why nothing could be done with a contour, and what its owner can do about it.
-std::string refusalText(gmregion::Refusal refusal);
+/// What is wrong with a result: the first of a number of faults.
+std::string faultText(const gmregion::Fault& fault, std::size_t count);
+
+/// The numbers of contours as users count them, the first ten by name.
+std::string numbersText(const std::vector<std::size_t>& contours);
+
+/// Why the kernel could do nothing with a contour, and what its owner can do about it.
+std::string refusalText(gmpart::KernelRefusal refusal);
 
 }  // namespace gmpath

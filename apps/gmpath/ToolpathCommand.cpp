@@ -32,8 +32,9 @@ using gmmachining::MoveKind;
 using gmmachining::ToolpathRequest;
 using gmmachining::ToolpathResult;
 using gmmachining::Units;
-using gmregion::FaultyOffset;
-using gmregion::Refusal;
+using gmpart::OffsetFault;
+using gmpart::OffsetRefusal;
+using gmpart::PartOffsets;
 
 namespace {
 
@@ -62,30 +63,39 @@ std::string droppedText(const LeadTally& leads) {
 
 /// What is to be told about a contour, empty when all went well.
 std::string remark(const ContourCut& cut) {
-    if (cut.refusal != Refusal::kNone) return "not cut: " + refusalText(cut.refusal);
     if (!cut.fits) return "the tool does not fit";
     std::string text;
     const auto add = [&](bool applies, const std::string& what) {
         if (applies) text += (text.empty() ? "" : "; ") + what;
     };
-    for (const FaultyOffset& faulty : cut.faults)
-        add(true, faultText(faulty) + ", not cut");
-    add(!cut.keepsOthers, "the cut comes too near to another contour");
+    add(!cut.keepsAway, "the cut comes too near to a contour");
     add(cut.leads.shortened > 0, shortenedText(cut.leads));
     add(cut.leads.dropped > 0, droppedText(cut.leads));
     return text;
 }
 
-void reportContours(const Report& report, const std::vector<ContourCut>& cuts) {
-    const auto twoSided = std::count_if(cuts.begin(), cuts.end(), [](const ContourCut& cut) {
-        return cut.bothSides && cut.refusal == Refusal::kNone;
-    });
-    if (twoSided > 0) {
-        report.tell(counted(static_cast<std::size_t>(twoSided), "open contour") +
-                    " cut on both sides");
+void reportOffsets(const Report& report, const PartOffsets& offsets) {
+    for (const OffsetRefusal& refusal : offsets.refusals)
+        report.tell("no offset: " + std::string(textOf(refusal.reason)) + placeText(refusal.at));
+    for (const OffsetFault& fault : offsets.faults)
+        report.tell("an offset is faulty, not cut: " + faultText(fault.fault, fault.count));
+}
+
+void reportContours(const Report& report, const ToolpathResult& result) {
+    const std::vector<ContourCut>& cuts = result.contours;
+    const auto runRound =
+        std::count_if(cuts.begin(), cuts.end(), [](const ContourCut& cut) { return cut.runRound; });
+    if (runRound > 0) {
+        report.tell(counted(static_cast<std::size_t>(runRound), "open contour") + " cut all round");
     }
-    for (std::size_t i = 0; i < cuts.size(); ++i)
-        report.tell(i, remark(cuts[i]));
+    for (const std::vector<std::size_t>& contours : result.together) {
+        report.tell("contours " + numbersText(contours) +
+                    " cut as one: the tool does not fit between them");
+    }
+    const bool complete = result.offsets.refusals.empty() && result.offsets.faults.empty();
+    for (std::size_t i = 0; i < cuts.size(); ++i) {
+        if (complete || cuts[i].fits) report.tell(i, remark(cuts[i]));
+    }
 }
 
 std::string summary(const ToolpathResult& result, Units units) {
@@ -123,11 +133,14 @@ bool runToolpath(const ToolpathOptions& options, const Console& console) {
                   {".svg", [&](AtomicFile& file) { file.write(svgOf(part.contours, result)); }}},
                  options.outputs);
     progress.clear();
-    reportContours(Report(console.err, options.input.drawing), result.contours);
+    const Report report(console.err, options.input.drawing);
+    reportOffsets(report, result.offsets);
+    reportContours(report, result);
     console.out << summary(result, units);
-    return std::all_of(result.contours.begin(), result.contours.end(), [](const ContourCut& cut) {
-        return cut.refusal == Refusal::kNone && cut.faults.empty() && cut.keepsOthers;
-    });
+    return result.offsets.refusals.empty() && result.offsets.faults.empty() &&
+           result.together.empty() &&
+           std::all_of(result.contours.begin(), result.contours.end(),
+                       [](const ContourCut& cut) { return cut.keepsAway; });
 }
 
 }  // namespace

@@ -15,14 +15,14 @@
 
 #include "drawing/contours/Duplicates.h"
 #include "drawing/contours/Junctions.h"
-#include "region/model/Area.h"
-#include "region/model/ShortElements.h"
+#include "part/model/Area.h"
+#include "part/model/ShortElements.h"
 
 namespace gmdrawing {
 
 using gmregion::Element;
 using gmregion::kKernelTolerance;
-using gmregion::Path;
+using gmpart::Path;
 
 namespace {
 

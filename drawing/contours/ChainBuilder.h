@@ -4,13 +4,13 @@
 #include <vector>
 
 #include "drawing/SkipReport.h"
-#include "region/model/Path.h"
+#include "part/model/Path.h"
 
 namespace gmdrawing {
 
 /// Contours made from the paths of a drawing, and what was dropped on the way.
 struct ChainResult {
-    std::vector<gmregion::Path> contours;
+    std::vector<gmpart::Path> contours;
     SkipReport skipped;
 };
 
@@ -22,6 +22,6 @@ struct ChainResult {
 /// neither the order nor the sense of its pieces: when closed it runs counter-clockwise from its
 /// leftmost joint (the lowest of these), when open from the end that lies further left (lower).
 /// Contours come in the order of their earliest piece. Throws InputError as `joinEnds` does.
-ChainResult buildChains(std::vector<gmregion::Path> paths, double tolerance);
+ChainResult buildChains(std::vector<gmpart::Path> paths, double tolerance);
 
 }  // namespace gmdrawing

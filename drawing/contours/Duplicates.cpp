@@ -21,7 +21,7 @@ using gmregion::Box;
 using gmregion::Element;
 using gmregion::isArc;
 using gmregion::kKernelTolerance;
-using gmregion::Path;
+using gmpart::Path;
 using gmregion::PointGrid;
 using gmregion::Vec2;
 

@@ -22,7 +22,7 @@
 namespace gmdrawing {
 
 using gmregion::Element;
-using gmregion::Path;
+using gmpart::Path;
 using gmregion::PointGrid;
 using gmregion::Vec2;
 

@@ -5,7 +5,7 @@
 #include <optional>
 #include <vector>
 
-#include "region/model/Path.h"
+#include "part/model/Path.h"
 
 namespace gmdrawing {
 
@@ -36,7 +36,7 @@ inline bool isStart(PathEnd end) {
 ///
 /// Throws InputError when more than 200 ends meet at one place: then the tolerance is too wide for
 /// the drawing.
-std::vector<std::optional<PathEnd>> joinEnds(const std::vector<gmregion::Path>& paths,
+std::vector<std::optional<PathEnd>> joinEnds(const std::vector<gmpart::Path>& paths,
                                              double tolerance);
 
 }  // namespace gmdrawing

@@ -17,8 +17,8 @@
 namespace gmdrawing {
 
 using gmregion::Element;
-using gmregion::Path;
-using gmregion::Placement;
+using gmpart::Path;
+using gmpart::Placement;
 using gmregion::Vec2;
 
 namespace {

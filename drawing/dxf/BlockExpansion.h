@@ -5,13 +5,13 @@
 
 #include "drawing/SkipReport.h"
 #include "drawing/dxf/Drawing.h"
-#include "region/model/Placement.h"
+#include "part/model/Placement.h"
 
 namespace gmdrawing {
 
 /// The paths of a drawing with all blocks placed.
 struct ExpandedDrawing {
-    std::vector<gmregion::Path> paths;
+    std::vector<gmpart::Path> paths;
     SkipReport skipped;
 };
 
@@ -22,6 +22,6 @@ struct ExpandedDrawing {
 /// uniform are counted as unusable; so are paths that come to lie beyond 1e9 units. Throws
 /// InputError when the blocks multiply beyond two million paths and placed blocks, and counts
 /// blocks nested deeper than 64 as unusable.
-ExpandedDrawing expandBlocks(const Drawing& drawing, const gmregion::Placement& placement);
+ExpandedDrawing expandBlocks(const Drawing& drawing, const gmpart::Placement& placement);
 
 }  // namespace gmdrawing

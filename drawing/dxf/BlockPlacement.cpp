@@ -12,7 +12,7 @@
 
 namespace gmdrawing {
 
-using gmregion::Placement;
+using gmpart::Placement;
 using gmregion::Vec2;
 
 namespace {

@@ -5,9 +5,11 @@
 
 namespace gmdrawing {
 
+using gmpart::appendArc;
+using gmpart::appendBulge;
 using gmregion::Element;
 using gmregion::kPi;
-using gmregion::Path;
+using gmpart::Path;
 
 namespace {
 

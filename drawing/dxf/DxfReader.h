@@ -32,7 +32,7 @@ public:
 
 private:
     struct OpenPolyline {
-        gmregion::Path path;
+        gmpart::Path path;
         bool mirrored;
         std::vector<gmregion::Element>
             corners;  ///< start and bulge of the element behind each vertex
@@ -41,8 +41,8 @@ private:
     Block& block() { return m_block != nullptr ? *m_block : m_drawing.model; }
     bool isTilted(const std::string& kind);
     bool isMirrored();
-    gmregion::Path emptyPath();
-    void addPath(gmregion::Path path, bool mirrored);
+    gmpart::Path emptyPath();
+    void addPath(gmpart::Path path, bool mirrored);
     void finishPolyline();
 
     Drawing m_drawing;

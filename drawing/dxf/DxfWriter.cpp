@@ -14,7 +14,7 @@
 namespace gmdrawing {
 
 using gmregion::Element;
-using gmregion::Path;
+using gmpart::Path;
 using gmregion::Vec2;
 
 namespace {

@@ -16,7 +16,7 @@
 
 namespace gmdrawing {
 
-using gmregion::Placement;
+using gmpart::Placement;
 
 namespace {
 

@@ -6,7 +6,7 @@
 
 #include "drawing/DrawingUnits.h"
 #include "drawing/SkipReport.h"
-#include "region/model/Path.h"
+#include "part/model/Path.h"
 
 namespace gmdrawing {
 
@@ -19,7 +19,7 @@ struct ReadOptions {
 
 /// What a part drawing holds.
 struct Part {
-    std::vector<gmregion::Path> contours;  ///< at least one, each with at least one element
+    std::vector<gmpart::Path> contours;  ///< at least one, each with at least one element
     SkipReport skipped;
     DrawingUnits units;
 };

@@ -4,15 +4,15 @@
 #include <array>
 #include <optional>
 
-#include "drawing/contours/Nesting.h"
+#include "part/regions/Nesting.h"
 #include "drawing/svg/SvgPage.h"
-#include "region/model/Area.h"
+#include "part/model/Area.h"
 
 namespace gmdrawing {
 
 using gmregion::Box;
-using gmregion::Path;
-using gmregion::Sense;
+using gmpart::Path;
+using gmpart::Sense;
 
 namespace {
 
@@ -121,9 +121,11 @@ void drawContour(SvgPage& page, const ResultDrawing& drawing, std::size_t index,
 std::string svgOf(const ResultDrawing& drawing) {
     SvgPage page(boxOf(drawing));
     page.begin(styleRules(drawing, page.diagonal()), legendOf(drawing));
-    const std::vector<std::optional<int>> depths = nestingDepths(drawing.contours);
-    for (std::size_t i = 0; i < drawing.contours.size(); ++i)
-        drawContour(page, drawing, i, depths[i].value_or(0) % 2 == 0);
+    const std::vector<std::size_t> depths = gmpart::nestingOf(drawing.contours).depths;
+    for (std::size_t i = 0; i < drawing.contours.size(); ++i) {
+        const bool outline = !drawing.contours[i].closed || depths[i] % 2 == 0;
+        drawContour(page, drawing, i, outline);
+    }
     for (std::size_t i = 0; drawing.replacesSources && i < drawing.contours.size(); ++i)
         drawResults(page, drawing.results[i]);
     return page.finish();

@@ -4,14 +4,14 @@
 #include <algorithm>
 #include <utility>
 
-#include "region/model/Area.h"
+#include "part/model/Area.h"
 
 namespace gmdrawing {
 
 using gmregion::Box;
 using gmregion::Element;
-using gmregion::Path;
-using gmregion::Sense;
+using gmpart::Path;
+using gmpart::Sense;
 using gmregion::Vec2;
 
 namespace {

@@ -6,7 +6,7 @@
 #include <vector>
 
 #include "drawing/svg/SvgWriter.h"
-#include "region/model/Box.h"
+#include "part/model/Path.h"
 
 namespace gmdrawing {
 
@@ -31,16 +31,16 @@ public:
     /// are left out.
     void begin(const std::string& rules, std::vector<SvgLegendEntry> legend);
 
-    void draw(const gmregion::Path& path, const std::string& styleClass);
+    void draw(const gmpart::Path& path, const std::string& styleClass);
     void circle(gmregion::Vec2 m, double r, const std::string& styleClass);
 
     /// A dot at the start of a path and an arrow head a little further along it, small beside small
     /// paths. Nothing for a path without elements.
-    void startMark(const gmregion::Path& path, const std::string& styleClass);
+    void startMark(const gmpart::Path& path, const std::string& styleClass);
 
     /// The path's number beside its start, inside of what a closed path encloses or outside of it;
     /// right of the direction of travel where there is no inside. The text stands upright.
-    void numberLabel(const gmregion::Path& path, const std::string& number, bool inside);
+    void numberLabel(const gmpart::Path& path, const std::string& number, bool inside);
 
     /// Writes the legend and hands out the whole picture.
     std::string finish();
@@ -60,6 +60,6 @@ private:
 };
 
 /// The course of a path as SVG path data, with y turned downwards as the picture needs it.
-std::string svgPathData(const gmregion::Path& path);
+std::string svgPathData(const gmpart::Path& path);
 
 }  // namespace gmdrawing

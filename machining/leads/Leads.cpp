@@ -18,8 +18,8 @@ namespace gmmachining {
 
 using gmbridge::kernelPoint;
 using gmbridge::planePoint;
+using gmpart::Path;
 using gmregion::Element;
-using gmregion::Path;
 using gmregion::Vec2;
 
 namespace {

@@ -25,15 +25,15 @@ enum class LeadEnd { kApproach, kDeparture };
 
 /// A lead that keeps clear of the part.
 struct Lead {
-    gmregion::Path path;  ///< ends, or starts, exactly at the end of the cut; empty without a lead
-    double size = 0.0;    ///< length or radius that is left
+    gmpart::Path path;  ///< ends, or starts, exactly at the end of the cut; empty without a lead
+    double size = 0.0;  ///< length or radius that is left
     bool shortened = false;
     bool tooSmall = false;  ///< there is none because one of the size asked for cannot be built
 };
 
 /// The lead to the start of a cut or off its end. When it comes nearer to an obstacle than the
 /// clearance it is halved in size, up to six times; then it is left out.
-Lead clearLead(const gmregion::Path& cut, LeadEnd end, const LeadShape& shape, PartSide part,
+Lead clearLead(const gmpart::Path& cut, LeadEnd end, const LeadShape& shape, PartSide part,
                const Obstacles& obstacles, double clearance);
 
 }  // namespace gmmachining

@@ -3,8 +3,8 @@
 
 namespace gmmachining {
 
+using gmpart::Path;
 using gmregion::kKernelTolerance;
-using gmregion::Path;
 using gmregion::Vec2;
 
 MoveRecorder::MoveRecorder(double safeZ) : m_safeZ(safeZ) {

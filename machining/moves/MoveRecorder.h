@@ -24,7 +24,7 @@ public:
     void plungeTo(double z);
 
     /// Follows a path from where the tool is, at its height. Nothing for a path without elements.
-    void follow(MoveKind kind, const gmregion::Path& path);
+    void follow(MoveKind kind, const gmpart::Path& path);
 
     /// Rises to the safe height, unless the tool is there.
     void lift();

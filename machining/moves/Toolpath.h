@@ -4,7 +4,7 @@
 #include <cstddef>
 #include <vector>
 
-#include "region/model/Path.h"
+#include "part/model/Path.h"
 
 namespace gmmachining {
 
@@ -19,7 +19,7 @@ enum class MoveKind {
 /// the path has no elements.
 struct Move {
     MoveKind kind;
-    gmregion::Path path;
+    gmpart::Path path;
     double z;
     std::size_t contour;  ///< index of the contour that it serves
 };

@@ -2,7 +2,7 @@
 /// @file
 /// Cutting from the inside out.
 ///
-/// Every contour counts those inside it that are still to be cut, and is ready when there are none.
+/// Every unit counts those inside it that are still to be cut, and is ready when there are none.
 /// It does not choose among those that are ready. Cost: linear in the pairs that lie in one
 /// another.
 
@@ -27,12 +27,16 @@ std::vector<std::size_t> CutOrder::ready() const {
     for (std::size_t i = 0; i < m_holders.size(); ++i) {
         if (!m_finished[i] && m_heldUncut[i] == 0) found.push_back(i);
     }
+    if (!found.empty()) return found;
+    for (std::size_t i = 0; i < m_holders.size(); ++i) {
+        if (!m_finished[i]) found.push_back(i);
+    }
     return found;
 }
 
-void CutOrder::finish(std::size_t contour) {
-    m_finished[contour] = true;
-    for (const std::size_t holder : m_holders[contour])
+void CutOrder::finish(std::size_t unit) {
+    m_finished[unit] = true;
+    for (const std::size_t holder : m_holders[unit])
         --m_heldUncut[holder];
 }
 

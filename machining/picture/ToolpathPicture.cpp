@@ -10,8 +10,9 @@ namespace gmmachining {
 using gmdrawing::SvgLegendEntry;
 using gmdrawing::SvgPage;
 using gmdrawing::svgRule;
+using gmpart::OffsetPath;
+using gmpart::Path;
 using gmregion::Box;
-using gmregion::Path;
 using gmregion::Vec2;
 
 namespace {
@@ -36,10 +37,8 @@ Box boxOf(const std::vector<Path>& contours, const ToolpathResult& result) {
     for (const Move& move : result.moves) {
         if (move.kind != MoveKind::kRapid) box.include(boundingBox(move.path));
     }
-    for (const ContourCut& cut : result.contours) {
-        for (const Path& path : cut.doubtful)
-            box.include(boundingBox(path));
-    }
+    for (const OffsetPath& faulty : result.offsets.paths)
+        box.include(boundingBox(faulty.path));
     return box;
 }
 
@@ -48,9 +47,8 @@ std::vector<SvgLegendEntry> legendOf(const ToolpathResult& result) {
                                           {"cuts", kCutColour},
                                           {"leads", kLeadColour},
                                           {"rapid moves", kRapidColour}};
-    const bool doubtful = std::any_of(result.contours.begin(), result.contours.end(),
-                                      [](const ContourCut& cut) { return !cut.doubtful.empty(); });
-    if (doubtful) legend.insert(legend.begin() + 1, {"dashed: faulty", kSourceColour});
+    if (!result.offsets.paths.empty())
+        legend.insert(legend.begin() + 1, {"dashed: faulty", kSourceColour});
     return legend;
 }
 
@@ -111,10 +109,8 @@ std::string svgOf(const std::vector<Path>& contours, const ToolpathResult& resul
     for (const Path& contour : contours)
         page.draw(contour, "source");
     drawMoves(page, result.moves);
-    for (const ContourCut& cut : result.contours) {
-        for (const Path& path : cut.doubtful)
-            page.draw(path, "doubtful");
-    }
+    for (const OffsetPath& faulty : result.offsets.paths)
+        page.draw(faulty.path, "doubtful");
     return page.finish();
 }
 

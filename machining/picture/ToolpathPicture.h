@@ -12,6 +12,6 @@ namespace gmmachining {
 /// arrow head mark start and direction of every cut, a circle every place where the tool goes down.
 /// Of cuts on several levels the lowest is drawn. Offsets with a fault, which are not cut, are
 /// dashed.
-std::string svgOf(const std::vector<gmregion::Path>& contours, const ToolpathResult& result);
+std::string svgOf(const std::vector<gmpart::Path>& contours, const ToolpathResult& result);
 
 }  // namespace gmmachining

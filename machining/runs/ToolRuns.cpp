@@ -2,73 +2,83 @@
 /// @file
 /// Offsets as a tool runs along them.
 ///
-/// On which side of a run the contour lies is measured, since an offset may run either way: a small
-/// step off its longest element comes nearer to the contour on one side. So the sense holds also
-/// for paths that cross themselves or have no inside.
+/// Loops of regions have on their left what they cover, which is the grown part. So those of one
+/// side only have to be turned for the other.
 
 #include "machining/runs/ToolRuns.h"
 
-#include <cmath>
-#include <optional>
+#include <algorithm>
+#include <utility>
 
-#include "machining/runs/RunStart.h"
-#include "region/model/PathStart.h"
-#include "region/offset/CheckedOffset.h"
+#include "part/model/Area.h"
+#include "part/model/PathStart.h"
 
 namespace gmmachining {
 
-using gmregion::CheckedOffset;
+using gmpart::OffsetPath;
+using gmpart::Path;
+using gmpart::PathPlace;
 using gmregion::Element;
-using gmregion::KernelOffset;
-using gmregion::Path;
-using gmregion::PathPlace;
 using gmregion::Vec2;
 
 namespace {
 
-/// A start that lies this near to a run is a point of it.
-constexpr double kSamePlace = 1e-3;
+constexpr std::size_t kNoRun = static_cast<std::size_t>(-1);
 
-/// True when the contour lies right of the offset at the distance d from it: stepping to the right
-/// off the longest element comes nearer to the contour.
-bool liesOnRight(const Path& contour, const Path& offset, double d) {
-    constexpr double kStepOfDistance = 0.01;
-    const Element& longest = longestElement(offset);
-    const Vec2 p = halvingPoint(longest);
-    // The chord of an arc runs like the tangent at its halving point.
-    const Vec2 step = kStepOfDistance * std::abs(d) * rightNormal(unit(longest.ep - longest.sp));
-    return distance(contour, p + step) < distance(contour, p - step);
+/// Both points beside the start of a contour at a distance; a run comes by one of them.
+std::vector<Vec2> besideStart(const Path& contour, double d) {
+    const Element& first = contour.elements.front();
+    const Vec2 by = d * rightNormal(tangentStart(first));
+    return {first.sp + by, first.sp - by};
 }
 
-ToolRun runAlong(const Path& contour, Path offset, double d, PartSide side) {
-    const bool onRight = liesOnRight(contour, offset, d);
-    if (onRight != (side == PartSide::kRight)) offset = reversed(offset);
-    return {std::move(offset), false};
+/// A run and where it comes nearest to a point.
+struct RunPlace {
+    std::size_t run = kNoRun;
+    PathPlace place{};
+    double distance = HUGE_VAL;
+};
+
+RunPlace nearer(const RunPlace& a, const RunPlace& b) {
+    return b.distance < a.distance ? b : a;
 }
 
-/// Starts the closed run that the point lies on there; runs that do not reach it stay as they are.
-void fixStart(std::vector<ToolRun>& runs, Vec2 start) {
-    for (ToolRun& run : runs) {
-        if (!run.path.closed) continue;
-        const PathPlace place = nearestPlace(run.path, start);
-        if (distance(place.point, start) > kSamePlace) continue;
-        run = {startedAt(run.path, place), true};
-        return;
+/// Lets one run of each contour begin beside the contour's start.
+void fixStarts(std::vector<ToolRun>& runs, const std::vector<Path>& contours, double d) {
+    std::vector<RunPlace> starts(contours.size());
+    for (std::size_t run = 0; run < runs.size(); ++run) {
+        const std::size_t contour = runs[run].contours.front();
+        for (const Vec2 wanted : besideStart(contours[contour], d)) {
+            const PathPlace place = nearestPlace(runs[run].path, wanted);
+            starts[contour] = nearer(starts[contour], {run, place, distance(place.point, wanted)});
+        }
+    }
+    for (const RunPlace& start : starts) {
+        if (start.run == kNoRun || !runs[start.run].path.closed) continue;
+        runs[start.run].path = startedAt(runs[start.run].path, start.place);
+        runs[start.run].startFixed = true;
     }
 }
 
 }  // namespace
 
-ToolRuns toolRuns(const Path& contour, double d, PartSide side) {
-    CheckedOffset checked = offsetChecked(contour, d);
-    KernelOffset& offset = checked.offset;
-    ToolRuns result{{}, offset.refusal, checked.fault};
-    const std::optional<Vec2> start = runStart(contour, d, offset);
-    for (Path& path : offset.results)
-        result.runs.push_back(runAlong(contour, std::move(path), d, side));
-    if (start) fixStart(result.runs, *start);
-    for (ToolRun& run : result.runs)
-        run.startFixed = run.startFixed || !run.path.closed;
+ToolRuns toolRuns(const std::vector<Path>& contours, const std::vector<double>& distances,
+                  PartSide side, const gmpart::ProgressCall& progress) {
+    ToolRuns result;
+    result.rest = offsetPart(contours, {gmpart::Side::kWaste, distances, {}, false}, progress);
+    result.passes.resize(distances.size());
+    std::vector<OffsetPath> doubtful;
+    for (OffsetPath& offset : result.rest.paths) {
+        if (offset.doubtful) {
+            doubtful.push_back(std::move(offset));
+            continue;
+        }
+        Path path = side == PartSide::kRight ? reversed(offset.path) : std::move(offset.path);
+        result.passes[offset.pass].push_back({std::move(path), std::move(offset.contours)});
+    }
+    result.rest.paths = std::move(doubtful);
+    for (std::size_t pass = 0; pass < distances.size(); ++pass)
+        fixStarts(result.passes[pass], contours, distances[pass]);
     return result;
 }
 

@@ -29,11 +29,4 @@ Box boundingBox(const Element& e) {
     return box;
 }
 
-Box boundingBox(const Path& path) {
-    Box box;
-    for (const Element& e : path.elements)
-        box.include(boundingBox(e));
-    return box;
-}
-
 }  // namespace gmregion

@@ -3,7 +3,7 @@
 
 #include <algorithm>
 
-#include "region/model/Path.h"
+#include "region/model/Element.h"
 
 namespace gmregion {
 
@@ -43,6 +43,5 @@ struct Box {
 
 /// Exact bounding box, arcs included up to their extreme points.
 Box boundingBox(const Element& e);
-Box boundingBox(const Path& path);
 
 }  // namespace gmregion

@@ -96,7 +96,7 @@ std::vector<std::pair<std::string, std::string>> unusableCommands() {
         {"corners " + kBracket + " --radius 1 --chamfer 2 -o a.svg", "Exactly 1"},
         {"corners " + kBracket + " --radius 1 --bend nan -o a.svg", "--bend"},
         {"corners " + kBracket + " --chamfer-length nan -o a.svg", "--chamfer-length"},
-        {"melt " + kBracket + " -o a.svg", "SECOND"},
+        {"melt " + kBracket + " -o a.svg", "PARTS"},
         {"melt " + kBracket + " none.dxf -o a.svg", "none.dxf"},
         {"melt bare.dxf " + kBracket + " -o a.svg", "bare.dxf"},
         {"melt " + kBracket + " " + kBracket + " -o a.ngc", ".svg or .dxf"},
@@ -157,47 +157,65 @@ TEST_F(Program, CornersAndMeltSayWhatTheyDid) {
     EXPECT_EQ(std::count(rounded.out.begin(), rounded.out.end(), '\n'), 3) << "no sources beside";
     const Outcome melt = run("melt a.dxf b.dxf -o m.svg -o m.dxf");
     EXPECT_EQ(melt.exitCode, 0);
-    EXPECT_EQ(melt.out,
-              "A1 + B1: 2 loops (1 outline, 1 common part)\nA1 + B2: no loops, B2 lies inside\n"
-              "2 pairs, 1 melted\n");
+    EXPECT_EQ(
+        melt.out,
+        "outlines: 1 outline, 0 holes, area 160\ncommon parts: 2 outlines, 0 holes, area 25\n");
     EXPECT_NE(run("info m.dxf").out.find("COMMON"), std::string::npos);
     EXPECT_NE(m_scratch.content("m.svg").find("id=\"contour-B2\""), std::string::npos);
-    // Flush along two sides: the kernel's loops leave out the outline.
     m_scratch.store("c.dxf", drawing(lightPolyline(rectangle({5, 0}, {15, 10}).elements, true)));
-    const Outcome flush = run("melt a.dxf c.dxf -o m.svg");
-    EXPECT_EQ(flush.exitCode, 1);
-    EXPECT_EQ(flush.err, "gmpath: A1 + B1: the loops are not outline and common parts\n");
+    EXPECT_EQ(run("union a.dxf c.dxf -o m.dxf").out, "union: 1 outline, 0 holes, area 150\n");
+    EXPECT_EQ(run("intersect a.dxf c.dxf -o m.dxf").out,
+              "common part: 1 outline, 0 holes, area 50\n");
+    EXPECT_EQ(run("subtract a.dxf b.dxf c.dxf -o m.dxf").out,
+              "difference: 1 outline, 1 hole, area 49\n");
 }
 
-TEST_F(Program, FaultyOffsetsAreNamedAndDashed) {
-    // A polygon that crosses itself has no closed offset.
+TEST_F(Program, OffsetsThatMeetAndPlacesOnTheVergeAreTold) {
+    using drawing_text::drawing;
+    using drawing_text::lightPolyline;
+    m_scratch.store("a.dxf", drawing(lightPolyline(rectangle({0, 0}, {10, 10}).elements, true) +
+                                     lightPolyline(rectangle({14, 0}, {24, 10}).elements, true)));
+    const Outcome met = run("offset a.dxf --distance 3 -o a.svg");
+    EXPECT_EQ(met.exitCode, 0);
+    EXPECT_EQ(met.out, "2 contours, 1 offset\n");
+    EXPECT_EQ(met.err,
+              "gmpath: a.dxf: the offsets at distance 3 of contours 1 and 2 meet and are one\n");
+    EXPECT_EQ(run("offset a.dxf --distance 3 --each -o a.svg").out, "2 contours, 2 offsets\n");
+    EXPECT_NE(run("offset a.dxf --distance 2 -o a.svg").err.find("just twice as wide"),
+              std::string::npos);
+    const Outcome cut = run("toolpath a.dxf --tool 6 -o a.svg");
+    EXPECT_EQ(cut.exitCode, 1);
+    EXPECT_EQ(cut.err,
+              "gmpath: a.dxf: contours 1 and 2 cut as one: the tool does not fit between them\n");
+}
+
+TEST_F(Program, FaultyOffsetsOfTheKernelAreNamedAndDashed) {
+    // Of a polygon that crosses itself the kernel makes no closed offset; regions do.
     const std::vector<gmregion::Element> crossing = {
         {{0, 0}, {}}, {{20, 12}, {}}, {{20, 0}, {}}, {{0, 10}, {}}};
     m_scratch.store("a.dxf", drawing_text::drawing(drawing_text::lightPolyline(crossing, true)));
-    const Outcome offset = run("offset a.dxf --distance 1 --side left -o a.svg -o b.dxf");
+    EXPECT_EQ(run("offset a.dxf --distance 1 --side left -o a.svg").exitCode, 0);
+    EXPECT_EQ(m_scratch.content("a.svg").find("dashed: faulty"), std::string::npos);
+    const Outcome offset =
+        run("offset a.dxf --engine kernel --distance 1 --side left -o a.svg -o b.dxf");
     EXPECT_EQ(offset.exitCode, 1);
-    EXPECT_EQ(offset.err, "gmpath: a.dxf: contour 1: the offset by 1 to the left is not closed\n");
+    EXPECT_EQ(offset.err.find("gmpath: a.dxf: contour 1: the offset at distance 1 is faulty: "), 0U)
+        << offset.err;
     EXPECT_EQ(m_scratch.files(), 3U);
     const std::string svg = m_scratch.content("a.svg");
     EXPECT_NE(svg.find("class=\"result pass-1 doubtful\""), std::string::npos);
     EXPECT_NE(svg.find("dashed: faulty"), std::string::npos);
-    run("offset a.dxf --distance 0 -o a.svg");
-    EXPECT_EQ(m_scratch.content("a.svg").find("dashed: faulty"), std::string::npos);
 }
 
 TEST_F(Program, RefusedContoursAreToldWithTheCause) {
     const std::vector<gmregion::Element> touching = {
         {{0, 0}, {}}, {{10, 0}, {}}, {{10, 10}, {}}, {{0.00005, 0}, {}}};
     m_scratch.store("a.dxf", drawing_text::drawing(drawing_text::lightPolyline(touching, false)));
-    for (const std::string command :
-         {"offset a.dxf --distance 1 -o b.svg", "corners a.dxf --radius 1 -o b.svg",
-          "toolpath a.dxf --tool 1 -o b.svg"}) {
-        const Outcome outcome = run(command + " --join 1e-6");
-        EXPECT_EQ(outcome.exitCode, 1) << command;
-        EXPECT_NE(outcome.err.find("gmpath: a.dxf: contour 1: "), std::string::npos);
-        EXPECT_NE(outcome.err.find("open, but its end comes within 0.0001 of its start"),
-                  std::string::npos);
-    }
+    const Outcome outcome = run("corners a.dxf --radius 1 -o b.svg --join 1e-6");
+    EXPECT_EQ(outcome.exitCode, 1);
+    EXPECT_NE(outcome.err.find("gmpath: a.dxf: contour 1: "), std::string::npos);
+    EXPECT_NE(outcome.err.find("open, but its end comes within 0.0001 of its start"),
+              std::string::npos);
     EXPECT_EQ(run("offset a.dxf --distance 1 -o b.svg").exitCode, 0) << "closed by the joining";
 }
 

@@ -5,9 +5,10 @@
 #include <rapidcheck/gtest.h>
 
 #include "drawing/InputError.h"
-#include "region/model/Area.h"
+#include "part/model/Area.h"
 #include "tests/support/PathShapes.h"
 
+using namespace gmpart;
 using namespace gmregion;
 using namespace gmdrawing;
 using path_shapes::circle;

@@ -9,6 +9,7 @@
 #include "tests/support/PathShapes.h"
 
 using namespace gmdrawing;
+using namespace gmpart;
 using namespace gmregion;
 using path_shapes::circle;
 using path_shapes::polygon;

@@ -9,10 +9,11 @@
 #include <set>
 
 #include "drawing/InputError.h"
-#include "region/model/Placement.h"
+#include "part/model/Placement.h"
 #include "tests/support/PathShapes.h"
 
 using namespace gmdrawing;
+using namespace gmpart;
 using namespace gmregion;
 using path_shapes::polygon;
 

@@ -10,6 +10,7 @@
 #include "tests/support/DrawingText.h"
 #include "tests/support/PathShapes.h"
 
+using namespace gmpart;
 using namespace gmregion;
 using namespace gmdrawing;
 using namespace drawing_text;

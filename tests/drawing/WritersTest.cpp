@@ -15,6 +15,7 @@
 #include "tests/support/PathShapes.h"
 #include "tests/support/Scratch.h"
 
+using namespace gmpart;
 using namespace gmregion;
 using namespace gmdrawing;
 using path_shapes::circle;

@@ -9,11 +9,12 @@
 #include "drawing/files/PartReader.h"
 #include "machining/ToolpathJob.h"
 #include "machining/gcode/GcodeWriter.h"
-#include "region/model/Area.h"
-#include "region/model/PathStart.h"
+#include "part/model/Area.h"
+#include "part/model/PathStart.h"
 #include "tests/support/GcodeReader.h"
 #include "tests/support/PathShapes.h"
 
+using namespace gmpart;
 using namespace gmregion;
 using namespace gmdrawing;
 using namespace gmmachining;
@@ -55,6 +56,17 @@ std::vector<Path> examplePart(const std::filesystem::path& file, double scale) {
     ReadOptions options;
     options.scale = scale;
     return readPart(file.string(), options).contours;
+}
+
+/// The least distance between a path and a contour, by points of the path.
+double clearanceBetween(const Path& path, const Path& contour) {
+    constexpr int kPoints = 50;
+    double nearest = HUGE_VAL;
+    for (const Element& e : path.elements) {
+        for (int i = 0; i < kPoints; ++i)
+            nearest = std::min(nearest, distance(contour, pointAt(e, 1.0 * i / kPoints)));
+    }
+    return nearest;
 }
 
 std::vector<Path> movesOfKind(const Toolpath& moves, MoveKind kind) {
@@ -202,7 +214,7 @@ TEST(Toolpath, LevelsOfAClosedCutFollowWithoutLifting) {
     EXPECT_EQ(heights, std::vector<double>({kSafeZ, -1, -2, -3, kSafeZ}));
     const std::vector<Path> cuts = movesOfKind(made.moves, MoveKind::kCut);
     ASSERT_EQ(cuts.size(), 3U);
-    // The start is the kernel's, beside the start of the contour, in either direction.
+    // The start is beside the start of the contour, in either direction.
     EXPECT_LT(distance(cuts[0].elements[0].sp, Vec2{10, 8}), 1e-6);
     asked.part = PartSide::kLeft;
     const ToolpathResult other = toolpath({rectangle({10, 10}, {30, 30})}, asked);
@@ -218,24 +230,29 @@ TEST(Toolpath, ATightHoleIsLeftOutAndTheRestIsCut) {
     EXPECT_EQ(movesOfKind(made.moves, MoveKind::kCut).size(), 1U);
 }
 
-TEST(Toolpath, CutsThroughNeighboursAndIslandsAreTold) {
+TEST(Toolpath, WhereTheToolDoesNotFitBetweenContoursTheyAreCutAsOne) {
     const std::vector<Path> contours = {rectangle({0, 0}, {60, 40}), rectangle({66, 0}, {80, 40}),
                                         rectangle({10, 10}, {50, 30}), circle({30, 20}, 3)};
-    const auto keepers = [&](double last, double first) {
+    const auto made = [&](double last, double first) {
         ToolpathRequest asked = request(last);
         asked.distances = {first, last};
-        std::vector<bool> kept;
-        for (const ContourCut& cut : toolpath(contours, asked).contours)
-            kept.push_back(cut.keepsOthers);
-        return kept;
+        return toolpath(contours, asked);
     };
-    EXPECT_EQ(keepers(2.9, 2.9), std::vector<bool>({true, true, true, true}));
-    EXPECT_EQ(keepers(3.1, 3.1), std::vector<bool>({false, false, true, true}));
-    EXPECT_EQ(keepers(1.0, 4.0), std::vector<bool>({true, true, true, true}));
-    EXPECT_EQ(keepers(2.9, 5.0), std::vector<bool>({false, false, false, false}));
+    using Together = std::vector<std::vector<std::size_t>>;
+    EXPECT_EQ(made(2.9, 2.9).together, Together());
+    EXPECT_EQ(made(3.1, 3.1).together, Together({{0, 1}}));
+    // Only the last pass parts contours.
+    const ToolpathResult wide = made(1.0, 4.0);
+    EXPECT_EQ(wide.together, Together());
+    // No cut goes through a neighbour, neither of a far pass.
+    for (const Path& cut : movesOfKind(made(2.9, 5.0).moves, MoveKind::kCut)) {
+        for (const Path& contour : contours)
+            EXPECT_GT(clearanceBetween(cut, contour), 2.9 - 1e-3);
+    }
+    EXPECT_EQ(movesOfKind(made(2.9, 5.0).moves, MoveKind::kCut).size(), 7U);
 }
 
-TEST(Obstacles, MarchAgreesWithDenseSamples) {
+TEST(Obstacles, AgreeWithDenseSamples) {
     const std::vector<Path> contours = {circle({0, 0}, 0.01), rectangle({5, -3}, {5.02, 3}),
                                         polygon({{-4, 2}, {-4, 8}, {2, 8}}, false)};
     const Obstacles obstacles(contours);

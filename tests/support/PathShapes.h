@@ -3,15 +3,15 @@
 
 #include <vector>
 
-#include "region/model/Path.h"
+#include "part/model/Path.h"
 
 /// Paths for tests.
 namespace path_shapes {
 
 using gmregion::kPi;
 
-inline gmregion::Path polygon(const std::vector<gmregion::Vec2>& corners, bool closed = true) {
-    gmregion::Path path{{}, closed, "0"};
+inline gmpart::Path polygon(const std::vector<gmregion::Vec2>& corners, bool closed = true) {
+    gmpart::Path path{{}, closed, "0"};
     for (std::size_t i = 0; i + 1 < corners.size(); ++i) {
         path.elements.push_back({corners[i], corners[i + 1]});
     }
@@ -20,13 +20,13 @@ inline gmregion::Path polygon(const std::vector<gmregion::Vec2>& corners, bool c
 }
 
 /// Counter-clockwise from the lower left corner.
-inline gmregion::Path rectangle(gmregion::Vec2 low, gmregion::Vec2 high) {
+inline gmpart::Path rectangle(gmregion::Vec2 low, gmregion::Vec2 high) {
     return polygon({low, {high.x, low.y}, high, {low.x, high.y}});
 }
 
-inline gmregion::Path circle(gmregion::Vec2 m, double r) {
-    gmregion::Path path{{}, true, "0"};
-    gmregion::appendArc(path.elements, m, r, 0.0, 2.0 * kPi);
+inline gmpart::Path circle(gmregion::Vec2 m, double r) {
+    gmpart::Path path{{}, true, "0"};
+    gmpart::appendArc(path.elements, m, r, 0.0, 2.0 * kPi);
     return path;
 }
 
