@@ -110,7 +110,7 @@ while IFS=: read -r file line; do
         failed=1
     fi
 done < <(grep -rHE --include='*.h' --include='*.cpp' '^[[:space:]]*#[[:space:]]*include' \
-    include kernel region bridge drawing machining apps)
+    include kernel region bridge part drawing machining apps)
 for room in "${!floors[@]}"; do
     [ -n "${seen[$room]:-}" ] || { echo "check-layers: found no include in $room" >&2; failed=1; }
 done

@@ -3,8 +3,7 @@
 /// Rounding and chamfering the corners of all contours.
 ///
 /// A corner is a joint that bends; whether it is convex follows from the sense of the whole
-/// contour. Corners are done from the last to the first, so that new elements do not move the
-/// indices of those still to do. Each is tried on a copy and kept if there is room: a corner done
+/// contour. Corners are done from the last to the first, each if there is room: a corner done
 /// earlier may take the room of a later one, and no best choice among them is sought.
 
 #include "part/corners/CornerJob.h"
@@ -31,14 +30,13 @@ bool isWanted(double turn, Sense sense, const CornerRequest& request) {
     return turnsWith == (request.choice == CornerChoice::kConvex);
 }
 
-CornerResult cornersBroken(const Path& contour, const CornerRoom& room,
+CornerResult cornersBroken(const Path& contour, std::size_t number, const CornerRoom& room,
                            const CornerRequest& request) {
     CornerResult result{contour};
-    CornerBreaker breaker(contour);
+    CornerBreaker breaker(contour, number);
     result.refusal = breaker.refusal();
     if (result.refusal != KernelRefusal::kNone) return result;
     const std::vector<std::size_t> corners = cornersOf(breaker.source(), request);
-    // From the last one to the first, so that new elements do not move the corners still to do.
     for (auto corner = corners.rbegin(); corner != corners.rend(); ++corner) {
         const bool done = breaker.breakCorner(*corner, request.kind, request.value, room);
         ++(done ? result.done : result.notDone);
@@ -64,8 +62,9 @@ std::vector<std::size_t> cornersOf(const Path& path, const CornerRequest& reques
 std::vector<CornerResult> breakCorners(const std::vector<Path>& contours,
                                        const CornerRequest& request) {
     std::vector<CornerResult> results;
+    const CornerRoom room(contours);
     for (std::size_t i = 0; i < contours.size(); ++i)
-        results.push_back(cornersBroken(contours[i], CornerRoom(contours, i), request));
+        results.push_back(cornersBroken(contours[i], i, room, request));
     return results;
 }
 

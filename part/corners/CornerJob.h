@@ -37,8 +37,8 @@ std::vector<std::size_t> cornersOf(const Path& path, const CornerRequest& reques
 
 /// Rounds or chamfers the corners of every contour, from the last corner of a contour to its first.
 /// A transition has room where it fits between its two elements and touches nothing else: neither
-/// the rest of its contour nor another contour. One result a contour. Cost: the square of the
-/// number of elements.
+/// the rest of its contour nor another contour. One result a contour. Cost:
+/// near-linear, and what lies near each corner.
 std::vector<CornerResult> breakCorners(const std::vector<Path>& contours,
                                        const CornerRequest& request);
 

@@ -2,10 +2,12 @@
 #pragma once
 
 #include <cstddef>
+#include <vector>
 
-#include "gmkernel/GmContour.h"
+#include "part/kernel/BoxedCurve.h"
 #include "part/kernel/CornerRoom.h"
 #include "part/kernel/PathConversion.h"
+#include "region/search/BoxRow.h"
 
 namespace gmpart {
 
@@ -16,10 +18,12 @@ enum class CornerKind {
     kChamferLength     ///< a chamfer of this length
 };
 
-/// A path as a contour of the kernel, which puts transitions into its corners one by one.
+/// A path as curves of the kernel, which puts transitions into its corners one by one.
 class CornerBreaker {
 public:
-    explicit CornerBreaker(const Path& path);
+    /// @param path a contour of the drawing
+    /// @param own its number there
+    CornerBreaker(const Path& path, std::size_t own);
 
     /// Why the path is refused; then no corner can be broken.
     KernelRefusal refusal() const { return m_refusal; }
@@ -27,18 +31,23 @@ public:
     /// The path without the elements that are too short for the kernel; its joints are the corners.
     const Path& source() const { return m_source.path; }
 
-    /// Puts a transition into the corner where the element `index` ends. False, and nothing has
-    /// changed, where it does not fit between its two elements or `room` does not allow it. The
-    /// indices behind a broken corner shift: break the last corner first.
+    /// Puts a transition into the corner where the element `index` of the source ends. False, and
+    /// nothing has changed, where it does not fit between its two elements, meets another part of
+    /// the contour, or `room` does not allow it. Cost: logarithmic, and what is near.
     bool breakCorner(std::size_t index, CornerKind kind, double value, const CornerRoom& room);
 
     /// The path with what has been done so far.
     Path result() const;
 
 private:
+    bool meetsOwn(const BoxedCurve& made, std::size_t index, double reach) const;
+
+    std::size_t m_own;
     SimplifiedPath m_source;
-    GmContour m_contour;
-    KernelRefusal m_refusal;
+    KernelRefusal m_refusal = KernelRefusal::kNone;
+    std::vector<BoxedCurve> m_elements;     ///< as cut back so far
+    std::vector<BoxedCurve> m_transitions;  ///< behind each element, without a curve where none is
+    gmregion::BoxRow m_boxes;               ///< of the elements as they were
 };
 
 }  // namespace gmpart

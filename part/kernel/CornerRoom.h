@@ -2,37 +2,37 @@
 #pragma once
 
 #include <cstddef>
-#include <memory>
 #include <vector>
 
-#include "gmkernel/GmContour.h"
+#include "part/kernel/BoxedCurve.h"
 #include "part/model/Path.h"
+#include "region/search/BoxRow.h"
 
 namespace gmpart {
 
-/// Tells whether the corners of a contour may be cut off without touching anything else: the rest
-/// of the contour and the other contours of the drawing.
+/// Tells whether the corners of a contour may be cut off without touching the other contours of
+/// the drawing.
 class CornerRoom {
 public:
-    /// The contours other than `own` are what must not be touched.
-    CornerRoom(const std::vector<Path>& contours, std::size_t own);
+    explicit CornerRoom(const std::vector<Path>& contours);
 
-    /// False when the element `index` of a contour, which has taken the place of its corner at
-    /// `corner`, meets an element of the contour other than its neighbours, meets another contour,
-    /// or cuts another contour off with the corner.
-    bool allows(const GmContour& contour, int index, Vec2 corner) const;
+    /// False when a curve that takes the place of a corner of the contour `own` meets another
+    /// contour, or cuts another contour off with the corner. Cost: logarithmic, and what is near.
+    bool allows(const BoxedCurve& made, Vec2 corner, std::size_t own) const;
 
 private:
     struct Obstacle {
-        Box box;
-        std::unique_ptr<GmCurve> curve;
+        BoxedCurve curve;
+        std::size_t contour;
     };
 
-    bool meetsObstacle(const GmCurve& element) const;
-    bool cutsOff(const GmCurve& element, Vec2 corner) const;
+    bool meetsObstacle(const BoxedCurve& made, std::size_t own) const;
+    bool cutsOff(const GmCurve& made, Vec2 corner, std::size_t own) const;
 
-    std::vector<Obstacle> m_obstacles;  ///< the elements of the other contours
-    std::vector<Vec2> m_starts;         ///< a point of each of the other contours
+    std::vector<Obstacle> m_obstacles;  ///< the elements of all contours
+    std::vector<Vec2> m_starts;         ///< a point of each contour
+    gmregion::BoxRow m_obstacleBoxes;
+    gmregion::BoxRow m_startBoxes;
 };
 
 }  // namespace gmpart
