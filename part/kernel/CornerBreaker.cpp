@@ -9,12 +9,23 @@
 
 #include "part/kernel/CornerBreaker.h"
 
+#include <algorithm>
+#include <optional>
+#include <utility>
+
 #include "gmbridge/Curves.h"
 #include "gmkernel/GmContour.h"
 
 namespace gmpart {
 
 namespace {
+
+/// What the kernel made of a corner.
+struct CornerTransition {
+    BoxedCurve made;
+    BoxedCurve first;   ///< the element before, cut back; without a curve when used up
+    BoxedCurve second;  ///< the element behind, the same
+};
 
 GmContour::eTransType kernelType(CornerKind kind) {
     switch (kind) {
@@ -28,6 +39,26 @@ GmContour::eTransType kernelType(CornerKind kind) {
     return GmContour::eTransRadius;
 }
 
+/// What the kernel makes of the corner between two curves; nothing where it makes nothing.
+std::optional<CornerTransition> transitionBetween(const GmCurve& first, const GmCurve& second,
+                                                  CornerKind kind, double value) {
+    GmContour contour;
+    contour.AddElement(first, false, 0);
+    contour.AddElement(second, false, 0);
+    if (contour.ElementCount() != 2 || !contour.AddTrans(kernelType(kind), 0, value, true)) {
+        return std::nullopt;
+    }
+    // Elements that are used up are gone from the contour.
+    CornerTransition found;
+    for (int i = 0; i < contour.ElementCount(); ++i) {
+        const bool isMade = contour.GetContElement(i)->bInserted;
+        BoxedCurve& curve = isMade ? found.made : found.made.curve ? found.second : found.first;
+        curve.take(*contour.GetElement(i));
+    }
+    if (!found.made.curve) return std::nullopt;
+    return found;
+}
+
 }  // namespace
 
 CornerBreaker::CornerBreaker(const Path& path, std::size_t own)
@@ -35,57 +66,63 @@ CornerBreaker::CornerBreaker(const Path& path, std::size_t own)
     GmContour contour;
     m_refusal = fillContour(contour, m_source);
     if (m_refusal != KernelRefusal::kNone) return;
-    m_elements.resize(m_source.path.elements.size());
-    m_transitions.resize(m_elements.size());
+    const std::size_t count = m_source.path.elements.size();
+    m_links.resize(2 * count);
     std::vector<Box> boxes;
-    for (std::size_t i = 0; i < m_elements.size(); ++i) {
-        m_elements[i].take(*contour.GetElement(static_cast<int>(i)));
-        boxes.push_back(m_elements[i].box);
+    for (std::size_t i = 0; i < count; ++i) {
+        m_links[i].curve.take(*contour.GetElement(static_cast<int>(i)));
+        m_links[i].previous = (i + count - 1) % count;
+        m_links[i].next = (i + 1) % count;
+        boxes.push_back(m_links[i].curve.box);
     }
     m_boxes.assign(boxes);
 }
 
 bool CornerBreaker::breakCorner(std::size_t index, CornerKind kind, double value,
                                 const CornerRoom& room) {
-    BoxedCurve& first = m_elements[index];
-    BoxedCurve& second = m_elements[(index + 1) % m_elements.size()];
-    GmContour corner;
-    corner.AddElement(first.curve.get(), false, 0);
-    corner.AddElement(second.curve.get(), false, 1);
-    if (corner.ElementCount() != 2 || !corner.AddTrans(kernelType(kind), 0, value, true)) {
-        return false;
-    }
-    constexpr long kWithTransition = 3;
-    if (corner.ElementCount() != kWithTransition || !corner.GetContElement(1)->bInserted) {
-        return false;
-    }
-    BoxedCurve made;
-    made.take(*corner.GetElement(1));
-    const Vec2 at = gmbridge::planePoint(first.curve->EP());
-    if (meetsOwn(made, index, 2.0 * value) || !room.allows(made, at, m_own)) return false;
-    first.take(*corner.GetElement(0));
-    second.take(*corner.GetElement(2));
-    m_transitions[index] = std::move(made);
+    // Where a transition has used the element up, it ends in the corner instead.
+    const std::size_t first = m_links[index].isGone() ? m_links[index].previous : index;
+    const std::size_t second = m_links[first].next;
+    std::optional<CornerTransition> found =
+        transitionBetween(*m_links[first].curve.curve, *m_links[second].curve.curve, kind, value);
+    if (!found) return false;
+    const std::size_t before = found->first.curve ? first : m_links[first].previous;
+    const std::size_t behind = found->second.curve ? second : m_links[second].next;
+    const Vec2 corner = gmbridge::planePoint(m_links[first].curve.curve->EP());
+    const std::array<std::size_t, 4> neighbours = {first, second, before, behind};
+    if (meetsOwn(found->made, 4.0 * value, neighbours)) return false;
+    if (!room.allows(found->made, corner, m_own)) return false;
+    m_links[first].curve = std::move(found->first);
+    m_links[second].curve = std::move(found->second);
+    const std::size_t made = transitionBehind(index);
+    m_links[made] = {std::move(found->made), before, behind};
+    m_links[before].next = made;
+    m_links[behind].previous = made;
     return true;
 }
 
-/// Whether a transition behind an element meets anything of the contour but its neighbours.
-bool CornerBreaker::meetsOwn(const BoxedCurve& made, std::size_t index, double reach) const {
-    const std::size_t next = (index + 1) % m_elements.size();
+/// Whether a transition meets anything of the contour but its neighbours.
+bool CornerBreaker::meetsOwn(const BoxedCurve& made, double reach,
+                             const std::array<std::size_t, 4>& neighbours) const {
+    const auto meetsLink = [&](std::size_t link) {
+        const auto* const end = neighbours.data() + neighbours.size();
+        return std::find(neighbours.data(), end, link) == end && !m_links[link].isGone() &&
+               meet(made, m_links[link].curve);
+    };
     const Box near = made.box.grown(reach + kKernelTolerance);
-    return m_boxes.anyOverlapping(near, [&](std::size_t i) {
-        if (i != index && i != next && meet(made, m_elements[i])) return true;
-        return i != index && m_transitions[i].curve && meet(made, m_transitions[i]);
+    return m_boxes.anyOverlapping(near, [&](std::size_t element) {
+        return meetsLink(element) || meetsLink(transitionBehind(element));
     });
 }
 
 Path CornerBreaker::result() const {
     GmContour contour;
     long id = 0;
-    for (std::size_t i = 0; i < m_elements.size(); ++i) {
-        contour.AddElement(m_elements[i].curve.get(), false, id++);
-        if (m_transitions[i].curve) {
-            contour.AddElement(m_transitions[i].curve.get(), false, id++);
+    for (std::size_t i = 0; i < m_links.size() / 2; ++i) {
+        for (const std::size_t link : {i, transitionBehind(i)}) {
+            if (!m_links[link].isGone()) {
+                contour.AddElement(m_links[link].curve.curve.get(), false, id++);
+            }
         }
     }
     return pathFromKernel(contour, m_source.path.layer).path;

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include <array>
 #include <cstddef>
 #include <vector>
 
@@ -40,14 +41,24 @@ public:
     Path result() const;
 
 private:
-    bool meetsOwn(const BoxedCurve& made, std::size_t index, double reach) const;
+    /// A curve of the contour as it stands; those that transitions have used up are gone.
+    struct Link {
+        BoxedCurve curve;
+        std::size_t previous = 0;
+        std::size_t next = 0;
+
+        bool isGone() const { return !curve.curve; }
+    };
+
+    std::size_t transitionBehind(std::size_t element) const { return m_links.size() / 2 + element; }
+    bool meetsOwn(const BoxedCurve& made, double reach,
+                  const std::array<std::size_t, 4>& neighbours) const;
 
     std::size_t m_own;
     SimplifiedPath m_source;
     KernelRefusal m_refusal = KernelRefusal::kNone;
-    std::vector<BoxedCurve> m_elements;     ///< as cut back so far
-    std::vector<BoxedCurve> m_transitions;  ///< behind each element, without a curve where none is
-    gmregion::BoxRow m_boxes;               ///< of the elements as they were
+    std::vector<Link> m_links;  ///< the elements, then the transitions behind each
+    gmregion::BoxRow m_boxes;   ///< of the elements as they were
 };
 
 }  // namespace gmpart
