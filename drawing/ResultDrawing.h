@@ -24,7 +24,7 @@ struct PassName {
 
 /// Source contours and what came of them, as the writers put them into a file.
 struct ResultDrawing {
-    std::vector<gmpart::Path> contours;          ///< at least one
+    std::vector<gmpart::Path> contours;            ///< at least one
     std::vector<std::vector<ResultPath>> results;  ///< one entry a contour
     std::vector<PassName> passes;
     /// One entry a contour, of letters and digits; without entries contours are numbered from 1.

@@ -4,6 +4,7 @@
 #include <CLI/CLI.hpp>
 #include <vector>
 
+#include "apps/gmpath/CleanCommand.h"
 #include "apps/gmpath/CombineCommands.h"
 #include "apps/gmpath/CornersCommand.h"
 #include "apps/gmpath/InfoCommand.h"
@@ -47,8 +48,8 @@ int runCommandLine(int argc, const char* const* argv, const Console& console) {
     program.set_version_flag("--version", std::string("gmpath ") + GMPATH_VERSION);
     program.require_subcommand(1);
     program.footer("Example: gmpath offset bracket.dxf --distance 3 -o bracket.svg");
-    std::vector<Command> commands = {addInfo(program), addOffset(program), addCorners(program),
-                                     addToolpath(program)};
+    std::vector<Command> commands = {addInfo(program), addClean(program), addOffset(program),
+                                     addCorners(program), addToolpath(program)};
     for (Command& combination : addCombinations(program))
         commands.push_back(std::move(combination));
     try {

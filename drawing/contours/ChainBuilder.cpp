@@ -15,14 +15,16 @@
 
 #include "drawing/contours/Duplicates.h"
 #include "drawing/contours/Junctions.h"
+#include "drawing/contours/Overlaps.h"
 #include "part/model/Area.h"
 #include "part/model/ShortElements.h"
 
 namespace gmdrawing {
 
+using gmpart::Path;
 using gmregion::Element;
 using gmregion::kKernelTolerance;
-using gmpart::Path;
+using gmregion::Vec2;
 
 namespace {
 
@@ -59,8 +61,9 @@ Path canonical(Path path) {
 /// Walks along joined ends and collects the pieces into chains.
 class Walk {
 public:
-    Walk(std::vector<Path> pieces, double tolerance)
-        : m_pieces(std::move(pieces)),
+    Walk(std::vector<Path> pieces, double tolerance, MendReport& mended)
+        : m_mended(mended),
+          m_pieces(std::move(pieces)),
           m_joined(joinEnds(m_pieces, tolerance)),
           m_used(m_pieces.size(), false) {}
 
@@ -91,6 +94,7 @@ private:
             end = m_joined[otherEnd(*end)];
         }
         chain.path.closed = end.has_value();
+        countGaps(chain.path);
         meetEnds(chain.path);
         if (pieces > 1) chain.path = canonical(std::move(chain.path));
         return chain;
@@ -100,13 +104,24 @@ private:
         chain.elements.insert(chain.elements.end(), piece.elements.begin(), piece.elements.end());
     }
 
+    void countGaps(const Path& chain) {
+        const std::vector<Element>& elements = chain.elements;
+        for (std::size_t i = chain.closed ? 0 : 1; i < elements.size(); ++i) {
+            const Vec2 before = elements[i == 0 ? elements.size() - 1 : i - 1].ep;
+            if (elements[i].sp == before) continue;
+            ++m_mended.gaps;
+            m_mended.largestGap = std::max(m_mended.largestGap, distance(before, elements[i].sp));
+        }
+    }
+
+    MendReport& m_mended;
     std::vector<Path> m_pieces;
     std::vector<std::optional<PathEnd>> m_joined;
     std::vector<bool> m_used;
 };
 
 /// The contours of all paths in drawing order; closed paths are contours as they stand.
-std::vector<Path> joinOpenPaths(std::vector<Path> paths, double tolerance) {
+std::vector<Path> joinOpenPaths(std::vector<Path> paths, double tolerance, MendReport& mended) {
     std::vector<OrderedContour> contours;
     std::vector<Path> open;
     std::vector<std::size_t> placeInDrawing;
@@ -118,7 +133,7 @@ std::vector<Path> joinOpenPaths(std::vector<Path> paths, double tolerance) {
             placeInDrawing.push_back(i);
         }
     }
-    for (OrderedContour& chain : Walk(std::move(open), tolerance).chains()) {
+    for (OrderedContour& chain : Walk(std::move(open), tolerance, mended).chains()) {
         contours.push_back({placeInDrawing[chain.earliest], std::move(chain.path)});
     }
     std::sort(contours.begin(), contours.end(),
@@ -131,11 +146,15 @@ std::vector<Path> joinOpenPaths(std::vector<Path> paths, double tolerance) {
 
 }  // namespace
 
-ChainResult buildChains(std::vector<Path> paths, double tolerance) {
+ChainResult buildChains(std::vector<Path> paths, double tolerance, bool withoutOverlaps) {
     ChainResult result;
     result.skipped.shortElements = dropShort(paths);
     result.skipped.duplicates = dropDuplicates(paths);
-    result.contours = joinOpenPaths(std::move(paths), tolerance);
+    result.contours = joinOpenPaths(std::move(paths), tolerance, result.mended);
+    if (withoutOverlaps) {
+        result.mended.overlaps = trimOverlaps(result.contours, tolerance);
+        result.contours = joinOpenPaths(std::move(result.contours), tolerance, result.mended);
+    }
     // Ends that were moved to meet may have left an element too short.
     result.skipped.shortElements += dropShort(result.contours);
     return result;

@@ -3,6 +3,7 @@
 
 #include <vector>
 
+#include "drawing/MendReport.h"
 #include "drawing/SkipReport.h"
 #include "part/model/Path.h"
 
@@ -12,6 +13,7 @@ namespace gmdrawing {
 struct ChainResult {
     std::vector<gmpart::Path> contours;
     SkipReport skipped;
+    MendReport mended;
 };
 
 /// Builds contours from paths as drawn: drops elements that are too short and paths drawn twice,
@@ -22,6 +24,12 @@ struct ChainResult {
 /// neither the order nor the sense of its pieces: when closed it runs counter-clockwise from its
 /// leftmost joint (the lowest of these), when open from the end that lies further left (lower).
 /// Contours come in the order of their earliest piece. Throws InputError as `joinEnds` does.
-ChainResult buildChains(std::vector<gmpart::Path> paths, double tolerance);
+///
+/// @param paths as drawn
+/// @param tolerance ends that lie at most this far apart are joined, in units of the paths
+/// @param withoutOverlaps what stays open is joined once more without the parts that lie on other
+/// elements within the tolerance (`trimOverlaps`)
+ChainResult buildChains(std::vector<gmpart::Path> paths, double tolerance,
+                        bool withoutOverlaps = false);
 
 }  // namespace gmdrawing

@@ -17,11 +17,11 @@
 
 namespace gmdrawing {
 
+using gmpart::Path;
 using gmregion::Box;
 using gmregion::Element;
 using gmregion::isArc;
 using gmregion::kKernelTolerance;
-using gmpart::Path;
 using gmregion::PointGrid;
 using gmregion::Vec2;
 

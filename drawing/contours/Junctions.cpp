@@ -21,8 +21,8 @@
 
 namespace gmdrawing {
 
-using gmregion::Element;
 using gmpart::Path;
+using gmregion::Element;
 using gmregion::PointGrid;
 using gmregion::Vec2;
 

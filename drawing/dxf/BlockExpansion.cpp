@@ -16,9 +16,9 @@
 
 namespace gmdrawing {
 
-using gmregion::Element;
 using gmpart::Path;
 using gmpart::Placement;
+using gmregion::Element;
 using gmregion::Vec2;
 
 namespace {

@@ -27,7 +27,7 @@ struct BlockReference {
 /// What a block, or the drawing itself, holds, in drawing order.
 struct Block {
     gmregion::Vec2 base;                     ///< the point that comes to lie where it is placed
-    std::vector<gmpart::Path> paths;       ///< lines, arcs, circles, polylines as drawn
+    std::vector<gmpart::Path> paths;         ///< lines, arcs, circles, polylines as drawn
     std::vector<BlockReference> references;  ///< blocks placed inside
     SkipReport skipped;                      ///< entities that cannot be used
 };

@@ -7,9 +7,9 @@ namespace gmdrawing {
 
 using gmpart::appendArc;
 using gmpart::appendBulge;
+using gmpart::Path;
 using gmregion::Element;
 using gmregion::kPi;
-using gmpart::Path;
 
 namespace {
 

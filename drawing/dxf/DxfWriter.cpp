@@ -13,8 +13,8 @@
 
 namespace gmdrawing {
 
-using gmregion::Element;
 using gmpart::Path;
+using gmregion::Element;
 using gmregion::Vec2;
 
 namespace {

@@ -54,9 +54,10 @@ Part partFromText(const std::string& text, const ReadOptions& options) {
     const std::vector<DxfGroup> groups = dxfGroups(text);
     const Drawing drawing = readSanitized(sanitizedDrawing(groups));
     ExpandedDrawing expanded = expandBlocks(drawing, Placement::scaling(options.scale));
-    ChainResult chains =
-        buildChains(std::move(expanded.paths), options.joinTolerance * options.scale);
-    Part part{std::move(chains.contours), std::move(expanded.skipped), drawingUnits(groups)};
+    ChainResult chains = buildChains(
+        std::move(expanded.paths), options.joinTolerance * options.scale, options.withoutOverlaps);
+    Part part{std::move(chains.contours), std::move(expanded.skipped), chains.mended,
+              drawingUnits(groups)};
     add(part.skipped, chains.skipped);
     if (part.contours.empty()) failWithoutContours(part.skipped);
     return part;

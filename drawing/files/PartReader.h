@@ -5,6 +5,7 @@
 #include <vector>
 
 #include "drawing/DrawingUnits.h"
+#include "drawing/MendReport.h"
 #include "drawing/SkipReport.h"
 #include "part/model/Path.h"
 
@@ -15,12 +16,16 @@ struct ReadOptions {
     double joinTolerance = 1e-3;
     /// Factor from units of the drawing to units of the result; positive.
     double scale = 1.0;
+    /// Whether what stays open is joined once more without the parts of elements that lie on
+    /// others.
+    bool withoutOverlaps = false;
 };
 
 /// What a part drawing holds.
 struct Part {
     std::vector<gmpart::Path> contours;  ///< at least one, each with at least one element
     SkipReport skipped;
+    MendReport mended;
     DrawingUnits units;
 };
 

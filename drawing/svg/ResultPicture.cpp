@@ -4,15 +4,15 @@
 #include <array>
 #include <optional>
 
-#include "part/regions/Nesting.h"
 #include "drawing/svg/SvgPage.h"
 #include "part/model/Area.h"
+#include "part/regions/Nesting.h"
 
 namespace gmdrawing {
 
-using gmregion::Box;
 using gmpart::Path;
 using gmpart::Sense;
+using gmregion::Box;
 
 namespace {
 

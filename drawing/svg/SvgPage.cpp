@@ -8,10 +8,10 @@
 
 namespace gmdrawing {
 
-using gmregion::Box;
-using gmregion::Element;
 using gmpart::Path;
 using gmpart::Sense;
+using gmregion::Box;
+using gmregion::Element;
 using gmregion::Vec2;
 
 namespace {

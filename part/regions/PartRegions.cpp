@@ -17,9 +17,10 @@ using gmregion::Outcome;
 using gmregion::Paths;
 using gmregion::RegionSet;
 
-PartRegions::PartRegions(const std::vector<Path>& contours, std::size_t firstNumber)
+PartRegions::PartRegions(const std::vector<Path>& contours, std::size_t firstNumber,
+                         double tolerance)
     : m_firstNumber(firstNumber),
-      m_tolerance(partTolerance(contours)),
+      m_tolerance(tolerance > 0.0 ? tolerance : partTolerance(contours)),
       m_alone(contourRegions(contours, m_tolerance)),
       m_nesting(nestingOf(contours, m_alone)) {}
 

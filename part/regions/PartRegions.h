@@ -18,7 +18,9 @@ class PartRegions {
 public:
     /// @param contours of the drawing
     /// @param firstNumber the number of the first of them in origins
-    explicit PartRegions(const std::vector<Path>& contours, std::size_t firstNumber = 0);
+    /// @param tolerance as for gmregion::cleanUp(); 0 for partTolerance()
+    explicit PartRegions(const std::vector<Path>& contours, std::size_t firstNumber = 0,
+                         double tolerance = 0.0);
 
     double tolerance() const { return m_tolerance; }
     const Nesting& nesting() const { return m_nesting; }

@@ -207,6 +207,22 @@ TEST_F(Program, FaultyOffsetsOfTheKernelAreNamedAndDashed) {
     EXPECT_NE(svg.find("dashed: faulty"), std::string::npos);
 }
 
+TEST_F(Program, CleanTellsWhatItMended) {
+    using drawing_text::drawing;
+    using drawing_text::lightPolyline;
+    const std::vector<gmregion::Element> side = {{{3, 0}, {}}, {{12, 0}, {}}};
+    m_scratch.store("a.dxf", drawing(lightPolyline(rectangle({0, 0}, {10, 10}).elements, true) +
+                                     lightPolyline(rectangle({5, 0}, {15, 10}).elements, true) +
+                                     lightPolyline(side, false)));
+    const Outcome clean = run("clean a.dxf -o c.dxf -o c.svg");
+    EXPECT_EQ(clean.exitCode, 0);
+    EXPECT_NE(clean.out.find("overlapping elements cut          1\n"), std::string::npos);
+    EXPECT_NE(clean.out.find("outlines                          1\n"), std::string::npos);
+    const Outcome info = run("info c.dxf");
+    EXPECT_EQ(std::count(info.out.begin(), info.out.end(), '\n'), 2);
+    EXPECT_NE(info.out.find("150.0000"), std::string::npos);
+}
+
 TEST_F(Program, RefusedContoursAreToldWithTheCause) {
     const std::vector<gmregion::Element> touching = {
         {{0, 0}, {}}, {{10, 0}, {}}, {{10, 10}, {}}, {{0.00005, 0}, {}}};
