@@ -35,7 +35,7 @@ using gmregion::RegionSet;
 namespace {
 
 constexpr int kGapDigits = 4;
-constexpr int kNameWidth = 34;
+constexpr int kNameWidth = 38;
 
 struct CleanOptions {
     InputOptions input;

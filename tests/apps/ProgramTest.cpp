@@ -216,8 +216,8 @@ TEST_F(Program, CleanTellsWhatItMended) {
                                      lightPolyline(side, false)));
     const Outcome clean = run("clean a.dxf -o c.dxf -o c.svg");
     EXPECT_EQ(clean.exitCode, 0);
-    EXPECT_NE(clean.out.find("overlapping elements cut          1\n"), std::string::npos);
-    EXPECT_NE(clean.out.find("outlines                          1\n"), std::string::npos);
+    EXPECT_NE(clean.out.find("overlapping elements cut              1\n"), std::string::npos);
+    EXPECT_NE(clean.out.find("outlines                              1\n"), std::string::npos);
     const Outcome info = run("info c.dxf");
     EXPECT_EQ(std::count(info.out.begin(), info.out.end(), '\n'), 2);
     EXPECT_NE(info.out.find("150.0000"), std::string::npos);
