@@ -16,7 +16,9 @@ commands() {
 info PART --join 0.01
 offset PART --distance 2 --count 2 -o OUT.svg -o OUT.dxf
 corners PART --radius 1.5 -o OUT.svg -o OUT.dxf
+offset PART --distance 2 --engine kernel -o OUT.svg
 melt PART examples/parts/bracket.dxf -o OUT.svg
+clean PART --fit 0.05 -o OUT.dxf
 toolpath PART --tool 3 --lead perpendicular -o OUT.ngc -o OUT.svg
 toolpath PART --tool 3 --lead arc --depth 4 --step-down 1.5 -o OUT.ngc
 offset PART --distance nan -o OUT.svg

@@ -35,9 +35,9 @@ echo "== gasket: one sixth drawn once and inserted six times"
 "$gmpath" offset examples/parts/gasket.dxf --distance 2 -o out/gasket.svg -o out/gasket.dxf
 
 echo
-echo "== tee: corners rounded outside; then the tee melted with the bracket whose end it lies on"
+echo "== tee: corners rounded outside; then bracket and tee, which lies on its end, as one part"
 "$gmpath" corners examples/parts/tee.dxf --radius 6 --convex -o out/tee.svg -o out/tee.dxf
-"$gmpath" melt examples/parts/bracket.dxf out/tee.dxf \
+"$gmpath" union examples/parts/bracket.dxf out/tee.dxf \
     -o out/bracket-with-tee.svg -o out/bracket-with-tee.dxf
 
 echo

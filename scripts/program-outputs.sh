@@ -37,6 +37,13 @@ corners-concave       corners PART --radius 1 --concave -o a.dxf
 corners-bent          corners PART --radius 0.5 --bend 0.5 -o a.dxf
 corners-chamfer       corners PART --chamfer 1.5 -o a.svg -o a.dxf
 corners-length        corners PART --chamfer-length 1 --convex -o a.dxf
+offset-material       offset PART --distance 1 --side material -o a.svg -o a.dxf
+offset-each           offset PART --distance 4 --each -o a.dxf
+offset-miter          offset PART --distance 2 --join-style miter -o a.dxf
+offset-kernel         offset PART --distance 2 --engine kernel -o a.svg -o a.dxf
+clean                 clean PART --fit 0.01 -o a.svg -o a.dxf
+union-next            union PART NEXT -o a.svg -o a.dxf
+subtract-next         subtract PART NEXT -o a.dxf
 melt-next             melt PART NEXT -o a.svg -o a.dxf
 melt-scaled           melt PART NEXT --scale 1.37 -o a.svg -o a.dxf
 melt-itself           melt PART PART -o a.dxf
