@@ -5,7 +5,8 @@
 
 namespace gmmachining {
 
-/// Which units may be cut next: those that hold no other one that is still to be cut. So holes come before the outline that holds them, as long as the part is held fast.
+/// Which units may be cut next: those that hold no other one that is still to be cut. So holes come
+/// before the outline that holds them, as long as the part is held fast.
 class CutOrder {
 public:
     /// `holders` has for every unit those that it lies in directly (`holdersOfUnits`).
