@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: MIT
 #include "apps/gmpath/Phrases.h"
 
+#include <cmath>
+
 #include "drawing/Text.h"
 
 namespace gmpath {
@@ -18,10 +20,17 @@ constexpr int kPlaceDigits = 7;
 /// Contours named in a remark, at most.
 constexpr std::size_t kMostNamed = 10;
 
+/// A coordinate without what is below a millionth.
+std::string coordinateText(double value) {
+    constexpr double kMillion = 1e6;
+    const double rounded = std::round(value * kMillion) / kMillion;
+    return formatReal(std::isfinite(rounded) ? rounded + 0.0 : value, kPlaceDigits);
+}
+
 }  // namespace
 
 std::string placeText(Point p) {
-    return " near (" + formatReal(p.x, kPlaceDigits) + ", " + formatReal(p.y, kPlaceDigits) + ")";
+    return " near (" + coordinateText(p.x) + ", " + coordinateText(p.y) + ")";
 }
 
 std::string faultText(const Fault& fault, std::size_t count) {

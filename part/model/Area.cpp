@@ -9,22 +9,9 @@
 
 #include <cmath>
 
+#include "region/plane/Measures.h"
+
 namespace gmpart {
-
-namespace {
-
-/// Area between an arc and its chord, with the sign of the sweep.
-double circularSegmentArea(const Element& e) {
-    const double angle = sweep(e);
-    // For flat arcs angle - sin(angle) cancels; its series is exact enough there.
-    const double difference = std::abs(angle) < 1e-2
-                                  ? angle * angle * angle / 6.0 * (1.0 - angle * angle / 20.0)
-                                  : angle - std::sin(angle);
-    const double r = radius(e);
-    return 0.5 * r * r * difference;
-}
-
-}  // namespace
 
 double signedArea(const Path& path) {
     if (path.elements.empty()) return 0.0;
@@ -32,8 +19,7 @@ double signedArea(const Path& path) {
     const Vec2 origin = path.elements.front().sp;
     double area = 0.0;
     for (const Element& e : path.elements) {
-        area += 0.5 * cross(e.sp - origin, e.ep - origin);
-        if (isArc(e)) area += circularSegmentArea(e);
+        area += 0.5 * cross(e.sp - origin, e.ep - origin) + gmregion::segmentArea(e);
     }
     return area;
 }
