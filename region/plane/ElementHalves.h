@@ -1,11 +1,19 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include <array>
 #include <cmath>
 
 #include "region/plane/ElementWinding.h"
 
 namespace gmregion {
+
+/// The halves of an element.
+inline std::array<Element, 2> halvesOf(const Element& e) {
+    const Vec2 m = middleOf(e);
+    const double half = e.bulge / (1.0 + std::sqrt(1.0 + e.bulge * e.bulge));
+    return {Element{e.sp, m, half}, Element{m, e.ep, half}};
+}
 
 /// Calls visit for an element, or for its halves when it turns by more than half a turn.
 template <class Visit>
@@ -14,10 +22,8 @@ void visitHalves(const Element& e, const Visit& visit) {
         visit(e);
         return;
     }
-    const Vec2 m = middleOf(e);
-    const double half = e.bulge / (1.0 + std::sqrt(1.0 + e.bulge * e.bulge));
-    visit(Element{e.sp, m, half});
-    visit(Element{m, e.ep, half});
+    for (const Element& half : halvesOf(e))
+        visit(half);
 }
 
 }  // namespace gmregion

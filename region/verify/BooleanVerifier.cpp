@@ -17,6 +17,7 @@
 #include <cmath>
 
 #include "region/plane/Crossing.h"
+#include "region/plane/ElementHalves.h"
 #include "region/plane/ElementWinding.h"
 #include "region/plane/Measures.h"
 #include "region/verify/LoopCheck.h"
@@ -143,13 +144,25 @@ void BooleanVerifier::checkResultPiece(const BoundaryPiece& piece) {
     checkBeside(piece);
 }
 
+/// The middle of a part, or that of a half of it where its own is on another boundary: a part that
+/// only touches the boundary there lies beside it elsewhere.
+Vec2 BooleanVerifier::pointOff(const Element& part, const BoundaryIndex& other) const {
+    const Vec2 middle = middleOf(part);
+    if (!other.isAnyNear(middle, m_tolerance)) return middle;
+    for (const Element& half : halvesOf(part)) {
+        const Vec2 p = middleOf(half);
+        if (!other.isAnyNear(p, m_tolerance)) return p;
+    }
+    return middle;
+}
+
 /// What the pieces of one operand that lie inside the other sweep.
 double BooleanVerifier::commonArea(const BoundaryIndex& inner, const BoundaryIndex& outer,
                                    bool withShared, Vec2 about) const {
     double twice = 0.0;
     for (std::size_t i = 0; i < inner.pieces().size(); ++i) {
         for (const Element& part : partsOf(inner.pieces()[i], inner.boxes()[i], outer, m_margin)) {
-            const Vec2 p = middleOf(part);
+            const Vec2 p = pointOff(part, outer);
             const BoundaryIndex::Near near = outer.nearest(p, m_tolerance);
             bool counts = false;
             if (near.piece == kNone) {

@@ -21,6 +21,7 @@ private:
     void checkBeside(const BoundaryPiece& piece);
     void checkResultPiece(const BoundaryPiece& piece);
     void checkAreas(const LoopsView& first, const LoopsView& second, const LoopsView& result);
+    Vec2 pointOff(const Element& part, const BoundaryIndex& other) const;
     double commonArea(const BoundaryIndex& inner, const BoundaryIndex& outer, bool withShared,
                       Vec2 about) const;
 

@@ -8,10 +8,12 @@
 #include "region/verify/LoopCheck.h"
 
 #include <algorithm>
+#include <array>
 #include <cmath>
 
 #include "region/plane/Apart.h"
 #include "region/plane/Crossing.h"
+#include "region/plane/ElementHalves.h"
 #include "region/plane/ElementWinding.h"
 #include "region/plane/Measures.h"
 #include "region/plane/Nearest.h"
@@ -95,6 +97,21 @@ void checkEnds(const LoopsView& view, double tolerance, FaultList& faults) {
     }
 }
 
+/// Whether the other loops run round an element of a loop as often as they must: at its middle, or,
+/// since another loop may touch it right there, at the middles of both its halves.
+bool nestsAt(const Element& e, Index loop, int wanted, const BoundaryIndex& index) {
+    const auto fits = [&](Vec2 p) {
+        int covered = 0;
+        index.visitWindings(p, [&](Index other, int winding) {
+            if (other != loop) covered += winding;
+        });
+        return covered == wanted;
+    };
+    if (fits(middleOf(e))) return true;
+    const std::array<Element, 2> halves = halvesOf(e);
+    return fits(middleOf(halves[0])) && fits(middleOf(halves[1]));
+}
+
 /// An outline must stand in nothing that is covered by other loops, a hole in what is covered.
 void checkNesting(const LoopsView& view, const BoundaryIndex& index, FaultList& faults) {
     Index first = 0;
@@ -109,12 +126,10 @@ void checkNesting(const LoopsView& view, const BoundaryIndex& index, FaultList& 
             twice += sweptTwice(e, (*view.elements)[first].sp);
             if (squared(e.ep - e.sp) > squared(best.ep - best.sp)) longest = i;
         }
-        const Vec2 p = middleOf((*view.elements)[longest]);
-        int covered = 0;
-        index.visitWindings(p, [&](Index other, int winding) {
-            if (other != loop) covered += winding;
-        });
-        if (covered != (twice > 0.0 ? 0 : 1)) faults.add(FaultKind::kNesting, p, 0.0, longest);
+        const Element& e = (*view.elements)[longest];
+        if (!nestsAt(e, loop, twice > 0.0 ? 0 : 1, index)) {
+            faults.add(FaultKind::kNesting, middleOf(e), 0.0, longest);
+        }
         first = last;
     }
 }

@@ -281,6 +281,33 @@ TEST(Verify, PassesSoundBooleansAlone) {
     EXPECT_GT(checked, 200);
 }
 
+TEST(Verify, PassesBooleansOfPartsThatTouch) {
+    // On a grid sides run along each other, circles touch them, and corners lie on centres.
+    std::mt19937 engine(7);
+    const auto number = [&](unsigned range) { return static_cast<double>(engine() % range); };
+    const auto heap = [&] {
+        std::vector<Elements> loops;
+        for (std::size_t i = 0; i < 2 + engine() % 6; ++i) {
+            if (engine() % 2 == 0) {
+                loops.push_back(rectangle(number(12), number(12), 1 + number(6), 1 + number(6)));
+            } else {
+                loops.push_back(circle({number(12), number(12)}, 1 + number(3)));
+            }
+        }
+        return cleaned(loops);
+    };
+    for (int round = 0; round < 400; ++round) {
+        SCOPED_TRACE(round);
+        const RegionSet a = heap();
+        const RegionSet b = heap();
+        for (const Combination c :
+             {Combination::kUnion, Combination::kIntersection, Combination::kDifference}) {
+            const Verdict sound = verifyBoolean(a, b, c, combine(a, b, c).regions);
+            ASSERT_TRUE(sound.isSound()) << int(c) << " " << texts(sound);
+        }
+    }
+}
+
 TEST(Verify, FindsBrokenBooleans) {
     const RegionSet a = cleaned({rectangle(0, 0, 10, 10), circle({3, 3}, 1)});
     const RegionSet b = cleaned({rectangle(5, 5, 10, 10), rectangle(20, 0, 1, 1)});
