@@ -15,10 +15,12 @@
 #include "machining/order/CutOrder.h"
 #include "machining/order/CutUnits.h"
 #include "part/model/PathStart.h"
-#include "part/regions/Nesting.h"
+#include "part/regions/ContourRegions.h"
+#include "part/regions/PartRegions.h"
 
 namespace gmmachining {
 
+using gmpart::PartRegions;
 using gmpart::Path;
 using gmregion::Vec2;
 
@@ -45,11 +47,24 @@ struct Cut {
     Vec2 start() const { return (approach.elements.empty() ? path : approach).elements.front().sp; }
 };
 
+/// What bounds the part, and the contours that bound nothing. What of contours lies inside the
+/// part, or in a hole of others, is no edge.
+std::vector<Path> edgesOf(const std::vector<Path>& contours, const PartRegions& regions) {
+    std::vector<Path> edges;
+    const gmregion::Outcome part = regions.part();
+    for (std::size_t loop = 0; loop < part.regions.loops().size(); ++loop)
+        edges.push_back(gmpart::loopPath(part.regions, loop));
+    for (const std::size_t i : regions.withoutRegions())
+        edges.push_back(contours[i]);
+    return edges;
+}
+
 class ToolpathJob {
 public:
-    ToolpathJob(const std::vector<Path>& contours, const ToolpathRequest& request)
+    ToolpathJob(const std::vector<Path>& contours, const PartRegions& regions,
+                const ToolpathRequest& request)
         : m_request(request),
-          m_obstacles(contours),
+          m_obstacles(edgesOf(contours, regions), regions.tolerance()),
           m_recorder(request.safeZ),
           m_cuts(contours.size()) {}
 
@@ -152,10 +167,11 @@ void judgeLastPass(const std::vector<CutUnit>& units, ToolpathResult& result) {
 ToolpathResult makeToolpath(
     const std::vector<Path>& contours, const ToolpathRequest& request,
     const std::function<void(std::size_t done, std::size_t total)>& progress) {
-    ToolRuns runs = toolRuns(contours, request.distances, request.part, progress);
+    const PartRegions regions(contours);
+    ToolRuns runs = toolRuns(contours, regions, request.distances, request.part, progress);
     const std::vector<CutUnit> units = cutUnits(contours.size(), std::move(runs.passes));
-    CutOrder order(holdersOfUnits(units, gmpart::nestingOf(contours).holders));
-    ToolpathJob job(contours, request);
+    CutOrder order(holdersOfUnits(units, regions.nesting().holders));
+    ToolpathJob job(contours, regions, request);
     for (auto ready = order.ready(); !ready.empty(); ready = order.ready()) {
         const std::size_t next = nextUnit(ready, units, job.place());
         job.cutUnit(units[next]);

@@ -35,7 +35,7 @@ struct LeadTally {
 struct ContourCut {
     bool fits = true;       ///< false when nothing of the last pass comes from it
     bool runRound = false;  ///< it has no inside and is cut all round
-    bool keepsAway = true;  ///< false when a cut along it comes too near to a contour
+    bool keepsAway = true;  ///< false when a cut along it comes too near to an edge
     LeadTally leads;        ///< of the runs of which it is the first contour
 };
 
@@ -51,7 +51,8 @@ struct ToolpathResult {
 ///
 /// Contours that share a run are cut as one. Of those that may come next (`CutOrder`) the one whose
 /// start is nearest is cut, in all its passes; a pass is cut run by run, the nearest first, and a
-/// run through all levels at once. All cuts and leads are compared with the contours.
+/// run through all levels at once. All cuts and leads are compared with the edges of the part and
+/// with open contours.
 ToolpathResult makeToolpath(
     const std::vector<gmpart::Path>& contours, const ToolpathRequest& request,
     const std::function<void(std::size_t done, std::size_t total)>& progress);

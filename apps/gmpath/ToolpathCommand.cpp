@@ -68,7 +68,7 @@ std::string remark(const ContourCut& cut) {
     const auto add = [&](bool applies, const std::string& what) {
         if (applies) text += (text.empty() ? "" : "; ") + what;
     };
-    add(!cut.keepsAway, "the cut comes too near to a contour");
+    add(!cut.keepsAway, "the cut comes too near to another contour");
     add(cut.leads.shortened > 0, shortenedText(cut.leads));
     add(cut.leads.dropped > 0, droppedText(cut.leads));
     return text;

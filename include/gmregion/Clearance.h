@@ -16,7 +16,7 @@ namespace gmregion {
 struct Clearance {
     Point from;               ///< a point of what was asked about
     Point to;                 ///< the nearest point of a path
-    double distance = 0.0;    ///< between both, in length units; 0 where they cross or touch
+    double distance = 0.0;    ///< between both, in length units; 0 up to rounding where they cross
     std::size_t path = 0;     ///< number of the path in its heap
     std::size_t element = 0;  ///< number of the element in its path
 };

@@ -3,8 +3,6 @@
 
 #include <algorithm>
 
-#include "part/regions/ContourRegions.h"
-
 namespace gmmachining {
 
 using gmpart::Path;
@@ -14,23 +12,23 @@ using gmregion::Paths;
 
 namespace {
 
-ClearanceIndex indexOf(const std::vector<Path>& contours) {
+ClearanceIndex indexOf(const std::vector<Path>& edges) {
     Paths heap;
-    for (const Path& contour : contours)
-        heap.add(contour.elements, contour.closed);
+    for (const Path& edge : edges)
+        heap.add(edge.elements, edge.closed);
     return ClearanceIndex(heap);
 }
 
 }  // namespace
 
-Obstacles::Obstacles(const std::vector<Path>& contours)
-    : m_contours(indexOf(contours)), m_slack(2.0 * gmpart::partTolerance(contours)) {}
+Obstacles::Obstacles(const std::vector<Path>& edges, double tolerance)
+    : m_edges(indexOf(edges)), m_slack(2.0 * tolerance) {}
 
 bool Obstacles::keepClear(const Path& path, double clearance) const {
     const double limit = clearance - m_slack;
     return limit <= 0.0 ||
            std::none_of(path.elements.begin(), path.elements.end(),
-                        [&](const Element& e) { return m_contours.of(e, limit).has_value(); });
+                        [&](const Element& e) { return m_edges.of(e, limit).has_value(); });
 }
 
 }  // namespace gmmachining

@@ -62,10 +62,12 @@ void fixStarts(std::vector<ToolRun>& runs, const std::vector<Path>& contours, do
 
 }  // namespace
 
-ToolRuns toolRuns(const std::vector<Path>& contours, const std::vector<double>& distances,
-                  PartSide side, const gmpart::ProgressCall& progress) {
+ToolRuns toolRuns(const std::vector<Path>& contours, const gmpart::PartRegions& regions,
+                  const std::vector<double>& distances, PartSide side,
+                  const gmpart::ProgressCall& progress) {
     ToolRuns result;
-    result.rest = offsetPart(contours, {gmpart::Side::kWaste, distances, {}, false}, progress);
+    result.rest =
+        offsetPart(contours, regions, {gmpart::Side::kWaste, distances, {}, false}, progress);
     result.passes.resize(distances.size());
     std::vector<OffsetPath> doubtful;
     for (OffsetPath& offset : result.rest.paths) {

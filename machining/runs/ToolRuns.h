@@ -29,7 +29,8 @@ struct ToolRuns {
 /// Offsets the part to its waste side at each of some positive distances and runs the results so
 /// that the part lies on the given side of the tool. Of the runs of a contour in a pass, the one
 /// nearest to the contour's own start, moved sideways by the distance, begins there.
-ToolRuns toolRuns(const std::vector<gmpart::Path>& contours, const std::vector<double>& distances,
-                  PartSide side, const gmpart::ProgressCall& progress);
+ToolRuns toolRuns(const std::vector<gmpart::Path>& contours, const gmpart::PartRegions& regions,
+                  const std::vector<double>& distances, PartSide side,
+                  const gmpart::ProgressCall& progress);
 
 }  // namespace gmmachining

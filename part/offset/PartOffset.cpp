@@ -57,22 +57,18 @@ private:
     PartOffsets m_offsets;
 };
 
-std::vector<std::size_t> withoutRegions(const PartRegions& regions) {
-    std::vector<std::size_t> found;
-    for (std::size_t i = 0; i < regions.alone().size(); ++i) {
-        if (regions.alone()[i].empty()) found.push_back(i);
-    }
-    return found;
-}
-
 }  // namespace
 
 PartOffsets offsetPart(const std::vector<Path>& contours, const OffsetRequest& request,
                        const ProgressCall& progress) {
-    const PartRegions regions(contours);
+    return offsetPart(contours, PartRegions(contours), request, progress);
+}
+
+PartOffsets offsetPart(const std::vector<Path>& contours, const PartRegions& regions,
+                       const OffsetRequest& request, const ProgressCall& progress) {
     const std::vector<OffsetTask> tasks =
         offsetTasks(contours, regions, request.side, request.each);
-    const OpenOffset open(contours, withoutRegions(regions), regions.tolerance());
+    const OpenOffset open(contours, regions.withoutRegions(), regions.tolerance());
     PartOffsetter offsetter(contours, request);
     const std::size_t total = request.distances.size() * (tasks.size() + 1);
     std::size_t done = 0;

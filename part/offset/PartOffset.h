@@ -11,6 +11,7 @@
 #include "gmregion/Verify.h"
 
 #include "part/model/Path.h"
+#include "part/regions/PartRegions.h"
 
 namespace gmpart {
 
@@ -84,5 +85,8 @@ using ProgressCall = std::function<void(std::size_t done, std::size_t total)>;
 /// checked (gmregion::verifyOffset()). Cost: near-linear in the elements, for every pass.
 PartOffsets offsetPart(const std::vector<Path>& contours, const OffsetRequest& request,
                        const ProgressCall& progress);
+/// The same with the regions of the contours.
+PartOffsets offsetPart(const std::vector<Path>& contours, const PartRegions& regions,
+                       const OffsetRequest& request, const ProgressCall& progress);
 
 }  // namespace gmpart

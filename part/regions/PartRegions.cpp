@@ -24,6 +24,14 @@ PartRegions::PartRegions(const std::vector<Path>& contours, std::size_t firstNum
       m_alone(contourRegions(contours, m_tolerance)),
       m_nesting(nestingOf(contours, m_alone)) {}
 
+std::vector<std::size_t> PartRegions::withoutRegions() const {
+    std::vector<std::size_t> found;
+    for (std::size_t i = 0; i < m_alone.size(); ++i) {
+        if (m_alone[i].empty()) found.push_back(i);
+    }
+    return found;
+}
+
 Outcome PartRegions::part() const {
     Paths heap;
     for (std::size_t i = 0; i < m_alone.size(); ++i) {

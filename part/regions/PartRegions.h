@@ -27,6 +27,9 @@ public:
     /// What each contour runs round; empty for open ones and those that enclose nothing.
     const std::vector<gmregion::RegionSet>& alone() const { return m_alone; }
 
+    /// The numbers, in this drawing, of contours that are open or enclose nothing.
+    std::vector<std::size_t> withoutRegions() const;
+
     /// The part: what contours of even depth run round, without what those of odd depth do.
     /// Contours that cross are siblings, and where these overlap they count as one.
     gmregion::Outcome part() const;

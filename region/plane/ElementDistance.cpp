@@ -3,8 +3,8 @@
 /// The distance between two elements.
 ///
 /// Where they do not cross, the shortest way between them starts at an end, or it is square to both
-/// of them: then it goes through the centre of each that is an arc. All these ways are compared;
-/// each is between points of both, so none can be too short.
+/// of them: then it goes through the centre of each that is an arc. All these ways and the
+/// crossings are compared; each is between points of both, so none can be too short.
 
 #include "region/plane/ElementDistance.h"
 
@@ -26,9 +26,13 @@ class ShortestWay {
 public:
     ShortestWay(const Operand& a, const Operand& b) : m_a(a), m_b(b) {}
 
+    /// Where they cross. Of lines that are parallel but for rounding a crossing may be anywhere, so
+    /// both are asked for their own points there.
     void crossing() {
-        const CrossingPoints points = crossings(m_a.element, m_b.element);
-        if (points.size() > 0) m_best = {*points.begin(), *points.begin(), 0.0};
+        for (const Vec2 p : crossings(m_a.element, m_b.element)) {
+            consider(nearestOn(m_a.element, m_a.carrier, p),
+                     nearestOn(m_b.element, m_b.carrier, p));
+        }
     }
     void fromFirst(Vec2 p) { consider(p, nearestOn(m_b.element, m_b.carrier, p)); }
     void fromSecond(Vec2 p) { consider(nearestOn(m_a.element, m_a.carrier, p), p); }
@@ -70,7 +74,6 @@ Approach nearestBetween(const Element& a, const Carrier& carrierA, const Element
                         const Carrier& carrierB) {
     ShortestWay way({a, carrierA}, {b, carrierB});
     way.crossing();
-    if (way.best().distance == 0.0) return way.best();
     for (const Vec2 p : {a.sp, a.ep})
         way.fromFirst(p);
     for (const Vec2 p : {b.sp, b.ep})

@@ -11,7 +11,7 @@ namespace gmregion {
 struct Approach {
     Vec2 onFirst;
     Vec2 onSecond;
-    double distance = 0.0;  ///< 0 where they cross
+    double distance = 0.0;  ///< 0 up to rounding where they cross
 };
 
 /// The nearest points of two elements that turn by half a turn at the most. Cost: constant.

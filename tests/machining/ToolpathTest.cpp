@@ -255,7 +255,7 @@ TEST(Toolpath, WhereTheToolDoesNotFitBetweenContoursTheyAreCutAsOne) {
 TEST(Obstacles, AgreeWithDenseSamples) {
     const std::vector<Path> contours = {circle({0, 0}, 0.01), rectangle({5, -3}, {5.02, 3}),
                                         polygon({{-4, 2}, {-4, 8}, {2, 8}}, false)};
-    const Obstacles obstacles(contours);
+    const Obstacles obstacles(contours, 1e-4);
     EXPECT_TRUE(rc::check([&] {
         const auto number = [] { return *rc::gen::inRange(-1000, 1000) * 0.01; };
         const double clearance = 0.05 + std::abs(number()) * 0.1;

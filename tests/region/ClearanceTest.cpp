@@ -5,6 +5,7 @@
 #include <algorithm>
 #include <cmath>
 #include <limits>
+#include <random>
 
 #include "gmregion/Clearance.h"
 
@@ -95,6 +96,24 @@ TEST(ClearanceIndex, KnownWays) {
     EXPECT_EQ(inside->element, 1U);
     EXPECT_DOUBLE_EQ(inside->distance, 2.0);
     EXPECT_FALSE(index.of(Point{12, 4}, 1.9).has_value());
+}
+
+TEST(ClearanceIndex, ParallelsDoNotCrossByRounding) {
+    std::mt19937 engine(11);
+    std::uniform_int_distribution<int> number(-20, 20);
+    for (int round = 0; round < 2000; ++round) {
+        const Vec2 from{1.0 * number(engine), 1.0 * number(engine)};
+        const Vec2 to{1.0 * number(engine), 1.0 * number(engine)};
+        if (from == to) continue;
+        Paths paths;
+        paths.add({{from, to}}, false);
+        const Vec2 by = 0.5 * rightNormal(unit(to - from));
+        const Vec2 along = 0.1 * (to - from);
+        const std::optional<Clearance> found =
+            ClearanceIndex(paths).of(Element{from + by + along, to + by - along}, HUGE_VAL);
+        ASSERT_TRUE(found.has_value());
+        ASSERT_NEAR(found->distance, 0.5, 1e-12) << from.x << " " << from.y;
+    }
 }
 
 TEST(ClearanceIndex, NumbersThatAreNoneAreNoneAndNothingIsNear) {
