@@ -51,8 +51,9 @@ struct OffsetOptions {
     int count = 1;               ///< number of passes
     Side side = Side::kWaste;
     Join join = Join::kRound;
-    bool each = false;      ///< contours by themselves
-    bool byKernel = false;  ///< the kernel makes the offsets
+    bool each = false;            ///< contours by themselves
+    bool byKernel = false;        ///< the kernel makes the offsets
+    bool onSourceLayers = false;  ///< results stand on the layers of their contours
     std::vector<std::string> outputs;
 };
 
@@ -67,6 +68,11 @@ const std::map<std::string, Side>& sideNames() {
 const std::map<std::string, Join>& joinNames() {
     static const std::map<std::string, Join> names = {
         {"round", Join::kRound}, {"miter", Join::kMiter}, {"bevel", Join::kBevel}};
+    return names;
+}
+
+const std::map<std::string, bool>& layerNames() {
+    static const std::map<std::string, bool> names = {{"pass", false}, {"source", true}};
     return names;
 }
 
@@ -100,6 +106,9 @@ void addOptions(CLI::App& offset, OffsetOptions& options) {
     offset.add_flag("--each", options.each, "offset every contour by itself: nothing merges");
     addNamedOption(offset, "--engine", options.byKernel, engineNames(),
                    "what makes the offsets: regions, or the kernel, contour by contour [regions]");
+    addNamedOption(offset, "--layers", options.onSourceLayers, layerNames(),
+                   "layers of results: one for each pass, or that of the source contour which most "
+                   "of a result comes from [pass]");
     addOutputs(offset, options.outputs);
 }
 
@@ -124,14 +133,14 @@ std::vector<double> distancesOf(const OffsetOptions& options) {
 
 /// Results stand with the contour that most of their length comes from.
 ResultDrawing drawingOf(const Part& part, const PartOffsets& offsets,
-                        const std::vector<double>& distances) {
+                        const std::vector<double>& distances, bool onSourceLayers) {
     ResultDrawing drawing{part.contours, {}, {}};
     drawing.results.resize(part.contours.size());
     for (const OffsetPath& offset : offsets.paths)
         drawing.results[offset.main].push_back({offset.pass, offset.path, offset.doubtful});
     for (std::size_t pass = 0; pass < distances.size(); ++pass) {
         drawing.passes.push_back({"offset " + formatReal(distances[pass], kLegendDigits),
-                                  "OFFSET_" + std::to_string(pass + 1)});
+                                  onSourceLayers ? "" : "OFFSET_" + std::to_string(pass + 1)});
     }
     return drawing;
 }
@@ -224,7 +233,7 @@ bool runOffset(const OffsetOptions& options, const Console& console) {
     const OffsetRequest request{
         options.side, distances, {options.join, gmregion::End::kRound}, options.each};
     const PartOffsets offsets = offsetsOf(part, options, request, console);
-    writeOutputs(drawingOf(part, offsets, distances), options.outputs);
+    writeOutputs(drawingOf(part, offsets, distances, options.onSourceLayers), options.outputs);
     const Report report(console.err, options.input.drawing);
     OffsetReport(offsets, distances, part.contours.size(), report).tellAll();
     console.out << counted(part.contours.size(), "contour") << ", "

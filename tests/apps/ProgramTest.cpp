@@ -125,6 +125,10 @@ TEST_F(Program, OffsetWritesEveryOutput) {
     const Outcome back = run("info a.dxf");
     EXPECT_EQ(back.exitCode, 0);
     EXPECT_NE(back.out.find("OFFSET_3"), std::string::npos);
+    EXPECT_EQ(run("offset " + kBracket + " --distance 2 --layers source -o b.dxf").exitCode, 0);
+    const std::string onLayers = run("info b.dxf").out;
+    EXPECT_EQ(onLayers.find("OFFSET"), std::string::npos);
+    EXPECT_NE(onLayers.find("  CUT "), std::string::npos);
     EXPECT_EQ(run("offset " + kBracket + " --distance -1 --side both -o b.svg").exitCode, 0);
 }
 
