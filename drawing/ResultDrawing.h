@@ -32,6 +32,8 @@ struct ResultDrawing {
     /// The results take the place of the sources: pictures show them over the sources, other
     /// drawings without them.
     bool replacesSources = false;
+    /// Of the coordinates, by the numbers of drawings; 0 where nobody said.
+    int units = 0;
 };
 
 }  // namespace gmdrawing

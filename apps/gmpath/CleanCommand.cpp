@@ -21,9 +21,13 @@
 namespace gmpath {
 
 using gmdrawing::checkOutputs;
+using gmdrawing::DrawingUnits;
 using gmdrawing::formatReal;
+using gmdrawing::Length;
+using gmdrawing::lengthIn;
 using gmdrawing::Part;
 using gmdrawing::ResultDrawing;
+using gmdrawing::saidUnits;
 using gmdrawing::writeOutputs;
 using gmpart::CleanRequest;
 using gmpart::CleanResult;
@@ -39,7 +43,9 @@ constexpr int kNameWidth = 38;
 
 struct CleanOptions {
     InputOptions input;
-    CleanRequest request;
+    std::optional<FillRule> rule;
+    std::optional<Length> tolerance;
+    std::optional<Length> fit;
     std::vector<std::string> outputs;
 };
 
@@ -56,18 +62,18 @@ void addOptions(CLI::App& clean, CleanOptions& options) {
     addOutputs(clean, options.outputs);
     addInputOptions(clean, options.input);
     addNamedOption(
-        clean, "--rule", options.request.rule, ruleNames(),
+        clean, "--rule", options.rule, ruleNames(),
         "what closed contours cover: nesting (outlines and holes by turns, each filled), "
         "nonzero, evenodd or positive, by how often they run round a place [nesting]");
     clean
-        .add_option("--tolerance", options.request.tolerance,
+        .add_option("--tolerance", options.tolerance,
                     "points and sides that lie this far apart are the same [a millionth of the "
                     "size, 1e-4 at most]")
-        ->transform(positiveNumber());
+        ->transform(positiveLength());
     clean
-        .add_option("--fit", options.request.fit,
+        .add_option("--fit", options.fit,
                     "replace runs of short elements by arcs and lines within this distance [none]")
-        ->transform(positiveNumber());
+        ->transform(positiveLength());
 }
 
 /// What was found and mended, a line each.
@@ -82,8 +88,8 @@ std::string table(const Part& part, const CleanResult& cleaned) {
     const RegionSet& set = cleaned.result.regions;
     count("contours", part.contours.size());
     count("elements of closed contours", cleaned.elements);
-    count("short elements dropped", part.skipped.shortElements);
-    count("duplicates dropped", part.skipped.duplicates);
+    count("short elements dropped", part.report.shortElements);
+    count("duplicates dropped", part.report.duplicates);
     count("overlapping elements cut", part.mended.overlaps);
     row("gaps closed", part.mended.gaps == 0 ? "0"
                                              : std::to_string(part.mended.gaps) + ", the largest " +
@@ -101,6 +107,7 @@ std::string table(const Part& part, const CleanResult& cleaned) {
 ResultDrawing drawingOf(const Part& part, const RegionSet& set) {
     ResultDrawing drawing{part.contours, {}, {{"regions", ""}}, {}, true};
     drawing.results.resize(part.contours.size());
+    drawing.units = saidUnits(part.units);
     for (std::size_t loop = 0; loop < set.loops().size(); ++loop) {
         const std::size_t main = sourcesOf(set, loop).main;
         Path path = gmpart::loopPath(set, loop);
@@ -110,12 +117,18 @@ ResultDrawing drawingOf(const Part& part, const RegionSet& set) {
     return drawing;
 }
 
+CleanRequest requestOf(const CleanOptions& options, const DrawingUnits& units) {
+    CleanRequest request;
+    request.rule = options.rule;
+    if (options.tolerance) request.tolerance = lengthIn(units, *options.tolerance);
+    if (options.fit) request.fit = lengthIn(units, *options.fit);
+    return request;
+}
+
 bool runClean(const CleanOptions& options, const Console& console) {
     checkOutputs(options.outputs, options.input.drawing);
-    InputOptions input = options.input;
-    input.read.withoutOverlaps = true;
-    const Part part = readInput(input, console);
-    const CleanResult cleaned = cleanPart(part.contours, options.request);
+    const Part part = readInput(options.input, console);
+    const CleanResult cleaned = cleanPart(part.contours, requestOf(options, part.units));
     writeOutputs(drawingOf(part, cleaned.result.regions), options.outputs);
     if (cleaned.result.refusal) {
         Report(console.err, options.input.drawing)

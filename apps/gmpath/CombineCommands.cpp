@@ -27,6 +27,8 @@ using gmdrawing::InputError;
 using gmdrawing::Part;
 using gmdrawing::PassName;
 using gmdrawing::ResultDrawing;
+using gmdrawing::saidUnits;
+using gmdrawing::unitText;
 using gmdrawing::writeOutputs;
 using gmpart::combineParts;
 using gmpart::LoopSources;
@@ -82,6 +84,17 @@ std::string labelOf(std::size_t part, std::size_t contour) {
     return static_cast<char>('A' + static_cast<char>(part)) + std::to_string(contour + 1);
 }
 
+/// Drawings that name different units are not combined.
+void checkUnits(const CombineOptions& options, const std::vector<Part>& parts) {
+    const int first = saidUnits(parts.front().units);
+    for (std::size_t i = 1; i < parts.size(); ++i) {
+        const int other = saidUnits(parts[i].units);
+        if (first == other || first == gmdrawing::kNoUnit || other == gmdrawing::kNoUnit) continue;
+        throw InputError(options.drawings[i] + ": the drawing is in " + unitText(other) +
+                         ", the first one in " + unitText(first));
+    }
+}
+
 std::vector<Part> readAll(const CombineOptions& options, const Console& console) {
     // What the drawings hold besides is told only when all can be read.
     std::ostringstream remarks;
@@ -91,6 +104,7 @@ std::vector<Part> readAll(const CombineOptions& options, const Console& console)
         input.drawing = drawing;
         parts.push_back(readInput(input, {console.out, remarks}));
     }
+    checkUnits(options, parts);
     console.err << remarks.str();
     return parts;
 }
@@ -98,6 +112,7 @@ std::vector<Part> readAll(const CombineOptions& options, const Console& console)
 ResultDrawing drawingOf(const std::vector<Part>& parts, const Recipe& recipe) {
     ResultDrawing drawing;
     drawing.replacesSources = true;
+    drawing.units = saidUnits(parts.front().units);
     for (std::size_t p = 0; p < parts.size(); ++p) {
         for (std::size_t i = 0; i < parts[p].contours.size(); ++i) {
             drawing.contours.push_back(parts[p].contours[i]);

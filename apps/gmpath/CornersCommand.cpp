@@ -17,10 +17,14 @@ namespace gmpath {
 
 using gmdrawing::checkOutputs;
 using gmdrawing::counted;
+using gmdrawing::DrawingUnits;
 using gmdrawing::formatReal;
+using gmdrawing::Length;
+using gmdrawing::lengthIn;
 using gmdrawing::Part;
 using gmdrawing::PassName;
 using gmdrawing::ResultDrawing;
+using gmdrawing::saidUnits;
 using gmdrawing::writeOutputs;
 using gmpart::CornerChoice;
 using gmpart::CornerKind;
@@ -37,9 +41,9 @@ constexpr double kHalfTurn = 180.0;
 /// Exactly one of the three sizes is given.
 struct CornersOptions {
     InputOptions input;
-    std::optional<double> radius;
-    std::optional<double> chamfer;
-    std::optional<double> chamferLength;
+    std::optional<Length> radius;
+    std::optional<Length> chamfer;
+    std::optional<Length> chamferLength;
     CornerChoice choice = CornerChoice::kAll;
     double bend = 5.0;  ///< degrees; joints that bend by less are no corners
     std::vector<std::string> outputs;
@@ -48,13 +52,13 @@ struct CornersOptions {
 void addSizes(CLI::App& corners, CornersOptions& options) {
     CLI::App* sizes = corners.add_option_group("size", "What the corners become");
     sizes->add_option("--radius", options.radius, "round them with this radius")
-        ->transform(positiveNumber());
+        ->transform(positiveLength());
     sizes->add_option("--chamfer", options.chamfer, "chamfer them, this far from the corner")
-        ->transform(positiveNumber());
+        ->transform(positiveLength());
     sizes
         ->add_option("--chamfer-length", options.chamferLength,
                      "chamfer them, with a chamfer of this length")
-        ->transform(positiveNumber());
+        ->transform(positiveLength());
     sizes->require_option(1);
 }
 
@@ -75,13 +79,14 @@ void addOptions(CLI::App& corners, CornersOptions& options) {
     addInputOptions(corners, options.input);
 }
 
-CornerRequest requestOf(const CornersOptions& options) {
-    const double bend = options.bend / kHalfTurn * kPi;
-    if (options.radius) return {CornerKind::kRounding, *options.radius, options.choice, bend};
-    if (options.chamfer) {
-        return {CornerKind::kChamferDistance, *options.chamfer, options.choice, bend};
-    }
-    return {CornerKind::kChamferLength, options.chamferLength.value_or(0.0), options.choice, bend};
+CornerRequest requestOf(const CornersOptions& options, const DrawingUnits& units) {
+    const auto request = [&](CornerKind kind, Length size) {
+        return CornerRequest{kind, lengthIn(units, size), options.choice,
+                             options.bend / kHalfTurn * kPi};
+    };
+    if (options.radius) return request(CornerKind::kRounding, *options.radius);
+    if (options.chamfer) return request(CornerKind::kChamferDistance, *options.chamfer);
+    return request(CornerKind::kChamferLength, options.chamferLength.value_or(Length{}));
 }
 
 PassName nameOf(const CornerRequest& request) {
@@ -100,13 +105,14 @@ std::string remark(const CornerResult& result) {
 }
 
 bool runCorners(const CornersOptions& options, const Console& console) {
-    const CornerRequest request = requestOf(options);
     checkOutputs(options.outputs, options.input.drawing);
     const Part part = readInput(options.input, console);
+    const CornerRequest request = requestOf(options, part.units);
     ResultDrawing drawing{part.contours, {}, {nameOf(request)}, {}, true};
     const std::vector<CornerResult> results = breakCorners(part.contours, request);
     for (const CornerResult& result : results)
         drawing.results.push_back({{0, result.path, result.refusal != KernelRefusal::kNone}});
+    drawing.units = saidUnits(part.units);
     writeOutputs(drawing, options.outputs);
 
     const Report report(console.err, options.input.drawing);

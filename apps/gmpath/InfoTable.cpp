@@ -3,8 +3,9 @@
 
 #include <algorithm>
 #include <cmath>
-#include <optional>
+#include <map>
 
+#include "apps/gmpath/ReadRemarks.h"
 #include "drawing/Text.h"
 #include "part/model/Area.h"
 #include "part/regions/Nesting.h"
@@ -18,13 +19,10 @@ using gmdrawing::formatFixed;
 using gmdrawing::formatReal;
 using gmdrawing::Part;
 using gmdrawing::printable;
-using gmdrawing::SkippedKind;
-using gmdrawing::SkipReport;
 using gmpart::nestingOf;
 using gmpart::Path;
 using gmpart::Sense;
 using gmregion::Box;
-using gmregion::kKernelTolerance;
 using gmregion::Vec2;
 
 namespace {
@@ -32,6 +30,10 @@ namespace {
 using Row = std::vector<std::string>;
 
 constexpr int kDecimals = 4;
+constexpr int kLengthDigits = 4;
+
+/// Gaps up to this part of the joining tolerance are the rounding of drawings, and not told.
+constexpr double kNoticed = 0.01;
 
 /// Columns with text; the others hold numbers, which are set to the right.
 constexpr std::size_t kLayerColumn = 1;
@@ -96,9 +98,36 @@ std::string rowText(const Row& row, const std::vector<std::size_t>& widths) {
     return text + row.back() + "\n";
 }
 
-std::string kindText(const SkippedKind& kind, std::size_t count) {
-    return std::to_string(count) + " " + printable(kind.kind) + " on layer " +
-           printable(kind.layer) + ": " + kind.reason;
+/// "layer A: 3 contours, 1 open", a line each.
+std::string layerLines(const std::vector<Path>& contours) {
+    struct Counts {
+        std::size_t all = 0;
+        std::size_t open = 0;
+    };
+    std::map<std::string, Counts> layers;
+    for (const Path& contour : contours) {
+        Counts& counts = layers[contour.layer];
+        ++counts.all;
+        counts.open += contour.closed ? 0 : 1;
+    }
+    std::string text;
+    for (const auto& [layer, counts] : layers) {
+        text += "layer " + printable(layer) + ": " + counted(counts.all, "contour");
+        if (counts.open > 0) text += ", " + std::to_string(counts.open) + " open";
+        text += "\n";
+    }
+    return text;
+}
+
+std::string usedLine(const Part& part) {
+    std::string text;
+    bool hasCurves = false;
+    for (const auto& [kind, count] : part.report.used) {
+        text += (text.empty() ? "read: " : ", ") + std::to_string(count) + " " + printable(kind);
+        hasCurves = hasCurves || kind == "SPLINE" || kind == "ELLIPSE";
+    }
+    if (hasCurves) text += ", curves within " + formatReal(part.curveTolerance, kLengthDigits);
+    return text.empty() ? text : text + "\n";
 }
 
 }  // namespace
@@ -113,34 +142,31 @@ std::string infoTable(const Part& part) {
     std::string text;
     for (const Row& row : rows)
         text += rowText(row, widths);
-    return text + skipLines(part.skipped);
+    return text + "units: " + unitsText(part.units) + "\n" + layerLines(part.contours) +
+           usedLine(part) + lossLines(part);
 }
 
-std::string skipLines(const SkipReport& skipped) {
+std::string lossLines(const Part& part) {
     std::string text;
-    for (const auto& [kind, count] : skipped.unusable) {
+    for (const auto& [kind, count] : part.report.unusable)
         text += "skipped: " + kindText(kind, count) + "\n";
+    for (const auto& [kind, count] : part.report.leftOut)
+        text += "left out: " + kindText(kind, count) + "\n";
+    if (part.report.shortElements > 0) {
+        text += "dropped: " + counted(part.report.shortElements, "element") + " shorter than " +
+                formatReal(part.shortest, kLengthDigits) + "\n";
     }
-    if (skipped.shortElements > 0) {
-        text += "dropped: " + counted(skipped.shortElements, "element") + " shorter than " +
-                formatReal(kKernelTolerance) + "\n";
+    if (part.report.duplicates > 0) {
+        text += "dropped: " + counted(part.report.duplicates, "duplicate") + "\n";
     }
-    if (skipped.duplicates > 0) {
-        text += "dropped: " + counted(skipped.duplicates, "duplicate") + "\n";
+    if (part.mended.overlaps > 0) {
+        text += "mended: " + counted(part.mended.overlaps, "overlapping element") + " cut\n";
+    }
+    if (part.mended.largestGap > kNoticed * part.joinTolerance) {
+        text += "mended: " + counted(part.mended.gaps, "gap") + " up to " +
+                formatReal(part.mended.largestGap, kLengthDigits) + " closed\n";
     }
     return text;
-}
-
-std::string unusableLine(const SkipReport& skipped) {
-    const std::size_t total = skipped.unusableCount();
-    std::string text =
-        std::to_string(total) + (total == 1 ? " entity" : " entities") + " cannot be used (";
-    const char* separator = "";
-    for (const auto& [kind, count] : skipped.unusable) {
-        text += separator + kindText(kind, count);
-        separator = "; ";
-    }
-    return text + ")";
 }
 
 }  // namespace gmpath

@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: MIT
 #include "apps/gmpath/InputOptions.h"
 
-#include "apps/gmpath/InfoTable.h"
 #include "apps/gmpath/OptionKinds.h"
+#include "apps/gmpath/ReadRemarks.h"
 #include "apps/gmpath/Report.h"
 #include "drawing/InputError.h"
 
@@ -12,6 +12,24 @@ using gmdrawing::InputError;
 using gmdrawing::Part;
 using gmdrawing::readPart;
 
+namespace {
+
+void addUnitOption(CLI::App& command, InputOptions& input) {
+    const auto check = [](const std::string& text) {
+        return gmdrawing::unitNamed(text) ? std::string() : "not a unit of length";
+    };
+    const auto assign = [&input](const std::string& text) {
+        input.read.units = gmdrawing::unitNamed(text);
+    };
+    command
+        .add_option_function<std::string>(
+            "--units", assign, "units of the drawing: mm, cm, m, in, ft [as it says, else mm]")
+        ->check(CLI::Validator(check, ""))
+        ->type_name("NAME");
+}
+
+}  // namespace
+
 void addInputOptions(CLI::App& command, InputOptions& input) {
     command.add_option("PART", input.drawing, "part drawing (DXF in text form)")->required();
     addReadOptions(command, input);
@@ -19,10 +37,22 @@ void addInputOptions(CLI::App& command, InputOptions& input) {
 
 void addReadOptions(CLI::App& command, InputOptions& input) {
     command
-        .add_option("--join", input.read.joinTolerance,
-                    "join ends that lie this far apart, in units of the drawing")
-        ->transform(positiveNumber())
-        ->capture_default_str();
+        .add_option("--join", input.read.join,
+                    "join ends that lie this far apart [0.001mm, or 0.0005in]")
+        ->transform(positiveLength());
+    command
+        .add_option("--curve-tolerance", input.read.curves,
+                    "how far arcs may be from splines and ellipses [0.01mm, or 0.0005in]")
+        ->transform(positiveLength());
+    addUnitOption(command, input);
+    command
+        .add_option("--layer", input.read.layers.wanted,
+                    "only layers with names like this (* and ? stand for any), repeatable")
+        ->allow_extra_args(false);
+    command
+        .add_option("--skip-layer", input.read.layers.unwanted,
+                    "no layers with names like this, repeatable")
+        ->allow_extra_args(false);
     command.add_option("--scale", input.read.scale, "multiply all coordinates of the drawing")
         ->transform(positiveNumber())
         ->capture_default_str();
@@ -31,10 +61,10 @@ void addReadOptions(CLI::App& command, InputOptions& input) {
 
 Part readInput(const InputOptions& options, const Console& console) {
     Part part = readPart(options.drawing, options.read);
-    if (part.skipped.unusable.empty()) return part;
-    const std::string line = unusableLine(part.skipped);
-    if (options.strict) throw InputError(options.drawing + ": " + line);
-    Report(console.err, options.drawing).tell(line);
+    if (options.strict && !part.report.unusable.empty()) {
+        throw InputError(options.drawing + ": " + unusableLine(part.report));
+    }
+    tellReading(part, Report(console.err, options.drawing));
     return part;
 }
 

@@ -22,10 +22,14 @@ namespace gmpath {
 
 using gmdrawing::checkOutputs;
 using gmdrawing::counted;
+using gmdrawing::DrawingUnits;
 using gmdrawing::formatReal;
 using gmdrawing::InputError;
+using gmdrawing::Length;
+using gmdrawing::lengthIn;
 using gmdrawing::Part;
 using gmdrawing::ResultDrawing;
+using gmdrawing::saidUnits;
 using gmdrawing::writeOutputs;
 using gmpart::OffsetFault;
 using gmpart::offsetPart;
@@ -46,8 +50,8 @@ constexpr int kLegendDigits = 6;
 
 struct OffsetOptions {
     InputOptions input;
-    double distance = 0.0;       ///< of the first pass
-    std::optional<double> step;  ///< from one pass to the next; the first distance when left out
+    Length distance;             ///< of the first pass
+    std::optional<Length> step;  ///< from one pass to the next; the first distance when left out
     int count = 1;               ///< number of passes
     Side side = Side::kWaste;
     Join join = Join::kRound;
@@ -83,7 +87,7 @@ const std::map<std::string, bool>& engineNames() {
 
 void addPasses(CLI::App& offset, OffsetOptions& options) {
     offset.add_option("-d,--distance", options.distance, "distance of the first pass")
-        ->transform(finiteNumber())
+        ->transform(finiteLength())
         ->required();
     offset.add_option("--count", options.count, "number of passes")
         ->transform(countUpTo(kMaxPasses))
@@ -91,7 +95,7 @@ void addPasses(CLI::App& offset, OffsetOptions& options) {
     offset
         .add_option("--step", options.step,
                     "distance from one pass to the next [the first distance]")
-        ->transform(finiteNumber());
+        ->transform(finiteLength());
 }
 
 void addOptions(CLI::App& offset, OffsetOptions& options) {
@@ -118,11 +122,12 @@ void checkEngine(const OffsetOptions& options) {
     }
 }
 
-std::vector<double> distancesOf(const OffsetOptions& options) {
-    const double step = options.step.value_or(options.distance);
+std::vector<double> distancesOf(const OffsetOptions& options, const DrawingUnits& units) {
+    const double first = lengthIn(units, options.distance);
+    const double step = lengthIn(units, options.step.value_or(options.distance));
     std::vector<double> distances;
     for (int pass = 0; pass < options.count; ++pass) {
-        const double distance = options.distance + pass * step;
+        const double distance = first + pass * step;
         if (std::abs(distance) > kLargestNumber) {
             throw InputError("--distance, --step, --count: the last pass lies beyond 1e9");
         }
@@ -136,6 +141,7 @@ ResultDrawing drawingOf(const Part& part, const PartOffsets& offsets,
                         const std::vector<double>& distances, bool onSourceLayers) {
     ResultDrawing drawing{part.contours, {}, {}};
     drawing.results.resize(part.contours.size());
+    drawing.units = saidUnits(part.units);
     for (const OffsetPath& offset : offsets.paths)
         drawing.results[offset.main].push_back({offset.pass, offset.path, offset.doubtful});
     for (std::size_t pass = 0; pass < distances.size(); ++pass) {
@@ -226,10 +232,10 @@ PartOffsets offsetsOf(const Part& part, const OffsetOptions& options, const Offs
 }
 
 bool runOffset(const OffsetOptions& options, const Console& console) {
-    const std::vector<double> distances = distancesOf(options);
     checkEngine(options);
     checkOutputs(options.outputs, options.input.drawing);
     const Part part = readInput(options.input, console);
+    const std::vector<double> distances = distancesOf(options, part.units);
     const OffsetRequest request{
         options.side, distances, {options.join, gmregion::End::kRound}, options.each};
     const PartOffsets offsets = offsetsOf(part, options, request, console);

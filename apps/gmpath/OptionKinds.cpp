@@ -6,10 +6,12 @@
 #include <optional>
 
 #include "drawing/Text.h"
+#include "drawing/Units.h"
 
 namespace gmpath {
 
 using gmdrawing::formatReal;
+using gmdrawing::parseLength;
 using gmdrawing::parseReal;
 
 namespace {
@@ -29,21 +31,53 @@ CLI::Validator numberThat(const std::function<bool(double)>& fits, const std::st
     return CLI::Validator(check, "");
 }
 
-}  // namespace
-
-CLI::Validator finiteNumber() {
-    return numberThat([](double value) { return std::abs(value) <= kLargestNumber; },
-                      "not a finite number up to " + formatReal(kLargestNumber));
+/// The same for a length, whose text stays.
+CLI::Validator lengthThat(const std::function<bool(double)>& fits, const std::string& cause) {
+    const auto check = [=](std::string& text) {
+        const bool hasComma = text.find(',') != std::string::npos;
+        const auto length = hasComma ? std::nullopt : parseLength(text);
+        return length && fits(length->value) ? std::string() : cause;
+    };
+    return CLI::Validator(check, "");
 }
 
+bool isPositive(double value) {
+    return value > 0.0 && value <= kLargestNumber;
+}
+
+std::function<bool(double)> isFrom(double low) {
+    return [=](double value) { return value >= low && value <= kLargestNumber; };
+}
+
+std::string rangeText(double low) {
+    return "from " + formatReal(low) + " to " + formatReal(kLargestNumber);
+}
+
+std::string positiveText() {
+    return "above 0 and up to " + formatReal(kLargestNumber);
+}
+
+}  // namespace
+
 CLI::Validator positiveNumber() {
-    return numberThat([](double value) { return value > 0.0 && value <= kLargestNumber; },
-                      "not a number above 0 and up to " + formatReal(kLargestNumber));
+    return numberThat(isPositive, "not a number " + positiveText());
 }
 
 CLI::Validator numberFrom(double low) {
-    return numberThat([=](double value) { return value >= low && value <= kLargestNumber; },
-                      "not a number from " + formatReal(low) + " to " + formatReal(kLargestNumber));
+    return numberThat(isFrom(low), "not a number " + rangeText(low));
+}
+
+CLI::Validator finiteLength() {
+    return lengthThat([](double value) { return std::abs(value) <= kLargestNumber; },
+                      "not a length up to " + formatReal(kLargestNumber));
+}
+
+CLI::Validator positiveLength() {
+    return lengthThat(isPositive, "not a length " + positiveText());
+}
+
+CLI::Validator lengthFrom(double low) {
+    return lengthThat(isFrom(low), "not a length " + rangeText(low));
 }
 
 CLI::Validator angleUpTo(double largest) {

@@ -14,14 +14,17 @@ constexpr double kLargestNumber = 1e9;
 /// Numbers as options take them, to be given to `transform`: decimal, with a point, refused with
 /// the range in words where they lie outside. They do not show in the help.
 
-/// A number from -1e9 to 1e9.
-CLI::Validator finiteNumber();
-
 /// A number above 0 and up to 1e9.
 CLI::Validator positiveNumber();
 
 /// A number from `low` to 1e9.
 CLI::Validator numberFrom(double low);
+
+/// The same for lengths, for options of type `gmdrawing::Length`: they may be fractions as 1/4 and
+/// have a unit behind them. The range is that of the number alone.
+CLI::Validator finiteLength();
+CLI::Validator positiveLength();
+CLI::Validator lengthFrom(double low);
 
 /// An angle in degrees above 0, up to `largest`.
 CLI::Validator angleUpTo(double largest);

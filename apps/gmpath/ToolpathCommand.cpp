@@ -27,7 +27,6 @@ using gmdrawing::writeOutputs;
 using gmmachining::ContourCut;
 using gmmachining::LeadTally;
 using gmmachining::MachineSettings;
-using gmmachining::machineUnits;
 using gmmachining::MoveKind;
 using gmmachining::ToolpathRequest;
 using gmmachining::ToolpathResult;
@@ -40,15 +39,6 @@ namespace {
 
 constexpr int kSizeDigits = 4;
 constexpr int kLengthDecimals = 1;
-
-Units unitsOf(const ToolpathOptions& options, const Part& part) {
-    if (options.units) return *options.units;
-    try {
-        return machineUnits(part.units);
-    } catch (const InputError& error) {
-        throw InputError(options.input.drawing + ": " + error.what());
-    }
-}
 
 std::string shortenedText(const LeadTally& leads) {
     const std::string size = formatReal(leads.smallest, kSizeDigits);
@@ -115,20 +105,27 @@ std::string summary(const ToolpathResult& result, Units units) {
            std::to_string(leads.dropped) + " dropped\n";
 }
 
+/// Drawings whose units no machine has are told by their name.
+ToolpathRequest requestFor(const Part& part, const ToolpathOptions& options) {
+    try {
+        return toolpathRequest(options, part.units);
+    } catch (const InputError& error) {
+        throw InputError(options.input.drawing + ": " + error.what());
+    }
+}
+
 bool runToolpath(const ToolpathOptions& options, const Console& console) {
-    checkOptions(options);
     checkOutputs(options.outputs, options.input.drawing, {".ngc", ".svg"});
     // What the drawing holds besides is told only when the rest is in order.
     std::ostringstream remarks;
     const Part part = readInput(options.input, {console.out, remarks});
-    const Units units = unitsOf(options, part);
-    const ToolpathRequest request = toolpathRequest(options, units);
+    const ToolpathRequest request = requestFor(part, options);
     console.err << remarks.str();
     Progress progress(console.err, console.showProgress);
     const ToolpathResult result =
         makeToolpath(part.contours, request,
                      [&](std::size_t done, std::size_t total) { progress.show(done, total); });
-    const MachineSettings settings = machineSettings(options, units);
+    const MachineSettings settings = machineSettings(options, part.units);
     writeOutputs({{".ngc", [&](AtomicFile& file) { file.write(gcodeOf(result.moves, settings)); }},
                   {".svg", [&](AtomicFile& file) { file.write(svgOf(part.contours, result)); }}},
                  options.outputs);
@@ -136,7 +133,7 @@ bool runToolpath(const ToolpathOptions& options, const Console& console) {
     const Report report(console.err, options.input.drawing);
     reportOffsets(report, result.offsets);
     reportContours(report, result);
-    console.out << summary(result, units);
+    console.out << summary(result, settings.units);
     return result.offsets.refusals.empty() && result.offsets.faults.empty() &&
            result.together.empty() &&
            std::all_of(result.contours.begin(), result.contours.end(),

@@ -8,8 +8,8 @@
 
 namespace gmpath {
 
+using gmdrawing::Length;
 using gmmachining::LeadKind;
-using gmmachining::Units;
 using gmregion::kKernelTolerance;
 
 namespace {
@@ -30,26 +30,19 @@ const std::map<std::string, LeadKind>& leadNames() {
     return names;
 }
 
-const std::map<std::string, Units>& unitNames() {
-    static const std::map<std::string, Units> names = {{"mm", Units::kMillimetres},
-                                                       {"inch", Units::kInches}};
-    return names;
-}
-
 void addPassOptions(CLI::App& command, ToolpathOptions& options) {
     command.add_option("-t,--tool", options.tool, "diameter of the tool")
-        ->transform(numberFrom(kThinnestTool))
+        ->transform(lengthFrom(kThinnestTool))
         ->required();
-    command.add_option("--stock", options.stock, "material left on the part")
-        ->transform(numberFrom(0.0))
-        ->capture_default_str();
+    command.add_option("--stock", options.stock, "material left on the part [0]")
+        ->transform(lengthFrom(0.0));
     command.add_option("--count", options.count, "number of passes, the last along the part")
         ->transform(countUpTo(kMaxPasses))
         ->capture_default_str();
     command
         .add_option("--step", options.step,
                     "distance from one pass to the next [radius of the tool]")
-        ->transform(positiveNumber());
+        ->transform(positiveLength());
     CLI::Option* climb =
         command.add_flag("--climb", "the part lies right of the tool (the default)");
     command.add_flag("--conventional", options.conventional, "the part lies left of the tool")
@@ -62,27 +55,26 @@ void addLeadOptions(CLI::App& command, ToolpathOptions& options) {
     command
         .add_option("--lead-length", options.leadLength,
                     "length of straight leads [radius of the tool]")
-        ->transform(positiveNumber());
+        ->transform(positiveLength());
     command
         .add_option("--lead-radius", options.leadRadius, "radius of arc leads [radius of the tool]")
-        ->transform(positiveNumber());
+        ->transform(positiveLength());
     command.add_option("--lead-angle", options.leadAngle, "sweep of arc leads in degrees")
         ->transform(angleUpTo(kLargestLeadAngle))
         ->capture_default_str();
 }
 
 void addMachineOptions(CLI::App& command, ToolpathOptions& options) {
-    const auto add = [&](const char* name, std::optional<double>& value, const char* description) {
-        command.add_option(name, value, description)->transform(numberFrom(kSmallestProgramValue));
+    const auto add = [&](const char* name, std::optional<Length>& value, const char* description) {
+        command.add_option(name, value, description)->transform(lengthFrom(kSmallestProgramValue));
     };
     add("--depth", options.depth, "depth of the cut [1 mm, 0.04 in]");
     add("--step-down", options.stepDown, "depth from one level to the next [the whole depth]");
     add("--safe-z", options.safeZ, "height of rapid moves [5 mm, 0.2 in]");
     add("--feed", options.feed, "speed of cuts a minute [1000 mm, 40 in]");
     add("--plunge", options.plunge, "speed downwards a minute [a third of --feed]");
-    add("--spindle", options.spindle, "turns of the tool a minute");
-    addNamedOption(command, "--units", options.units, unitNames(),
-                   "mm or inch [those of the drawing, else mm]");
+    command.add_option("--spindle", options.spindle, "turns of the tool a minute")
+        ->transform(numberFrom(kSmallestProgramValue));
 }
 
 }  // namespace

@@ -6,31 +6,28 @@
 #include <vector>
 
 #include "apps/gmpath/InputOptions.h"
-#include "machining/gcode/MachineUnits.h"
 #include "machining/leads/Leads.h"
 
 namespace gmpath {
 
-/// Options of `toolpath`, in units of the drawing. What is left out has a default that depends on
-/// the tool or on the units.
+/// Options of `toolpath`. What is left out has a default that depends on the tool or on the units.
 struct ToolpathOptions {
     InputOptions input;
-    double tool = 0.0;  ///< diameter
-    double stock = 0.0;
+    gmdrawing::Length tool;  ///< diameter
+    gmdrawing::Length stock;
     int count = 1;
-    std::optional<double> step;
+    std::optional<gmdrawing::Length> step;
     gmmachining::LeadKind lead = gmmachining::LeadKind::kNone;
-    std::optional<double> leadLength;
-    std::optional<double> leadRadius;
+    std::optional<gmdrawing::Length> leadLength;
+    std::optional<gmdrawing::Length> leadRadius;
     double leadAngle = 90.0;  ///< degrees
-    std::optional<double> depth;
-    std::optional<double> stepDown;
-    std::optional<double> safeZ;
-    std::optional<double> feed;
-    std::optional<double> plunge;
+    std::optional<gmdrawing::Length> depth;
+    std::optional<gmdrawing::Length> stepDown;
+    std::optional<gmdrawing::Length> safeZ;
+    std::optional<gmdrawing::Length> feed;
+    std::optional<gmdrawing::Length> plunge;
     std::optional<double> spindle;
     bool conventional = false;
-    std::optional<gmmachining::Units> units;
     std::vector<std::string> outputs;
 };
 

@@ -7,15 +7,11 @@
 
 namespace gmpath {
 
-/// Checks what the options ask for together, as far as it needs no drawing. Throws InputError,
-/// naming the options.
-void checkOptions(const ToolpathOptions& options);
-
-/// What the options, checked, ask for in a drawing of these units. Throws InputError, naming the
-/// option, for a depth that takes too many levels.
+/// What the options ask for in a drawing of these units. Throws InputError, naming the options, for
+/// passes too far out, for a depth that takes too many levels, and for units that no machine has.
 gmmachining::ToolpathRequest toolpathRequest(const ToolpathOptions& options,
-                                             gmmachining::Units units);
+                                             const gmdrawing::DrawingUnits& drawing);
 gmmachining::MachineSettings machineSettings(const ToolpathOptions& options,
-                                             gmmachining::Units units);
+                                             const gmdrawing::DrawingUnits& drawing);
 
 }  // namespace gmpath

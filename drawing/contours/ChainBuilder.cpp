@@ -23,7 +23,6 @@ namespace gmdrawing {
 
 using gmpart::Path;
 using gmregion::Element;
-using gmregion::kKernelTolerance;
 using gmregion::Vec2;
 
 namespace {
@@ -34,11 +33,11 @@ struct OrderedContour {
     Path path;
 };
 
-std::size_t dropShort(std::vector<Path>& paths) {
+std::size_t dropShort(std::vector<Path>& paths, double shortest) {
     std::size_t dropped = 0;
     for (Path& path : paths) {
         const std::size_t before = path.elements.size();
-        dropped += before - dropShortElements(path, kKernelTolerance).size();
+        dropped += before - dropShortElements(path, shortest).size();
     }
     const auto empty = [](const Path& path) { return path.elements.empty(); };
     paths.erase(std::remove_if(paths.begin(), paths.end(), empty), paths.end());
@@ -146,17 +145,17 @@ std::vector<Path> joinOpenPaths(std::vector<Path> paths, double tolerance, MendR
 
 }  // namespace
 
-ChainResult buildChains(std::vector<Path> paths, double tolerance, bool withoutOverlaps) {
+ChainResult buildChains(std::vector<Path> paths, double tolerance, double shortest) {
     ChainResult result;
-    result.skipped.shortElements = dropShort(paths);
-    result.skipped.duplicates = dropDuplicates(paths);
+    result.shortElements = dropShort(paths, shortest);
+    result.duplicates = dropDuplicates(paths);
     result.contours = joinOpenPaths(std::move(paths), tolerance, result.mended);
-    if (withoutOverlaps) {
-        result.mended.overlaps = trimOverlaps(result.contours, tolerance);
+    result.mended.overlaps = trimOverlaps(result.contours, tolerance);
+    if (result.mended.overlaps > 0) {
         result.contours = joinOpenPaths(std::move(result.contours), tolerance, result.mended);
     }
     // Ends that were moved to meet may have left an element too short.
-    result.skipped.shortElements += dropShort(result.contours);
+    result.shortElements += dropShort(result.contours, shortest);
     return result;
 }
 

@@ -4,7 +4,6 @@
 #include <vector>
 
 #include "drawing/MendReport.h"
-#include "drawing/SkipReport.h"
 #include "part/model/Path.h"
 
 namespace gmdrawing {
@@ -12,13 +11,15 @@ namespace gmdrawing {
 /// Contours made from the paths of a drawing, and what was dropped on the way.
 struct ChainResult {
     std::vector<gmpart::Path> contours;
-    SkipReport skipped;
+    std::size_t shortElements = 0;  ///< dropped
+    std::size_t duplicates = 0;     ///< dropped
     MendReport mended;
 };
 
 /// Builds contours from paths as drawn: drops elements that are too short and paths drawn twice,
 /// then joins open paths of one layer end to end within the tolerance (see `joinEnds`), turns them
-/// round where needed and makes their ends meet exactly.
+/// round where needed and makes their ends meet exactly. What stays open is joined once more
+/// without the parts that lie on other elements within the tolerance (`trimOverlaps`).
 ///
 /// A path that nothing was joined to keeps its sense and start point. A joined contour depends on
 /// neither the order nor the sense of its pieces: when closed it runs counter-clockwise from its
@@ -27,9 +28,8 @@ struct ChainResult {
 ///
 /// @param paths as drawn
 /// @param tolerance ends that lie at most this far apart are joined, in units of the paths
-/// @param withoutOverlaps what stays open is joined once more without the parts that lie on other
-/// elements within the tolerance (`trimOverlaps`)
+/// @param shortest elements shorter than this are dropped, in units of the paths
 ChainResult buildChains(std::vector<gmpart::Path> paths, double tolerance,
-                        bool withoutOverlaps = false);
+                        double shortest = gmregion::kKernelTolerance);
 
 }  // namespace gmdrawing

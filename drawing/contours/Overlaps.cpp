@@ -13,6 +13,7 @@
 #include <cmath>
 #include <numeric>
 #include <optional>
+#include <string_view>
 #include <utility>
 
 #include "region/search/BoxRow.h"
@@ -34,6 +35,7 @@ using Range = std::pair<double, double>;
 struct Piece {
     Element element;
     std::size_t path = 0;
+    std::string_view layer;
     bool fixed = false;  ///< of a closed path
     double length = 0.0;
     std::vector<Range> left = {{0.0, 1.0}};
@@ -98,7 +100,7 @@ public:
         std::vector<Box> boxes;
         for (std::size_t i = 0; i < paths.size(); ++i) {
             for (const Element& e : paths[i].elements) {
-                m_pieces.push_back({e, i, paths[i].closed, length(e)});
+                m_pieces.push_back({e, i, paths[i].layer, paths[i].closed, length(e)});
                 boxes.push_back(boundingBox(e).grown(tolerance));
             }
         }
@@ -112,7 +114,8 @@ public:
             Piece& piece = m_pieces[i];
             if (piece.fixed) continue;
             m_boxes.visitOverlapping(m_boxes[i], [&](std::size_t other) {
-                if (ranks[other] < ranks[i]) cutBy(m_pieces[other].element, piece);
+                const bool counts = ranks[other] < ranks[i] && m_pieces[other].layer == piece.layer;
+                if (counts) cutBy(m_pieces[other].element, piece);
             });
             trimmed += isCut(piece) ? 1 : 0;
         }

@@ -17,7 +17,6 @@
 namespace gmdrawing {
 
 using gmpart::Path;
-using gmpart::Placement;
 using gmregion::Element;
 using gmregion::Vec2;
 
@@ -44,49 +43,54 @@ bool isWithin(const Path& path) {
 
 class Expansion {
 public:
-    explicit Expansion(const Drawing& drawing) : m_drawing(drawing) {}
+    Expansion(const Drawing& drawing, const ExpansionRules& rules)
+        : m_drawing(drawing), m_rules(rules) {}
 
-    ExpandedDrawing run(const Placement& placement) {
-        expand(m_drawing.model, placement, "0");
+    ExpandedDrawing run() {
+        expand(m_drawing.model, m_rules.placement, "0");
         return std::move(m_result);
     }
 
 private:
     void expand(const Block& block, const Placement& placement, const std::string& layer) {
-        for (const auto& [kind, count] : block.skipped.unusable) {
-            skip({kind.kind, placedLayer(kind.layer, layer), kind.reason}, count);
-        }
-        for (const Path& path : block.paths)
-            addPath(path, placement, layer);
-        for (const BlockReference& reference : block.references) {
+        for (const auto& [kind, count] : block.report.unusable)
+            skip(kind.kind, placedLayer(kind.layer, layer), kind.reason, count);
+        for (const Shape& shape : block.shapes)
+            add(shape, placement, layer);
+        for (const BlockReference& reference : block.references)
             expandReference(reference, placement, placedLayer(reference.layer, layer));
-        }
     }
 
-    void addPath(const Path& path, const Placement& placement, const std::string& layer) {
+    void add(const Shape& shape, const Placement& placement, const std::string& outerLayer) {
         countPlaced();
-        Path placed = placement.apply(path);
-        placed.layer = placedLayer(path.layer, layer);
-        if (isWithin(placed)) {
-            m_result.paths.push_back(std::move(placed));
-        } else {
-            skip({"path", placed.layer, "beyond the largest coordinate"}, 1);
-        }
+        const std::string layer = placedLayer(shape.layer, outerLayer);
+        if (leavesOut(shape.kind, layer, 1)) return;
+        std::optional<Path> placed = placedPath(shape, placement, m_rules.curveTolerance);
+        if (!placed) return skip(shape.kind, layer, "has no fit within the tolerance", 1);
+        if (!isWithin(*placed)) return skip(shape.kind, layer, "beyond the largest coordinate", 1);
+        placed->layer = layer;
+        m_result.paths.push_back(std::move(*placed));
+        ++m_result.report.used[shape.kind];
+    }
+
+    bool leavesOut(const std::string& kind, const std::string& layer, std::size_t count) {
+        const std::string reason = m_rules.layers.reasonAgainst(layer);
+        if (!reason.empty()) m_result.report.leftOut[{kind, layer, reason}] += count;
+        return !reason.empty();
     }
 
     void expandReference(const BlockReference& reference, const Placement& placement,
                          const std::string& layer) {
         const auto found = m_drawing.blocks.find(reference.block);
         if (found == m_drawing.blocks.end()) {
-            return skip({"INSERT", layer, "block is not defined"}, 1);
+            return skip("INSERT", layer, "block is not defined", 1);
         }
         const bool recursive =
             std::find(m_open.begin(), m_open.end(), &found->second) != m_open.end();
-        if (recursive) return skip({"INSERT", layer, "block places itself"}, 1);
-        if (m_open.size() >= kMaxDepth) return skip({"INSERT", layer, "nested too deeply"}, 1);
-        if (!blockPlacement(reference, {}, 0, 0)) {
-            return skip({"INSERT", layer, "scale is not uniform"}, 1);
-        }
+        if (recursive) return skip("INSERT", layer, "block places itself", 1);
+        if (m_rules.layers.isFrozen(layer) && leavesOut("INSERT", layer, 1)) return;
+        if (m_open.size() >= kMaxDepth) return skip("INSERT", layer, "nested too deeply", 1);
+        if (!blockPlacement(reference, {}, 0, 0)) return skip("INSERT", layer, "its scale is 0", 1);
         m_open.push_back(&found->second);
         expandCells(reference, found->second, placement, layer);
         m_open.pop_back();
@@ -107,8 +111,10 @@ private:
         return own == "0" ? ofReference : own;
     }
 
-    void skip(const SkippedKind& kind, std::size_t count) {
-        m_result.skipped.unusable[kind] += count;
+    void skip(const std::string& kind, const std::string& layer, const std::string& reason,
+              std::size_t count) {
+        if (!leavesOut(kind, layer, count))
+            m_result.report.unusable[{kind, layer, reason}] += count;
     }
 
     void countPlaced() {
@@ -118,6 +124,7 @@ private:
     }
 
     const Drawing& m_drawing;
+    const ExpansionRules& m_rules;
     std::vector<const Block*> m_open;  ///< blocks being placed, outermost first
     std::size_t m_placed = 0;
     ExpandedDrawing m_result;
@@ -125,8 +132,8 @@ private:
 
 }  // namespace
 
-ExpandedDrawing expandBlocks(const Drawing& drawing, const Placement& placement) {
-    return Expansion(drawing).run(placement);
+ExpandedDrawing expandBlocks(const Drawing& drawing, const ExpansionRules& rules) {
+    return Expansion(drawing, rules).run();
 }
 
 }  // namespace gmdrawing

@@ -4,7 +4,7 @@
 /// reference, and mirrored last where it is drawn on the back of the plane.
 ///
 /// Scale factors of one size but different sign mirror, which keeps arcs arcs; factors of different
-/// sizes would make them ellipses, and have no placement.
+/// sizes make ellipses of them. Sizes that differ by rounding are made one.
 
 #include "drawing/dxf/BlockPlacement.h"
 
@@ -12,7 +12,6 @@
 
 namespace gmdrawing {
 
-using gmpart::Placement;
 using gmregion::Vec2;
 
 namespace {
@@ -20,20 +19,20 @@ namespace {
 /// Scale factors that differ by less, in relation, count as equal.
 constexpr double kUniformTolerance = 1e-6;
 
-/// The scale with both factors of exactly one size; nothing when they differ or are 0.
-std::optional<Vec2> uniform(Vec2 scale) {
+/// The scale with both factors of exactly one size where they differ by rounding; nothing where one
+/// of them is 0.
+std::optional<Vec2> soundScale(Vec2 scale) {
     const double size = std::abs(scale.x);
-    if (size == 0.0 || std::abs(std::abs(scale.y) - size) > kUniformTolerance * size) {
-        return std::nullopt;
-    }
-    return Vec2{scale.x, std::copysign(size, scale.y)};
+    if (size == 0.0 || scale.y == 0.0) return std::nullopt;
+    const bool uniform = std::abs(std::abs(scale.y) - size) <= kUniformTolerance * size;
+    return uniform ? Vec2{scale.x, std::copysign(size, scale.y)} : scale;
 }
 
 }  // namespace
 
 std::optional<Placement> blockPlacement(const BlockReference& reference, Vec2 base, int column,
                                         int row) {
-    const std::optional<Vec2> scale = uniform(reference.scale);
+    const std::optional<Vec2> scale = soundScale(reference.scale);
     if (!scale) return std::nullopt;
     const Vec2 along{std::cos(reference.angle), std::sin(reference.angle)};
     const Vec2 across{-along.y, along.x};

@@ -5,8 +5,8 @@
 #include <string>
 #include <vector>
 
-#include "drawing/SkipReport.h"
-#include "part/model/Path.h"
+#include "drawing/ReadReport.h"
+#include "drawing/curves/Shape.h"
 
 namespace gmdrawing {
 
@@ -27,9 +27,9 @@ struct BlockReference {
 /// What a block, or the drawing itself, holds, in drawing order.
 struct Block {
     gmregion::Vec2 base;                     ///< the point that comes to lie where it is placed
-    std::vector<gmpart::Path> paths;         ///< lines, arcs, circles, polylines as drawn
+    std::vector<Shape> shapes;               ///< entities as drawn
     std::vector<BlockReference> references;  ///< blocks placed inside
-    SkipReport skipped;                      ///< entities that cannot be used
+    ReadReport report;                       ///< entities that cannot be used
 };
 
 /// A drawing as read, before its blocks are placed.

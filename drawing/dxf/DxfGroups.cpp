@@ -24,13 +24,15 @@ namespace {
 /// Hands out the lines of a text one by one.
 class Lines {
 public:
-    explicit Lines(std::string_view text) : m_rest(text) {}
+    /// Lines end with a line feed, or in files of old with a carriage return alone.
+    explicit Lines(std::string_view text)
+        : m_rest(text), m_end(text.find('\n') == std::string_view::npos ? '\r' : '\n') {}
 
     bool atEnd() const { return m_rest.empty(); }
     std::size_t number() const { return m_number; }
 
     std::string_view next() {
-        const std::size_t end = m_rest.find('\n');
+        const std::size_t end = m_rest.find(m_end);
         std::string_view line = m_rest.substr(0, end);
         m_rest.remove_prefix(end == std::string_view::npos ? m_rest.size() : end + 1);
         ++m_number;
@@ -40,6 +42,7 @@ public:
 
 private:
     std::string_view m_rest;
+    char m_end;
     std::size_t m_number = 0;
 };
 

@@ -3,13 +3,15 @@
 
 #include <cmath>
 
+#include "drawing/curves/EllipseArcs.h"
+
 namespace gmdrawing {
 
 using gmpart::appendArc;
 using gmpart::appendBulge;
-using gmpart::Path;
 using gmregion::Element;
 using gmregion::kPi;
+using gmregion::Vec2;
 
 namespace {
 
@@ -26,9 +28,27 @@ double sweepBetween(double startDegrees, double endDegrees) {
     return degrees == 0.0 ? 2.0 * kPi : degrees * kRadiansPerDegree;
 }
 
-void mirrorInX(Path& path) {
-    for (Element& e : path.elements)
-        e = {{-e.sp.x, e.sp.y}, {-e.ep.x, e.ep.y}, -e.bulge};
+/// Turned over the y axis.
+Shape mirroredInX(const Shape& shape) {
+    const Placement mirror = Placement::toAxes({}, {-1.0, 0.0}, {0.0, 1.0});
+    Shape result = shape;
+    for (Stroke& stroke : result.strokes) {
+        if (Element* e = std::get_if<Element>(&stroke)) *e = mirror.apply(*e);
+        if (Bezier* curve = std::get_if<Bezier>(&stroke)) *curve = mapped(*curve, mirror);
+    }
+    return result;
+}
+
+/// Moves the end of a row to its start where both differ by rounding, and tells whether it did.
+bool closeByRounding(std::vector<Bezier>& curves) {
+    constexpr double kRounding = 1e-9;
+    double size = 0.0;
+    for (const Bezier& curve : curves)
+        size += controlLength(curve);
+    const Vec2 start = curves.front().front().p;
+    if (!(distance(start, curves.back().back().p) <= kRounding * size)) return false;
+    curves.back().back().p = start;
+    return true;
 }
 
 int atLeastOne(int count) {
@@ -38,59 +58,101 @@ int atLeastOne(int count) {
 }  // namespace
 
 Drawing DxfReader::takeDrawing() {
-    finishPolyline();
+    finishEntity();
     return std::move(m_drawing);
 }
 
 void DxfReader::addBlock(const DL_BlockData& data) {
-    finishPolyline();
+    finishEntity();
     m_block = &m_drawing.blocks[data.name];
     m_block->base = {data.bpx, data.bpy};
 }
 
 void DxfReader::endBlock() {
-    finishPolyline();
+    finishEntity();
     m_block = nullptr;
 }
 
 void DxfReader::addLine(const DL_LineData& data) {
-    Path path = emptyPath();
-    path.elements.push_back({{data.x1, data.y1}, {data.x2, data.y2}});
-    addPath(std::move(path), false);
+    addElements(emptyShape("LINE"), {{{data.x1, data.y1}, {data.x2, data.y2}}}, false);
 }
 
 void DxfReader::addArc(const DL_ArcData& data) {
     if (isTilted("ARC")) return;
-    Path path = emptyPath();
     const double sweep = sweepBetween(data.angle1, data.angle2);
     const double start = std::fmod(data.angle1, 360.0) * kRadiansPerDegree;
-    appendArc(path.elements, {data.cx, data.cy}, data.radius, start, sweep);
-    path.closed = sweep == 2.0 * kPi;
-    addPath(std::move(path), isMirrored());
+    std::vector<Element> elements;
+    appendArc(elements, {data.cx, data.cy}, data.radius, start, sweep);
+    Shape shape = emptyShape("ARC");
+    shape.closed = sweep == 2.0 * kPi;
+    addElements(std::move(shape), elements, isMirrored());
 }
 
 void DxfReader::addCircle(const DL_CircleData& data) {
     if (isTilted("CIRCLE")) return;
-    Path path = emptyPath();
-    appendArc(path.elements, {data.cx, data.cy}, data.radius, 0.0, 2.0 * kPi);
-    path.closed = true;
-    addPath(std::move(path), isMirrored());
+    std::vector<Element> elements;
+    appendArc(elements, {data.cx, data.cy}, data.radius, 0.0, 2.0 * kPi);
+    Shape shape = emptyShape("CIRCLE");
+    shape.closed = true;
+    addElements(std::move(shape), elements, isMirrored());
+}
+
+/// Unlike arcs, ellipses on the back of the plane have the place of the front; only their sense of
+/// rotation is the other one.
+void DxfReader::addEllipse(const DL_EllipseData& data) {
+    if (isTilted("ELLIPSE")) return;
+    const double side = isMirrored() ? -1.0 : 1.0;
+    const Vec2 major{data.mx, data.my};
+    const Vec2 minor{-side * data.ratio * major.y, side * data.ratio * major.x};
+    if (length(major) == 0.0 || data.ratio == 0.0) {
+        return skip("ELLIPSE", attributes.getLayer(), "without width");
+    }
+    const double sweep =
+        sweepBetween(data.angle1 / kRadiansPerDegree, data.angle2 / kRadiansPerDegree);
+    constexpr double kWhole = 2.0 * kPi - 1e-6;
+    Shape shape = emptyShape("ELLIPSE");
+    shape.closed = sweep > kWhole;
+    addCurves(std::move(shape),
+              ellipseArc({{data.cx, data.cy}, major, minor}, std::fmod(data.angle1, 2.0 * kPi),
+                         sweep > kWhole ? 2.0 * kPi : sweep),
+              false);
 }
 
 void DxfReader::addPolyline(const DL_PolylineData& data) {
-    finishPolyline();
+    finishEntity();
     if (isTilted("polyline")) return;
     constexpr unsigned kClosedFlag = 1;
-    m_polyline = OpenPolyline{emptyPath(), isMirrored(), {}};
-    m_polyline->path.closed = (data.flags & kClosedFlag) != 0;
+    m_polyline = OpenPolyline{emptyShape("polyline"), isMirrored(), {}};
+    m_polyline->shape.closed = (data.flags & kClosedFlag) != 0;
 }
 
 void DxfReader::addVertex(const DL_VertexData& data) {
     if (m_polyline) m_polyline->corners.push_back({{data.x, data.y}, {}, data.bulge});
 }
 
+void DxfReader::addSpline(const DL_SplineData& data) {
+    finishEntity();
+    constexpr int kClosedFlags = 1 | 2;
+    m_spline = OpenSpline{emptyShape("SPLINE"), (data.flags & kClosedFlags) != 0, {}, {}};
+    m_spline->control.degree = data.degree;
+    m_spline->fit.startDirection = Vec2{data.tangentStartX, data.tangentStartY};
+    m_spline->fit.endDirection = Vec2{data.tangentEndX, data.tangentEndY};
+}
+
+void DxfReader::addControlPoint(const DL_ControlPointData& data) {
+    if (m_spline) m_spline->control.points.push_back({{data.x, data.y}, data.w});
+}
+
+void DxfReader::addFitPoint(const DL_FitPointData& data) {
+    if (m_spline) m_spline->fit.points.push_back({data.x, data.y});
+}
+
+void DxfReader::addKnot(const DL_KnotData& data) {
+    if (m_spline) m_spline->control.knots.push_back(data.k);
+}
+
 void DxfReader::endEntity() {
-    finishPolyline();
+    finishEntity();
 }
 
 void DxfReader::addInsert(const DL_InsertData& data) {
@@ -112,7 +174,7 @@ bool DxfReader::isTilted(const std::string& kind) {
     const double* normal = extrusion->getDirection();
     const double sideways = std::hypot(normal[0], normal[1]);
     if (sideways <= kUprightTolerance * std::abs(normal[2])) return false;
-    ++block().skipped.unusable[{kind, attributes.getLayer(), "in a tilted plane"}];
+    skip(kind, attributes.getLayer(), "in a tilted plane");
     return true;
 }
 
@@ -120,13 +182,32 @@ bool DxfReader::isMirrored() {
     return extrusion->getDirection()[2] < 0.0;
 }
 
-Path DxfReader::emptyPath() {
-    return {{}, false, attributes.getLayer()};
+void DxfReader::skip(const std::string& kind, const std::string& layer, const char* reason) {
+    ++block().report.unusable[{kind, layer, reason}];
 }
 
-void DxfReader::addPath(Path path, bool mirrored) {
-    if (mirrored) mirrorInX(path);
-    if (!path.elements.empty()) block().paths.push_back(std::move(path));
+Shape DxfReader::emptyShape(const std::string& kind) {
+    return {kind, attributes.getLayer()};
+}
+
+void DxfReader::addElements(Shape shape, const std::vector<Element>& elements, bool mirrored) {
+    shape.strokes.assign(elements.begin(), elements.end());
+    add(std::move(shape), mirrored);
+}
+
+void DxfReader::addCurves(Shape shape, const std::vector<Bezier>& curves, bool mirrored) {
+    shape.strokes.assign(curves.begin(), curves.end());
+    add(std::move(shape), mirrored);
+}
+
+void DxfReader::add(Shape shape, bool mirrored) {
+    if (shape.strokes.empty()) return;
+    block().shapes.push_back(mirrored ? mirroredInX(shape) : std::move(shape));
+}
+
+void DxfReader::finishEntity() {
+    finishPolyline();
+    finishSpline();
 }
 
 void DxfReader::finishPolyline() {
@@ -136,14 +217,33 @@ void DxfReader::finishPolyline() {
     std::vector<Element>& corners = polyline.corners;
     for (std::size_t i = 0; i + 1 < corners.size(); ++i)
         corners[i].ep = corners[i + 1].sp;
-    if (polyline.path.closed && !corners.empty()) {
+    if (polyline.shape.closed && !corners.empty()) {
         corners.back().ep = corners.front().sp;
     } else if (!corners.empty()) {
         corners.pop_back();
     }
+    std::vector<Element> elements;
     for (const Element& e : corners)
-        appendBulge(polyline.path.elements, e);
-    addPath(std::move(polyline.path), polyline.mirrored);
+        appendBulge(elements, e);
+    addElements(std::move(polyline.shape), elements, polyline.mirrored);
+}
+
+/// A spline is closed where its ends meet but for rounding.
+void DxfReader::finishSpline() {
+    if (!m_spline) return;
+    OpenSpline spline = std::move(*m_spline);
+    m_spline.reset();
+    spline.fit.closed = spline.closed;
+    const bool byPoints = spline.control.points.empty();
+    if (!byPoints) {
+        const char* fault = faultOf(spline.control);
+        if (*fault != '\0') return skip("SPLINE", spline.shape.layer, fault);
+    }
+    std::vector<Bezier> curves =
+        byPoints ? splineThrough(spline.fit) : bezierPieces(spline.control);
+    if (curves.empty()) return skip("SPLINE", spline.shape.layer, "too few points");
+    spline.shape.closed = closeByRounding(curves);
+    addCurves(std::move(spline.shape), curves, false);
 }
 
 }  // namespace gmdrawing

@@ -40,12 +40,14 @@ struct EntityKind {
 
 const std::vector<EntityKind>& usableKinds() {
     static const std::vector<EntityKind> kinds = {
-        {"LINE", {10, 20, 11, 21}, {}},
-        {"ARC", {10, 20, 40, 50, 51}, {210, 220, 230}},
-        {"CIRCLE", {10, 20, 40}, {210, 220, 230}},
-        {"LWPOLYLINE", {10, 20}, {70, 42, 210, 220, 230}},
+        {"LINE", {10, 20, 11, 21}, {30, 31}},
+        {"ARC", {10, 20, 40, 50, 51}, {30, 210, 220, 230}},
+        {"CIRCLE", {10, 20, 40}, {30, 210, 220, 230}},
+        {"LWPOLYLINE", {10, 20}, {70, 42, 38, 210, 220, 230}},
         {"POLYLINE", {}, {70, 210, 220, 230}},
-        {"VERTEX", {10, 20}, {42}},
+        {"VERTEX", {10, 20}, {30, 42}},
+        {"ELLIPSE", {10, 20, 11, 21, 40}, {30, 31, 41, 42, 210, 220, 230}},
+        {"SPLINE", {}, {70, 71, 10, 20, 30, 40, 41, 11, 21, 31, 12, 22, 13, 23}},
         {"INSERT", {2, 10, 20}, {41, 42, 50, 70, 71, 44, 45, 210, 220, 230}},
         {"BLOCK", {2}, {10, 20}},
     };
@@ -74,6 +76,9 @@ struct Record {
         const auto* found =
             std::find_if(first, last, [&](const DxfGroup& g) { return g.code == code; });
         return found == last ? std::string_view{} : trimmed(found->value).substr(0, kLongestName);
+    }
+    auto count(int code) const {
+        return std::count_if(first, last, [&](const DxfGroup& g) { return g.code == code; });
     }
     bool has(int code) const {
         return std::any_of(first, last, [&](const DxfGroup& g) { return g.code == code; });
@@ -198,18 +203,35 @@ private:
 
     void skip(const Record& record, const std::string& reason) {
         const std::string kind(record.kind.substr(0, kLongestName));
-        ++m_result.skipped[m_block].unusable[{kind, record.layer(), reason}];
+        ++m_result.skipped[m_block][{kind, record.layer(), reason}];
     }
 
     void write(const EntityKind& kind, const Record& record) {
         write("0", record.kind);
-        if (kind.name == "LWPOLYLINE") {
-            const auto vertices = std::count_if(record.first, record.last,
-                                                [](const DxfGroup& g) { return g.code == 10; });
-            write("90", std::to_string(vertices));
-        }
+        writeCounts(record);
+        noteHeights(record);
         for (const DxfGroup* g = record.first; g != record.last; ++g) {
             if (isHandedOn(kind, g->code)) writeValue(*g);
+        }
+    }
+
+    /// The library takes the counts of vertices, knots and points before any of them.
+    void writeCounts(const Record& record) {
+        if (record.kind == "LWPOLYLINE") write("90", std::to_string(record.count(10)));
+        if (record.kind != "SPLINE") return;
+        write("72", std::to_string(record.count(40)));
+        write("73", std::to_string(record.count(10)));
+        write("74", std::to_string(record.count(11)));
+    }
+
+    void noteHeights(const Record& record) {
+        if (record.kind == "BLOCK" || record.kind == "INSERT") return;
+        for (const DxfGroup* g = record.first; g != record.last; ++g) {
+            if (g->code != 30 && g->code != 31 && g->code != 38) continue;
+            const double z = parseReal(g->value).value_or(0.0);
+            m_result.lowest = m_anyHeight ? std::min(m_result.lowest, z) : z;
+            m_result.highest = m_anyHeight ? std::max(m_result.highest, z) : z;
+            m_anyHeight = true;
         }
     }
 
@@ -231,6 +253,7 @@ private:
     std::size_t m_next = 0;
     bool m_inside = false;  ///< inside a section that holds entities
     std::string m_block;    ///< block being defined, empty in the drawing itself
+    bool m_anyHeight = false;
     SanitizedDrawing m_result;
 };
 

@@ -5,7 +5,7 @@
 #include <string>
 #include <vector>
 
-#include "drawing/SkipReport.h"
+#include "drawing/ReadReport.h"
 #include "drawing/dxf/DxfGroups.h"
 
 namespace gmdrawing {
@@ -15,7 +15,9 @@ struct SanitizedDrawing {
     /// DXF text with the usable entities and blocks only: known kinds, sound numbers, right counts.
     std::string text;
     /// Entities left out, by the block that holds them; the drawing itself goes by the empty name.
-    std::map<std::string, SkipReport> skipped;
+    std::map<std::string, SkipCounts> skipped;
+    double lowest = 0.0;   ///< least height of a usable entity
+    double highest = 0.0;  ///< largest height of a usable entity
 };
 
 /// Sorts the entities of the drawing and its blocks into usable and unusable ones.

@@ -2,13 +2,17 @@
 #include "drawing/dxf/DxfWriter.h"
 
 #include <dxflib/dl_dxf.h>
+#include <utf8.h>
 
 #include <array>
+#include <cstdint>
+#include <cstdio>
 #include <fstream>
 #include <iterator>
 #include <map>
 #include <memory>
 
+#include "drawing/Text.h"
 #include "drawing/dxf/NumberLocale.h"
 
 namespace gmdrawing {
@@ -31,6 +35,28 @@ constexpr std::array<int, 8> kPassColours = {1, 5, 3, 6, 30, 4, 200, 94};
 constexpr const char* kLineType = "CONTINUOUS";
 constexpr const char* kSourceLayer = "SOURCE";
 
+/// The name as files of this version hold it: characters outside ASCII as \U+XXXX. Those beyond
+/// four digits have no such form.
+std::string escaped(const std::string& name) {
+    constexpr std::uint32_t kLastOfAscii = 0x7F;
+    constexpr std::uint32_t kLastOfFourDigits = 0xFFFF;
+    const std::string sound = printable(name);
+    std::string text;
+    for (auto it = sound.begin(); it != sound.end();) {
+        const std::uint32_t code = utf8::unchecked::next(it);
+        if (code <= kLastOfAscii) {
+            text += static_cast<char>(code);
+        } else if (code > kLastOfFourDigits) {
+            text += '?';
+        } else {
+            std::array<char, 8> digits{};
+            std::snprintf(digits.data(), digits.size(), "\\U+%04X", code);
+            text += digits.data();
+        }
+    }
+    return text;
+}
+
 class DxfWriter {
 public:
     DxfWriter(const ResultDrawing& drawing, const std::string& fileName)
@@ -39,6 +65,8 @@ public:
     bool run() {
         if (m_out == nullptr) return false;
         m_dxf.writeHeader(*m_out);
+        m_out->dxfString(9, "$INSUNITS");
+        m_out->dxfInt(70, m_drawing.units);
         m_out->sectionEnd();
         writeTables();
         writeEntities();
@@ -70,7 +98,7 @@ private:
         if (!m_drawing.replacesSources) colours[kSourceLayer] = kBlack;
         for (const std::vector<ResultPath>& results : m_drawing.results) {
             for (const ResultPath& result : results)
-                colours.emplace(layerOf(result), kBlack);
+                colours.emplace(escaped(layerOf(result)), kBlack);
         }
         for (std::size_t pass = 0; pass < m_drawing.passes.size(); ++pass) {
             const std::string& layer = m_drawing.passes[pass].layer;
@@ -98,7 +126,7 @@ private:
         }
         for (const std::vector<ResultPath>& results : m_drawing.results) {
             for (const ResultPath& result : results)
-                writePolyline(result.path, layerOf(result));
+                writePolyline(result.path, escaped(layerOf(result)));
         }
         m_out->sectionEnd();
     }

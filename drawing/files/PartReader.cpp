@@ -9,22 +9,35 @@
 #include "drawing/contours/ChainBuilder.h"
 #include "drawing/dxf/BlockExpansion.h"
 #include "drawing/dxf/DxfGroups.h"
+#include "drawing/dxf/DxfHeader.h"
 #include "drawing/dxf/DxfReader.h"
 #include "drawing/dxf/DxfSanitizer.h"
-#include "drawing/dxf/DxfUnits.h"
+#include "drawing/dxf/DxfText.h"
 #include "drawing/dxf/NumberLocale.h"
 
 namespace gmdrawing {
 
-using gmpart::Placement;
-
 namespace {
 
-void add(SkipReport& report, const SkipReport& other) {
-    for (const auto& [kind, count] : other.unusable)
-        report.unusable[kind] += count;
-    report.shortElements += other.shortElements;
-    report.duplicates += other.duplicates;
+/// A length by the customs of who draws in millimetres and of who draws in inches.
+struct CustomaryLength {
+    Length metric;
+    Length imperial;
+
+    double in(const DrawingUnits& units) const {
+        constexpr int kFeet = 2;
+        const bool isImperial = units.code == kInch || units.code == kFeet;
+        return lengthIn(units, isImperial ? imperial : metric);
+    }
+};
+
+constexpr CustomaryLength kJoin{{1e-3, kMillimetre}, {5e-4, kInch}};
+constexpr CustomaryLength kCurves{{1e-2, kMillimetre}, {5e-4, kInch}};
+constexpr CustomaryLength kShortest{{1e-4, kMillimetre}, {1e-5, kInch}};
+
+double lengthOr(const DrawingUnits& units, const std::optional<Length>& option,
+                const CustomaryLength& otherwise) {
+    return option ? lengthIn(units, *option) : otherwise.in(units);
 }
 
 Drawing readSanitized(const SanitizedDrawing& sanitized) {
@@ -34,32 +47,47 @@ Drawing readSanitized(const SanitizedDrawing& sanitized) {
     DL_Dxf reader;
     reader.in(stream, &collector);
     Drawing drawing = collector.takeDrawing();
-    for (const auto& [block, report] : sanitized.skipped) {
-        add(block.empty() ? drawing.model.skipped : drawing.blocks[block].skipped, report);
+    for (const auto& [block, skipped] : sanitized.skipped) {
+        SkipCounts& counts =
+            (block.empty() ? drawing.model : drawing.blocks[block]).report.unusable;
+        for (const auto& [kind, count] : skipped)
+            counts[kind] += count;
     }
     return drawing;
 }
 
-[[noreturn]] void failWithoutContours(const SkipReport& skipped) {
-    const std::size_t unusable = skipped.unusableCount();
-    throw InputError("the drawing holds no contours" +
-                     (unusable == 0
-                          ? std::string()
-                          : ", " + std::to_string(unusable) + " of its entities cannot be used"));
+[[noreturn]] void failWithoutContours(const ReadReport& report) {
+    std::string cause = "the drawing holds no contours";
+    if (!report.unusable.empty()) cause += "; cannot be used: " + kindsText(report.unusable);
+    if (!report.leftOut.empty()) cause += "; left out: " + kindsText(report.leftOut);
+    throw InputError(cause);
 }
 
 }  // namespace
 
 Part partFromText(const std::string& text, const ReadOptions& options) {
-    const std::vector<DxfGroup> groups = dxfGroups(text);
-    const Drawing drawing = readSanitized(sanitizedDrawing(groups));
-    ExpandedDrawing expanded = expandBlocks(drawing, Placement::scaling(options.scale));
-    ChainResult chains = buildChains(
-        std::move(expanded.paths), options.joinTolerance * options.scale, options.withoutOverlaps);
-    Part part{std::move(chains.contours), std::move(expanded.skipped), chains.mended,
-              drawingUnits(groups)};
-    add(part.skipped, chains.skipped);
-    if (part.contours.empty()) failWithoutContours(part.skipped);
+    const std::string plain = plainDxfText(text);
+    const std::vector<DxfGroup> groups = dxfGroups(plain);
+    Part part;
+    part.units = drawingUnits(groups, options.units);
+    part.joinTolerance = lengthOr(part.units, options.join, kJoin);
+    part.curveTolerance = lengthOr(part.units, options.curves, kCurves);
+    part.shortest = kShortest.in(part.units);
+    const SanitizedDrawing sanitized = sanitizedDrawing(groups);
+    ExpandedDrawing expanded =
+        expandBlocks(readSanitized(sanitized),
+                     {Placement::scaling(options.scale), part.curveTolerance * options.scale,
+                      LayerChoice(options.layers, hiddenLayers(groups))});
+    part.report = std::move(expanded.report);
+    part.report.lowest = sanitized.lowest;
+    part.report.highest = sanitized.highest;
+    ChainResult chains = buildChains(std::move(expanded.paths), part.joinTolerance * options.scale,
+                                     part.shortest * options.scale);
+    part.contours = std::move(chains.contours);
+    part.mended = chains.mended;
+    part.report.shortElements = chains.shortElements;
+    part.report.duplicates = chains.duplicates;
+    if (part.contours.empty()) failWithoutContours(part.report);
     return part;
 }
 

@@ -1,32 +1,42 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include <optional>
 #include <string>
 #include <vector>
 
-#include "drawing/DrawingUnits.h"
+#include "drawing/LayerChoice.h"
 #include "drawing/MendReport.h"
-#include "drawing/SkipReport.h"
+#include "drawing/ReadReport.h"
+#include "drawing/Units.h"
 #include "part/model/Path.h"
 
 namespace gmdrawing {
 
+/// How a drawing is read. Lengths are positive.
 struct ReadOptions {
-    /// Ends that lie at most this far apart are joined, in units of the drawing; positive.
-    double joinTolerance = 1e-3;
+    /// Ends that lie at most this far apart are joined [0.001 mm; 0.0005 in where the drawing is in
+    /// inches or feet].
+    std::optional<Length> join = std::nullopt;
+    /// How far arcs may be from ellipses and splines that they stand for [0.01 mm; 0.0005 in where
+    /// the drawing is in inches or feet].
+    std::optional<Length> curves = std::nullopt;
     /// Factor from units of the drawing to units of the result; positive.
     double scale = 1.0;
-    /// Whether what stays open is joined once more without the parts of elements that lie on
-    /// others.
-    bool withoutOverlaps = false;
+    /// The units of the drawing, whatever it says.
+    std::optional<int> units = std::nullopt;
+    LayerPatterns layers = {};
 };
 
 /// What a part drawing holds.
 struct Part {
     std::vector<gmpart::Path> contours;  ///< at least one, each with at least one element
-    SkipReport skipped;
+    ReadReport report;
     MendReport mended;
     DrawingUnits units;
+    double joinTolerance = 0.0;   ///< that was used, in units of the drawing
+    double curveTolerance = 0.0;  ///< that was used, in units of the drawing
+    double shortest = 0.0;        ///< shorter elements were dropped, in units of the drawing
 };
 
 /// Reads a part drawing (DXF in text form) and builds its contours.

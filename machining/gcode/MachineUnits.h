@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include "drawing/DrawingUnits.h"
+#include "drawing/Units.h"
 
 namespace gmmachining {
 

@@ -137,7 +137,7 @@ TEST(ChainBuilder, DuplicatesAreDroppedAndCounted) {
                      loose({{1, 1e-5}, {0, 0}, -0.5}), otherLayer, circle({5, 5}, 2), turned,
                      square, reversed(shifted), loose({{0, 0}, {1.01, 0}})},
                     kTolerance);
-    EXPECT_EQ(result.skipped.duplicates, 4U);
+    EXPECT_EQ(result.duplicates, 4U);
 }
 
 TEST(ChainBuilder, ShortElementsAreDroppedWithoutLosingTheirCourse) {
@@ -148,14 +148,14 @@ TEST(ChainBuilder, ShortElementsAreDroppedWithoutLosingTheirCourse) {
     const auto row = buildChains({polygon(corners, false)}, kTolerance);
     ASSERT_EQ(row.contours.size(), 1U);
     EXPECT_NEAR(length(row.contours[0]), 0.04, 1e-4);
-    EXPECT_EQ(row.skipped.shortElements + row.contours[0].elements.size(), 1000U);
+    EXPECT_EQ(row.shortElements + row.contours[0].elements.size(), 1000U);
     // A closed polyline that repeats vertices, the first one at its end included.
     const Path repeated = polygon({{0, 0}, {4, 0}, {4, 0}, {4, 3}, {0, 3}, {0, 1e-5}, {0, 0}});
     const auto square = buildChains({repeated}, kTolerance);
     ASSERT_EQ(square.contours.size(), 1U);
     EXPECT_TRUE(isConnected(square.contours[0]));
     EXPECT_EQ(square.contours[0].elements.size(), 4U);
-    EXPECT_EQ(square.skipped.shortElements, 3U);
+    EXPECT_EQ(square.shortElements, 3U);
     EXPECT_TRUE(
         buildChains({circle({0, 0}, 1e-5), loose({{1, 1}, {1, 1}})}, kTolerance).contours.empty());
 }

@@ -9,7 +9,7 @@
 #include <set>
 
 #include "drawing/InputError.h"
-#include "part/model/Placement.h"
+#include "drawing/curves/Placement.h"
 #include "tests/support/PathShapes.h"
 
 using namespace gmdrawing;

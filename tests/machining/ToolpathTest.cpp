@@ -5,7 +5,7 @@
 #include <filesystem>
 
 #include "drawing/InputError.h"
-#include "drawing/dxf/DxfUnits.h"
+#include "drawing/dxf/DxfHeader.h"
 #include "drawing/files/PartReader.h"
 #include "machining/ToolpathJob.h"
 #include "machining/gcode/GcodeWriter.h"
@@ -330,7 +330,8 @@ TEST(DrawingUnits, HeaderDecides) {
     const auto unitsOf = [](const std::string& header) {
         return machineUnits(drawingUnits(dxfGroups("0\nSECTION\n2\nHEADER\n" + header +
                                                    "0\nENDSEC\n0\nSECTION\n2\nENTITIES\n"
-                                                   "0\nENDSEC\n0\nEOF\n")));
+                                                   "0\nENDSEC\n0\nEOF\n"),
+                                         {}));
     };
     EXPECT_EQ(unitsOf(""), Units::kMillimetres);
     EXPECT_EQ(unitsOf("9\n$INSUNITS\n70\n1\n"), Units::kInches);

@@ -1,22 +1,18 @@
 // SPDX-License-Identifier: MIT
-#include "part/model/Placement.h"
+#include "drawing/curves/Placement.h"
 
 #include <cmath>
 
-namespace gmpart {
+namespace gmdrawing {
+
+using gmpart::Path;
+using gmregion::Element;
+using gmregion::Vec2;
 
 Placement Placement::scaling(double factor) {
     Placement placement;
     placement.m_xAxis = {factor, 0.0};
     placement.m_yAxis = {0.0, factor};
-    return placement;
-}
-
-Placement Placement::turning(double angle, Vec2 about) {
-    Placement placement;
-    placement.m_xAxis = {std::cos(angle), std::sin(angle)};
-    placement.m_yAxis = {-placement.m_xAxis.y, placement.m_xAxis.x};
-    placement.m_origin = about - placement.apply(about);
     return placement;
 }
 
@@ -40,12 +36,23 @@ Vec2 Placement::apply(Vec2 p) const {
     return m_origin + p.x * m_xAxis + p.y * m_yAxis;
 }
 
-Path Placement::apply(const Path& path) const {
+bool Placement::isSimilarity() const {
+    constexpr double kTolerance = 1e-6;
+    const double size = dot(m_xAxis, m_xAxis);
+    return std::abs(dot(m_yAxis, m_yAxis) - size) <= 2.0 * kTolerance * size &&
+           std::abs(dot(m_xAxis, m_yAxis)) <= kTolerance * size;
+}
+
+Element Placement::apply(const Element& e) const {
     const double turn = cross(m_xAxis, m_yAxis) < 0.0 ? -1.0 : 1.0;
+    return {apply(e.sp), apply(e.ep), turn * e.bulge};
+}
+
+Path Placement::apply(const Path& path) const {
     Path placed = path;
     for (Element& e : placed.elements)
-        e = {apply(e.sp), apply(e.ep), turn * e.bulge};
+        e = apply(e);
     return placed;
 }
 
-}  // namespace gmpart
+}  // namespace gmdrawing

@@ -1,0 +1,178 @@
+// SPDX-License-Identifier: MIT
+/// @file
+/// Curves as arcs.
+///
+/// The regions fit arcs to points with tangents, if the curve between two of them stays in the lens
+/// of the arcs that leave the first and reach the second along its tangent. So curves are halved
+/// until every lens is far thinner than the tolerance and three points of the curve inside lie in
+/// it: these find the tips of curves, whose lens is thin only because both its ends are alike. What
+/// is too small to be halved is a chord with corners at its ends.
+
+#include "drawing/curves/CurveFit.h"
+
+#include <algorithm>
+#include <cmath>
+
+#include "gmregion/Simplify.h"
+
+namespace gmdrawing {
+
+using gmregion::Element;
+using gmregion::Simplified;
+using gmregion::SimplifyOptions;
+using gmregion::TangentPoint;
+using gmregion::Vec2;
+
+namespace {
+
+/// The part of the tolerance that a lens may take.
+constexpr double kLensShare = 1.0 / 16.0;
+
+/// Curves up to this part of the tolerance are chords.
+constexpr double kChordShare = 1.0 / 64.0;
+
+constexpr int kFirstPieces = 4;
+
+/// Halvings beyond which a curve is taken for a chord.
+constexpr int kDeepest = 24;
+
+/// Directions that turn further than this from the chord are no lens, in cosines: 45 degrees.
+constexpr double kLeastCosine = 0.7071;
+
+/// Bulge of the arc over a chord that starts in a direction, both of length 1.
+double bulgeFrom(Vec2 direction, Vec2 chord) {
+    return cross(direction, chord) / (1.0 + dot(direction, chord));
+}
+
+class Sampling {
+public:
+    Sampling(const std::vector<Bezier>& curves, double tolerance) : m_tolerance(tolerance) {
+        for (const Bezier& curve : curves)
+            sample(curve);
+    }
+
+    /// The points of the row; of a closed one without the last, which is the first.
+    std::vector<TangentPoint> takePoints(bool closed) {
+        if (closed && m_points.size() > 2 && isSame(m_points.back(), m_points.front())) {
+            m_points.pop_back();
+        }
+        return std::move(m_points);
+    }
+
+private:
+    struct Place {
+        double t;
+        CurvePoint point;
+    };
+
+    void sample(const Bezier& curve) {
+        if (curve.size() == 2) return addChord(curve.front().p, curve.back().p);
+        Place from{0.0, pointAt(curve, 0.0)};
+        for (int i = 1; i <= kFirstPieces; ++i) {
+            const double t = static_cast<double>(i) / kFirstPieces;
+            const Place to{t, pointAt(curve, t)};
+            halve(curve, from, to, 0);
+            from = to;
+        }
+    }
+
+    void halve(const Bezier& curve, const Place& from, const Place& to, int depth) {
+        if (isSmall(curve, from, to) || depth == kDeepest) {
+            return addChord(from.point.at, to.point.at);
+        }
+        if (isLens(curve, from, to)) {
+            add(from.point.at, from.point.direction);
+            return add(to.point.at, to.point.direction);
+        }
+        const double t = 0.5 * (from.t + to.t);
+        const Place middle{t, pointAt(curve, t)};
+        halve(curve, from, middle, depth + 1);
+        halve(curve, middle, to, depth + 1);
+    }
+
+    bool isSmall(const Bezier& curve, const Place& from, const Place& to) const {
+        const double limit = kChordShare * m_tolerance;
+        return distance(from.point.at, to.point.at) < limit &&
+               controlLength(piece(curve, from.t, to.t)) < limit;
+    }
+
+    bool isLens(const Bezier& curve, const Place& from, const Place& to) const {
+        const Vec2 a = from.point.at;
+        const Vec2 b = to.point.at;
+        const double length = distance(a, b);
+        if (!(length > 0.0)) return false;
+        const Vec2 chord = (1.0 / length) * (b - a);
+        if (!(dot(from.point.direction, chord) > kLeastCosine)) return false;
+        if (!(dot(to.point.direction, chord) > kLeastCosine)) return false;
+        const double leaving = bulgeFrom(from.point.direction, chord);
+        const double reaching = bulgeFrom(chord, to.point.direction);
+        const double limit = kLensShare * m_tolerance;
+        if (!(0.5 * length * std::abs(leaving - reaching) <= limit)) return false;
+        const Element arc{a, b, leaving};
+        const auto isNear = [&](double share) {
+            const double t = from.t + share * (to.t - from.t);
+            return distance(arc, pointAt(curve, t).at) <= limit;
+        };
+        return isNear(0.25) && isNear(0.5) && isNear(0.75);
+    }
+
+    void addChord(Vec2 from, Vec2 to) {
+        const double length = distance(from, to);
+        if (!(length > 0.0)) return;
+        const Vec2 along = (1.0 / length) * (to - from);
+        add(from, along);
+        add(to, along);
+    }
+
+    /// Curves that meet share a point, two where there is a corner.
+    void add(Vec2 at, Vec2 direction) {
+        const TangentPoint point{at, direction};
+        if (m_points.empty() || !isSame(m_points.back(), point)) m_points.push_back(point);
+    }
+
+    static bool isSame(const TangentPoint& a, const TangentPoint& b) {
+        constexpr double kSmooth = 1e-9;
+        return a.at == b.at && length(a.tangent - b.tangent) < kSmooth;
+    }
+
+    double m_tolerance;
+    std::vector<TangentPoint> m_points;
+};
+
+bool areFinite(const std::vector<Bezier>& curves) {
+    const auto isFinite = [](const WeightedPoint& point) {
+        return std::isfinite(point.p.x) && std::isfinite(point.p.y) && std::isfinite(point.weight);
+    };
+    return std::all_of(curves.begin(), curves.end(), [&](const Bezier& curve) {
+        return std::all_of(curve.begin(), curve.end(), isFinite);
+    });
+}
+
+/// Arcs that leave their chord by rounding are segments.
+bool isFlat(const Element& e, double tolerance) {
+    constexpr double kFlatShare = 1e-6;
+    return 0.5 * std::abs(e.bulge) * distance(e.sp, e.ep) < kFlatShare * tolerance;
+}
+
+}  // namespace
+
+std::optional<std::vector<Element>> fitted(const std::vector<Bezier>& curves, bool closed,
+                                           double tolerance) {
+    if (!areFinite(curves)) return std::nullopt;
+    const std::vector<TangentPoint> points = Sampling(curves, tolerance).takePoints(closed);
+    if (points.size() < 2) return std::vector<Element>{};
+    SimplifyOptions options;
+    options.tolerance = tolerance;
+    Simplified simplified;
+    if (!simplifyCurve(points.data(), points.size(), closed, options, simplified)) {
+        return std::nullopt;
+    }
+    const gmregion::PathView path = simplified.paths[0];
+    std::vector<Element> elements(path.begin(), path.end());
+    for (Element& e : elements) {
+        if (isFlat(e, tolerance)) e.bulge = 0.0;
+    }
+    return elements;
+}
+
+}  // namespace gmdrawing
