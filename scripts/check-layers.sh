@@ -24,7 +24,7 @@ declare -A floors=(
     [bridge/public]=1 [bridge]=2
     [part/model]=8 [part/kernel]=9 [part/regions]=9 [part/offset]=10 [part/boolean]=10
     [part/corners]=10 [part/clean]=10
-    [drawing]=11 [drawing/contours]=12 [drawing/curves]=12 [drawing/dxf]=13 [drawing/svg]=13 [drawing/files]=14
+    [drawing]=11 [drawing/contours]=12 [drawing/curves]=12 [drawing/dxf]=13 [drawing/svg]=13 [drawing/svg/reading]=13 [drawing/files]=14
     [machining/moves]=15 [machining/runs]=15 [machining/obstacles]=15 [machining/order]=16
     [machining/gcode]=16 [machining/leads]=16 [machining]=17 [machining/picture]=18
     [apps/gmpath]=19

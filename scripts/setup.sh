@@ -7,7 +7,7 @@ set -euo pipefail
 packages=(
     g++ cmake ninja-build pkg-config
     libboost-dev libwxgtk3.2-dev          # the library
-    libdxflib-dev libcli11-dev            # gmpath
+    libdxflib-dev libcli11-dev libsvgpp-dev libpugixml-dev  # gmpath
     libutfcpp-dev                         # gmpath and the examples
     libgtest-dev librapidcheck-dev libgeos-dev  # tests
     libbenchmark-dev                      # benchmarks

@@ -194,7 +194,7 @@ Command addCombination(CLI::App& program, const Recipe& recipe) {
     const auto options = std::make_shared<CombineOptions>();
     addOutputs(*command, options->outputs);
     addReadOptions(*command, options->read);
-    command->add_option("PARTS", options->drawings, "part drawings (DXF in text form)")
+    command->add_option("PARTS", options->drawings, "part drawings (DXF in text form, or SVG)")
         ->required()
         ->expected(2, static_cast<int>(kMostParts));
     command->footer("Example: gmpath " + recipe.command +

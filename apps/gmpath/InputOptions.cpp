@@ -31,7 +31,8 @@ void addUnitOption(CLI::App& command, InputOptions& input) {
 }  // namespace
 
 void addInputOptions(CLI::App& command, InputOptions& input) {
-    command.add_option("PART", input.drawing, "part drawing (DXF in text form)")->required();
+    command.add_option("PART", input.drawing, "part drawing (DXF in text form, or SVG)")
+        ->required();
     addReadOptions(command, input);
 }
 

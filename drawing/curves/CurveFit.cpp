@@ -139,13 +139,25 @@ private:
     std::vector<TangentPoint> m_points;
 };
 
-bool areFinite(const std::vector<Bezier>& curves) {
-    const auto isFinite = [](const WeightedPoint& point) {
-        return std::isfinite(point.p.x) && std::isfinite(point.p.y) && std::isfinite(point.weight);
-    };
-    return std::all_of(curves.begin(), curves.end(), [&](const Bezier& curve) {
-        return std::all_of(curve.begin(), curve.end(), isFinite);
-    });
+/// The largest coordinate, HUGE_VAL where there is no number.
+double largestNumber(const std::vector<Bezier>& curves) {
+    double largest = 0.0;
+    for (const Bezier& curve : curves) {
+        for (const WeightedPoint& point : curve) {
+            const double size = std::max(std::abs(point.p.x), std::abs(point.p.y));
+            if (!std::isfinite(size) || !std::isfinite(point.weight)) return HUGE_VAL;
+            largest = std::max(largest, size);
+        }
+    }
+    return largest;
+}
+
+/// Whether the tolerance stands out from the rounding of the coordinates. Otherwise no halving
+/// would ever find a lens thin enough.
+bool isAboveRounding(double tolerance, double largest) {
+    constexpr double kRounding = 0x1p-40;
+    constexpr double kLargest = 1e12;
+    return largest <= kLargest && tolerance > kRounding * largest;
 }
 
 /// Arcs that leave their chord by rounding are segments.
@@ -158,7 +170,7 @@ bool isFlat(const Element& e, double tolerance) {
 
 std::optional<std::vector<Element>> fitted(const std::vector<Bezier>& curves, bool closed,
                                            double tolerance) {
-    if (!areFinite(curves)) return std::nullopt;
+    if (!isAboveRounding(tolerance, largestNumber(curves))) return std::nullopt;
     const std::vector<TangentPoint> points = Sampling(curves, tolerance).takePoints(closed);
     if (points.size() < 2) return std::vector<Element>{};
     SimplifyOptions options;

@@ -1,11 +1,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include <vector>
-
-#include "drawing/LayerChoice.h"
-#include "drawing/ReadReport.h"
-#include "drawing/curves/Placement.h"
+#include "drawing/curves/PathCollector.h"
 #include "drawing/dxf/Drawing.h"
 
 namespace gmdrawing {
@@ -17,12 +13,6 @@ struct ExpansionRules {
     LayerChoice layers;
 };
 
-/// The paths of a drawing with all blocks placed.
-struct ExpandedDrawing {
-    std::vector<gmpart::Path> paths;
-    ReadReport report;
-};
-
 /// Places everything the drawing holds, blocks within blocks included. Paths on layer "0" of a
 /// block take the layer of the reference that places it.
 ///
@@ -31,6 +21,6 @@ struct ExpandedDrawing {
 /// units. What lies on layers that are not wanted is left out and counted; so is all of a block
 /// that is placed on a frozen layer. Throws InputError when the blocks multiply beyond two million
 /// paths and placed blocks, and counts blocks nested deeper than 64 as unusable.
-ExpandedDrawing expandBlocks(const Drawing& drawing, const ExpansionRules& rules);
+PlacedPaths expandBlocks(const Drawing& drawing, const ExpansionRules& rules);
 
 }  // namespace gmdrawing

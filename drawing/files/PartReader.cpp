@@ -14,6 +14,7 @@
 #include "drawing/dxf/DxfSanitizer.h"
 #include "drawing/dxf/DxfText.h"
 #include "drawing/dxf/NumberLocale.h"
+#include "drawing/svg/reading/SvgReader.h"
 
 namespace gmdrawing {
 
@@ -63,25 +64,20 @@ Drawing readSanitized(const SanitizedDrawing& sanitized) {
     throw InputError(cause);
 }
 
-}  // namespace
-
-Part partFromText(const std::string& text, const ReadOptions& options) {
-    const std::string plain = plainDxfText(text);
-    const std::vector<DxfGroup> groups = dxfGroups(plain);
+/// A part that knows its units and the tolerances that go by them.
+Part emptyPart(const DrawingUnits& units, const ReadOptions& options) {
     Part part;
-    part.units = drawingUnits(groups, options.units);
-    part.joinTolerance = lengthOr(part.units, options.join, kJoin);
-    part.curveTolerance = lengthOr(part.units, options.curves, kCurves);
-    part.shortest = kShortest.in(part.units);
-    const SanitizedDrawing sanitized = sanitizedDrawing(groups);
-    ExpandedDrawing expanded =
-        expandBlocks(readSanitized(sanitized),
-                     {Placement::scaling(options.scale), part.curveTolerance * options.scale,
-                      LayerChoice(options.layers, hiddenLayers(groups))});
-    part.report = std::move(expanded.report);
-    part.report.lowest = sanitized.lowest;
-    part.report.highest = sanitized.highest;
-    ChainResult chains = buildChains(std::move(expanded.paths), part.joinTolerance * options.scale,
+    part.units = units;
+    part.joinTolerance = lengthOr(units, options.join, kJoin);
+    part.curveTolerance = lengthOr(units, options.curves, kCurves);
+    part.shortest = kShortest.in(units);
+    return part;
+}
+
+/// The part with the contours of what was placed.
+Part withContours(Part part, PlacedPaths placed, const ReadOptions& options) {
+    part.report = std::move(placed.report);
+    ChainResult chains = buildChains(std::move(placed.paths), part.joinTolerance * options.scale,
                                      part.shortest * options.scale);
     part.contours = std::move(chains.contours);
     part.mended = chains.mended;
@@ -89,6 +85,34 @@ Part partFromText(const std::string& text, const ReadOptions& options) {
     part.report.duplicates = chains.duplicates;
     if (part.contours.empty()) failWithoutContours(part.report);
     return part;
+}
+
+Part partFromSvg(const std::string& text, const ReadOptions& options) {
+    const SvgDrawing drawing(text);
+    Part part = emptyPart(drawing.units(options.units), options);
+    PlacedPaths placed = drawing.read(part.units, options.scale, part.curveTolerance,
+                                      LayerChoice(options.layers, {}));
+    return withContours(std::move(part), std::move(placed), options);
+}
+
+Part partFromDxf(const std::string& text, const ReadOptions& options) {
+    const std::string plain = plainDxfText(text);
+    const std::vector<DxfGroup> groups = dxfGroups(plain);
+    Part part = emptyPart(drawingUnits(groups, options.units), options);
+    const SanitizedDrawing sanitized = sanitizedDrawing(groups);
+    const LayerChoice layers(options.layers, hiddenLayers(groups));
+    PlacedPaths placed = expandBlocks(
+        readSanitized(sanitized),
+        {Placement::scaling(options.scale), part.curveTolerance * options.scale, layers});
+    placed.report.lowest = sanitized.lowest;
+    placed.report.highest = sanitized.highest;
+    return withContours(std::move(part), std::move(placed), options);
+}
+
+}  // namespace
+
+Part partFromText(const std::string& text, const ReadOptions& options) {
+    return isXml(text) ? partFromSvg(text, options) : partFromDxf(text, options);
 }
 
 Part readPart(const std::string& fileName, const ReadOptions& options) {

@@ -39,9 +39,9 @@ struct Part {
     double shortest = 0.0;        ///< shorter elements were dropped, in units of the drawing
 };
 
-/// Reads a part drawing (DXF in text form) and builds its contours.
+/// Reads a part drawing (DXF in text form, or SVG) and builds its contours.
 /// Throws InputError, with the file's name and the cause, for a file that is missing, unreadable,
-/// empty, truncated or no DXF file, for a drawing without contours, and when the locale of the
+/// empty, truncated or no drawing, for a drawing without contours, and when the locale of the
 /// process does not read numbers as drawings have them.
 Part readPart(const std::string& fileName, const ReadOptions& options);
 

@@ -73,14 +73,14 @@ void expectQuarter(const Path& path, Vec2 m, Vec2 start, Vec2 end) {
     expectPoint(halvingPoint(e), m + std::sqrt(0.5) * (start + end));
 }
 
-std::vector<Vec2> centresOf(const ExpandedDrawing& expanded) {
+std::vector<Vec2> centresOf(const PlacedPaths& expanded) {
     std::vector<Vec2> centres;
     for (const Path& path : expanded.paths)
         centres.push_back(centre(path.elements.front()));
     return centres;
 }
 
-std::size_t skipped(const ExpandedDrawing& expanded, const char* kind, const char* layer,
+std::size_t skipped(const PlacedPaths& expanded, const char* kind, const char* layer,
                     const char* reason) {
     const auto found = expanded.report.unusable.find({kind, layer, reason});
     return found == expanded.report.unusable.end() ? 0 : found->second;
@@ -136,7 +136,7 @@ TEST(BlockExpansion, PlacesABlockByItsBase) {
     };
     for (const auto& row : rows) {
         SCOPED_TRACE(row.name);
-        const ExpandedDrawing expanded = expandBlocks(placing(row.reference), {});
+        const PlacedPaths expanded = expandBlocks(placing(row.reference), {});
         ASSERT_EQ(expanded.paths.size(), 1U);
         expectQuarter(expanded.paths[0], row.m, row.start, row.end);
         // The same once more under the placement of the whole.
@@ -151,7 +151,7 @@ TEST(BlockExpansion, PlacesBlocksWithinBlocksFromTheInside) {
     // Scaled and moved within a block with a base of its own, which is mirrored and turned.
     Drawing drawing = placing(shaped(refer("OUTER", {100, 0}), {-1, 1}, 90));
     drawing.blocks["OUTER"] = {{10, 10}, {}, {shaped(refer("Q", {14, 10}), {2, 2}, 0)}, {}};
-    const ExpandedDrawing expanded = expandBlocks(drawing, ruled(Placement::scaling(10)));
+    const PlacedPaths expanded = expandBlocks(drawing, ruled(Placement::scaling(10)));
     ASSERT_EQ(expanded.paths.size(), 1U);
     expectQuarter(expanded.paths[0], {1000, -40}, {0, -20}, {-20, 0});
 }
@@ -196,7 +196,7 @@ TEST(BlockExpansion, GivesLayerZeroTheLayerOfTheReference) {
     Block& inner = drawing.blocks["INNER"];
     inner.shapes = {loose({{0, 0}, {1, 0}}), loose({{0, 1}, {1, 1}}, "OWN")};
     inner.report.unusable = {{{"TEXT", "0", "no"}, 3}, {{"TEXT", "OWN", "no"}, 1}};
-    const ExpandedDrawing expanded = expandBlocks(drawing, {});
+    const PlacedPaths expanded = expandBlocks(drawing, {});
     std::vector<std::string> layers;
     for (const Path& path : expanded.paths)
         layers.push_back(path.layer);
@@ -225,7 +225,7 @@ TEST(BlockExpansion, CountsReferencesThatCannotBePlaced) {
         Drawing drawing = placing(row.reference);
         drawing.blocks["SELF"].references = {refer("SELF", {9, 9})};
         drawing.model.references.push_back(refer("Q"));
-        const ExpandedDrawing expanded = expandBlocks(drawing, {});
+        const PlacedPaths expanded = expandBlocks(drawing, {});
         EXPECT_EQ(expanded.paths.size(), 1U) << "the other reference";
         EXPECT_EQ(skipped(expanded, "INSERT", "L", row.reason), 1U);
         EXPECT_EQ(expanded.report.unusableCount(), 1U);
@@ -236,11 +236,11 @@ TEST(BlockExpansion, FollowsBlocksUntilTheyComeBackOrLieTooDeep) {
     Drawing ring = placing(refer("A"));
     ring.blocks["A"].references = {refer("Q"), refer("B")};
     ring.blocks["B"].references = {refer("Q"), refer("A"), refer("Q"), refer("B")};
-    const ExpandedDrawing expanded = expandBlocks(ring, {});
+    const PlacedPaths expanded = expandBlocks(ring, {});
     EXPECT_EQ(expanded.paths.size(), 3U) << "one block may be placed side by side";
     EXPECT_EQ(skipped(expanded, "INSERT", "0", "block places itself"), 2U);
     EXPECT_EQ(expandBlocks(tower(64), {}).report.unusableCount(), 0U);
-    const ExpandedDrawing deep = expandBlocks(tower(70), {});
+    const PlacedPaths deep = expandBlocks(tower(70), {});
     EXPECT_EQ(deep.paths.size(), 64U);
     EXPECT_EQ(skipped(deep, "INSERT", "0", "nested too deeply"), 1U);
 }
@@ -255,7 +255,7 @@ TEST(BlockExpansion, LeavesOutPathsBeyondTheLargestCoordinate) {
     for (const FarCase& c : cases) {
         Drawing drawing;
         drawing.model.shapes = {loose(c.within), loose(c.beyond)};
-        const ExpandedDrawing expanded = expandBlocks(drawing, {});
+        const PlacedPaths expanded = expandBlocks(drawing, {});
         EXPECT_EQ(expanded.paths.size(), 1U) << c.name;
         EXPECT_EQ(skipped(expanded, "LINE", "0", "beyond the largest coordinate"), 1U) << c.name;
     }

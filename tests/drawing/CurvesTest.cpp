@@ -102,6 +102,7 @@ TEST(CurveFit, ArcsOfSmoothCurvesAreTangent) {
 TEST(CurveFit, NothingForWhatHasNoFit) {
     EXPECT_FALSE(fitted({cubic({0, 0}, {NAN, 0}, {1, 1}, {2, 0})}, false, kTolerance));
     EXPECT_FALSE(fitted({cubic({1e13, 0}, {1e13, 5}, {0, 5}, {0, 0})}, false, kTolerance));
+    EXPECT_FALSE(fitted({cubic({1e9, 0}, {1e9, 5}, {1e9 - 9, 5}, {0, 0})}, false, 1e-9));
     const auto point = fitted({cubic({3, 3}, {3, 3}, {3, 3}, {3, 3})}, false, kTolerance);
     EXPECT_TRUE(point && point->empty());
 }
