@@ -131,7 +131,7 @@ bool runClean(const CleanOptions& options, const Console& console) {
     const CleanResult cleaned = cleanPart(part.contours, requestOf(options, part.units));
     writeOutputs(drawingOf(part, cleaned.result.regions), options.outputs);
     if (cleaned.result.refusal) {
-        Report(console.err, options.input.drawing)
+        Report(console.err, options.input.drawing, part.contours)
             .tell("not cleaned: " + std::string(textOf(cleaned.result.refusal.reason)) +
                   placeText(cleaned.result.refusal.at));
     }

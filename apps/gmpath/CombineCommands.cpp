@@ -144,7 +144,7 @@ std::string summary(const Product& product, const PartCombination& found) {
 }
 
 /// Whether the result may be used; tells why not.
-bool isSound(const Product& product, const PartCombination& found, const Report& report) {
+bool isSound(const Product& product, const PartCombination& found, Report& report) {
     if (found.result.refusal) {
         report.tell(product.name + ": not made, " + textOf(found.result.refusal.reason) +
                     placeText(found.result.refusal.at));
@@ -157,7 +157,7 @@ bool isSound(const Product& product, const PartCombination& found, const Report&
 }
 
 void tellLeftOut(const PartCombination& found, const std::vector<std::string>& labels,
-                 const Report& report) {
+                 Report& report) {
     for (std::size_t i = 0; i < found.hasRegions.size(); ++i) {
         if (!found.hasRegions[i]) {
             report.tell("contour " + labels[i] + ": encloses nothing, left out");
@@ -174,7 +174,8 @@ bool runCombination(const Recipe& recipe, const CombineOptions& options, const C
         contours.push_back(&part.contours);
 
     ResultDrawing drawing = drawingOf(parts, recipe);
-    const Report report(console.err, options.drawings.front());
+    const std::vector<Path> unnamed;  // remarks go by the labels of their own
+    Report report(console.err, options.drawings.front(), unnamed);
     std::ostringstream summaries;
     bool sound = true;
     for (std::size_t i = 0; i < recipe.products.size(); ++i) {

@@ -115,7 +115,7 @@ bool runCorners(const CornersOptions& options, const Console& console) {
     drawing.units = saidUnits(part.units);
     writeOutputs(drawing, options.outputs);
 
-    const Report report(console.err, options.input.drawing);
+    Report report(console.err, options.input.drawing, part.contours);
     std::size_t done = 0;
     std::size_t notDone = 0;
     for (std::size_t i = 0; i < results.size(); ++i) {

@@ -65,7 +65,8 @@ Part readInput(const InputOptions& options, const Console& console) {
     if (options.strict && !part.report.unusable.empty()) {
         throw InputError(options.drawing + ": " + unusableLine(part.report));
     }
-    tellReading(part, Report(console.err, options.drawing));
+    Report report(console.err, options.drawing, part.contours);
+    tellReading(part, report);
     return part;
 }
 

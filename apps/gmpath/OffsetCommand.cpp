@@ -155,7 +155,7 @@ ResultDrawing drawingOf(const Part& part, const PartOffsets& offsets,
 class OffsetReport {
 public:
     OffsetReport(const PartOffsets& offsets, const std::vector<double>& distances,
-                 std::size_t contours, const Report& report)
+                 std::size_t contours, Report& report)
         : m_offsets(offsets), m_distances(distances), m_contours(contours), m_report(report) {}
 
     void tellAll() const {
@@ -218,7 +218,7 @@ private:
     const PartOffsets& m_offsets;
     const std::vector<double>& m_distances;
     std::size_t m_contours;
-    const Report& m_report;
+    Report& m_report;
 };
 
 PartOffsets offsetsOf(const Part& part, const OffsetOptions& options, const OffsetRequest& request,
@@ -240,7 +240,7 @@ bool runOffset(const OffsetOptions& options, const Console& console) {
         options.side, distances, {options.join, gmregion::End::kRound}, options.each};
     const PartOffsets offsets = offsetsOf(part, options, request, console);
     writeOutputs(drawingOf(part, offsets, distances, options.onSourceLayers), options.outputs);
-    const Report report(console.err, options.input.drawing);
+    Report report(console.err, options.input.drawing, part.contours);
     OffsetReport(offsets, distances, part.contours.size(), report).tellAll();
     console.out << counted(part.contours.size(), "contour") << ", "
                 << counted(offsets.paths.size(), "offset") << "\n";

@@ -33,6 +33,14 @@ std::string placeText(Point p) {
     return " near (" + coordinateText(p.x) + ", " + coordinateText(p.y) + ")";
 }
 
+std::string contourText(std::size_t contour, const std::vector<gmpart::Path>& contours) {
+    std::string number = "contour " + std::to_string(contour + 1);
+    if (contour >= contours.size() || contours[contour].elements.empty()) return number;
+    const gmpart::Path& path = contours[contour];
+    return number + " on layer " + gmdrawing::printable(path.layer) +
+           placeText(path.elements.front().sp);
+}
+
 std::string faultText(const Fault& fault, std::size_t count) {
     std::string text = textOf(fault.kind) + placeText(fault.at);
     if (fault.by > 0.0) text += " by " + formatReal(fault.by, kDistanceDigits);

@@ -16,6 +16,10 @@ constexpr int kDistanceDigits = 9;
 /// Where something is, to be put behind a text.
 std::string placeText(gmregion::Point p);
 
+/// "contour 3 on layer CUT near (1, 2)", counted from 1, with the start of the contour; its number
+/// alone where there is no such contour.
+std::string contourText(std::size_t contour, const std::vector<gmpart::Path>& contours);
+
 /// What is wrong with a result: the first of a number of faults.
 std::string faultText(const gmregion::Fault& fault, std::size_t count);
 

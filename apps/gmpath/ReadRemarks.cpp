@@ -28,7 +28,7 @@ std::string entitiesLine(const SkipCounts& counts, const std::string& what) {
            kindsText(counts) + ")";
 }
 
-void tellFrame(const Part& part, const Report& report) {
+void tellFrame(const Part& part, Report& report) {
     const std::optional<std::size_t> frame = frameOf(part.contours);
     if (!frame) return;
     const std::string layer = printable(part.contours[*frame].layer);
@@ -40,7 +40,7 @@ void tellFrame(const Part& part, const Report& report) {
 
 }  // namespace
 
-void tellReading(const Part& part, const Report& report) {
+void tellReading(const Part& part, Report& report) {
     constexpr int kHeightDigits = 6;
     const ReadReport& read = part.report;
     if (!read.unusable.empty()) report.tell(unusableLine(read));

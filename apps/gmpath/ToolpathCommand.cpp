@@ -11,14 +11,19 @@
 #include "apps/gmpath/ToolpathSettings.h"
 #include "drawing/InputError.h"
 #include "drawing/Text.h"
+#include "drawing/contours/BrokenContours.h"
 #include "drawing/files/OutputFiles.h"
 #include "machining/picture/ToolpathPicture.h"
 
 namespace gmpath {
 
 using gmdrawing::AtomicFile;
+using gmdrawing::BrokenContour;
+using gmdrawing::brokenContours;
 using gmdrawing::checkOutputs;
 using gmdrawing::counted;
+using gmdrawing::doubtfulContours;
+using gmdrawing::endingOf;
 using gmdrawing::formatFixed;
 using gmdrawing::formatReal;
 using gmdrawing::InputError;
@@ -34,6 +39,7 @@ using gmmachining::Units;
 using gmpart::OffsetFault;
 using gmpart::OffsetRefusal;
 using gmpart::PartOffsets;
+using gmpart::Path;
 
 namespace {
 
@@ -64,14 +70,14 @@ std::string remark(const ContourCut& cut) {
     return text;
 }
 
-void reportOffsets(const Report& report, const PartOffsets& offsets) {
+void reportOffsets(Report& report, const PartOffsets& offsets) {
     for (const OffsetRefusal& refusal : offsets.refusals)
         report.tell("no offset: " + std::string(textOf(refusal.reason)) + placeText(refusal.at));
     for (const OffsetFault& fault : offsets.faults)
         report.tell("an offset is faulty, not cut: " + faultText(fault.fault, fault.count));
 }
 
-void reportContours(const Report& report, const ToolpathResult& result) {
+void reportContours(Report& report, const ToolpathResult& result) {
     const std::vector<ContourCut>& cuts = result.contours;
     const auto runRound =
         std::count_if(cuts.begin(), cuts.end(), [](const ContourCut& cut) { return cut.runRound; });
@@ -114,30 +120,85 @@ ToolpathRequest requestFor(const Part& part, const ToolpathOptions& options) {
     }
 }
 
+/// The contours whose sides are known, by number. Tells which are broken.
+std::vector<std::size_t> soundContours(const Part& part, const ToolpathOptions& options,
+                                       Report& report) {
+    const double near = options.input.read.scale * part.joinTolerance;
+    const std::vector<BrokenContour> broken =
+        brokenContours(part.contours, part.report.places, near);
+    for (const BrokenContour& piece : broken)
+        report.tell(piece.contour, piece.reason + ", its end" + placeText(piece.at));
+    const std::vector<std::size_t> doubtful = doubtfulContours(part.contours, broken);
+    std::vector<std::size_t> sound;
+    for (std::size_t i = 0; i < part.contours.size(); ++i) {
+        if (!std::binary_search(doubtful.begin(), doubtful.end(), i)) sound.push_back(i);
+    }
+    if (doubtful.empty()) return sound;
+    report.tell(options.anyway ? "contours " + numbersText(doubtful) +
+                                     " are not cut: with broken ones about, their side is not known"
+                               : "nothing is written (--anyway cuts the other contours)");
+    return sound;
+}
+
+/// The tool path of some of the contours, told by the numbers of all.
+ToolpathResult toolpathOf(const std::vector<Path>& contours, const std::vector<std::size_t>& chosen,
+                          const ToolpathRequest& request, Progress& progress) {
+    std::vector<Path> paths;
+    for (const std::size_t contour : chosen)
+        paths.push_back(contours[contour]);
+    ToolpathResult result = makeToolpath(
+        paths, request, [&](std::size_t done, std::size_t total) { progress.show(done, total); });
+    std::vector<ContourCut> cuts(contours.size());
+    for (std::size_t i = 0; i < chosen.size(); ++i)
+        cuts[chosen[i]] = result.contours[i];
+    result.contours = std::move(cuts);
+    for (std::vector<std::size_t>& together : result.together) {
+        for (std::size_t& contour : together)
+            contour = chosen[contour];
+    }
+    for (gmmachining::Move& move : result.moves)
+        move.contour = chosen[move.contour];
+    return result;
+}
+
+/// Whether nothing is cut that is not known to be right.
+bool isSafe(const ToolpathResult& result) {
+    return result.offsets.refusals.empty() && result.offsets.faults.empty() &&
+           std::all_of(result.contours.begin(), result.contours.end(),
+                       [](const ContourCut& cut) { return cut.keepsAway; });
+}
+
+/// The outputs without the programs for machines.
+std::vector<std::string> withoutPrograms(std::vector<std::string> outputs) {
+    const auto isProgram = [](const std::string& name) { return endingOf(name) == ".ngc"; };
+    outputs.erase(std::remove_if(outputs.begin(), outputs.end(), isProgram), outputs.end());
+    return outputs;
+}
+
 bool runToolpath(const ToolpathOptions& options, const Console& console) {
     checkOutputs(options.outputs, options.input.drawing, {".ngc", ".svg"});
     // What the drawing holds besides is told only when the rest is in order.
     std::ostringstream remarks;
     const Part part = readInput(options.input, {console.out, remarks});
     const ToolpathRequest request = requestFor(part, options);
-    console.err << remarks.str();
-    Progress progress(console.err, console.showProgress);
-    const ToolpathResult result =
-        makeToolpath(part.contours, request,
-                     [&](std::size_t done, std::size_t total) { progress.show(done, total); });
     const MachineSettings settings = machineSettings(options, part.units);
+    console.err << remarks.str();
+    Report report(console.err, options.input.drawing, part.contours);
+    const std::vector<std::size_t> chosen = soundContours(part, options, report);
+    const bool complete = chosen.size() == part.contours.size();
+    if (chosen.empty() || (!complete && !options.anyway)) return false;
+    Progress progress(console.err, console.showProgress);
+    const ToolpathResult result = toolpathOf(part.contours, chosen, request, progress);
+    const bool safe = isSafe(result);
     writeOutputs({{".ngc", [&](AtomicFile& file) { file.write(gcodeOf(result.moves, settings)); }},
                   {".svg", [&](AtomicFile& file) { file.write(svgOf(part.contours, result)); }}},
-                 options.outputs);
+                 safe || options.anyway ? options.outputs : withoutPrograms(options.outputs));
     progress.clear();
-    const Report report(console.err, options.input.drawing);
     reportOffsets(report, result.offsets);
     reportContours(report, result);
+    if (!safe && !options.anyway) report.tell("no program is written (--anyway writes it)");
     console.out << summary(result, settings.units);
-    return result.offsets.refusals.empty() && result.offsets.faults.empty() &&
-           result.together.empty() &&
-           std::all_of(result.contours.begin(), result.contours.end(),
-                       [](const ContourCut& cut) { return cut.keepsAway; });
+    return complete && safe && result.together.empty();
 }
 
 }  // namespace

@@ -83,6 +83,9 @@ void addToolpathOptions(CLI::App& command, ToolpathOptions& options) {
     addPassOptions(command, options);
     addLeadOptions(command, options);
     addMachineOptions(command, options);
+    command.add_flag("--anyway", options.anyway,
+                     "write a program where contours are broken (the rest is cut), cuts come too "
+                     "near to others or offsets fail");
     addOutputs(command, options.outputs,
                "output file (.ngc for the machine, .svg for a picture), repeatable");
     addInputOptions(command, options.input);

@@ -28,6 +28,7 @@ struct ToolpathOptions {
     std::optional<gmdrawing::Length> plunge;
     std::optional<double> spindle;
     bool conventional = false;
+    bool anyway = false;  ///< writes the program in spite of what is wrong
     std::vector<std::string> outputs;
 };
 

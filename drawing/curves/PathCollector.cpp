@@ -11,6 +11,7 @@
 namespace gmdrawing {
 
 using gmpart::Path;
+using gmregion::Box;
 using gmregion::Element;
 using gmregion::Vec2;
 
@@ -48,6 +49,19 @@ void PathCollector::add(const Shape& shape, const Placement& placement, const st
 void PathCollector::skip(const std::string& kind, const std::string& layer,
                          const std::string& reason, std::size_t count) {
     if (!leavesOut(kind, layer, count)) m_result.report.unusable[{kind, layer, reason}] += count;
+}
+
+void PathCollector::addPlace(const SkippedPlace& place, const Placement& placement,
+                             const std::string& layer) {
+    if (!m_layers.reasonAgainst(layer).empty()) return;
+    Box box;
+    const Vec2 low = place.box.low;
+    const Vec2 high = place.box.high;
+    if (!place.box.isEmpty()) {
+        for (const Vec2 corner : {low, high, Vec2{low.x, high.y}, Vec2{high.x, low.y}})
+            box.include(placement.apply(corner));
+    }
+    m_result.report.places.push_back({place.kind, layer, box});
 }
 
 void PathCollector::leaveOut(const std::string& kind, const std::string& layer,

@@ -29,9 +29,13 @@ public:
     /// does.
     void add(const Shape& shape, const Placement& placement, const std::string& layer);
 
-    /// Counts what cannot be used; on layers that are not wanted it is left out.
+    /// Counts what cannot be used; on layers that are not wanted it is left out. Where it lies is
+    /// told by addPlace.
     void skip(const std::string& kind, const std::string& layer, const std::string& reason,
               std::size_t count = 1);
+
+    /// Takes up where something lies that cannot be used, unless its layer is not wanted.
+    void addPlace(const SkippedPlace& place, const Placement& placement, const std::string& layer);
 
     /// Counts what is not wanted for another reason than its layer.
     void leaveOut(const std::string& kind, const std::string& layer, const std::string& reason);

@@ -39,6 +39,8 @@ private:
     void expand(const Block& block, const Placement& placement, const std::string& layer) {
         for (const auto& [kind, count] : block.report.unusable)
             m_collector.skip(kind.kind, placedLayer(kind.layer, layer), kind.reason, count);
+        for (const SkippedPlace& place : block.report.places)
+            m_collector.addPlace(place, placement, placedLayer(place.layer, layer));
         for (const Shape& shape : block.shapes)
             m_collector.add(shape, placement, placedLayer(shape.layer, layer));
         for (const BlockReference& reference : block.references)
@@ -49,16 +51,14 @@ private:
                          const std::string& layer) {
         const auto found = m_drawing.blocks.find(reference.block);
         if (found == m_drawing.blocks.end()) {
-            return m_collector.skip("INSERT", layer, "block is not defined");
+            return skip(layer, "block is not defined");
         }
         const bool recursive =
             std::find(m_open.begin(), m_open.end(), &found->second) != m_open.end();
-        if (recursive) return m_collector.skip("INSERT", layer, "block places itself");
+        if (recursive) return skip(layer, "block places itself");
         if (m_rules.layers.isFrozen(layer) && m_collector.leavesOut("INSERT", layer)) return;
-        if (m_open.size() >= kMaxDepth)
-            return m_collector.skip("INSERT", layer, "nested too deeply");
-        if (!blockPlacement(reference, {}, 0, 0))
-            return m_collector.skip("INSERT", layer, "its scale is 0");
+        if (m_open.size() >= kMaxDepth) return skip(layer, "nested too deeply");
+        if (!blockPlacement(reference, {}, 0, 0)) return skip(layer, "its scale is 0");
         m_open.push_back(&found->second);
         expandCells(reference, found->second, placement, layer);
         m_open.pop_back();
@@ -73,6 +73,11 @@ private:
                 expand(block, placement.after(*cell), layer);
             }
         }
+    }
+
+    void skip(const std::string& layer, const char* reason) {
+        m_collector.skip("INSERT", layer, reason);
+        m_collector.addPlace({"INSERT", layer, {}}, {}, layer);
     }
 
     static std::string placedLayer(const std::string& own, const std::string& ofReference) {

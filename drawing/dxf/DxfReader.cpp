@@ -184,6 +184,7 @@ bool DxfReader::isMirrored() {
 
 void DxfReader::skip(const std::string& kind, const std::string& layer, const char* reason) {
     ++block().report.unusable[{kind, layer, reason}];
+    block().report.places.push_back({kind, layer, {}});
 }
 
 Shape DxfReader::emptyShape(const std::string& kind) {

@@ -21,6 +21,9 @@
 
 namespace gmdrawing {
 
+using gmregion::Box;
+using gmregion::Vec2;
+
 namespace {
 
 /// Coordinates beyond this leave too few digits for the kernel's tolerance.
@@ -125,6 +128,24 @@ std::string fault(const EntityKind& kind, const Record& record) {
     return mesh ? "a mesh" : "";
 }
 
+/// A box about all points of a record, grown by its radius; empty without points, and for a block
+/// reference, which says little about its extent.
+Box boxOf(const Record& record) {
+    constexpr int kFirstX = 10;
+    constexpr int kLastX = 18;
+    constexpr int kToY = 10;
+    Box box;
+    if (record.kind == "INSERT") return box;
+    for (const DxfGroup* g = record.first; g != record.last && g + 1 != record.last; ++g) {
+        const bool isPoint = g->code >= kFirstX && g->code <= kLastX && g[1].code == g->code + kToY;
+        const auto x = parseReal(g->value);
+        const auto y = parseReal(g[1].value);
+        if (!isPoint || !x || !y) continue;
+        box.include(Vec2{*x, *y});
+    }
+    return box.grown(std::abs(parseReal(record.value(40)).value_or(0.0)));
+}
+
 class Sanitizer {
 public:
     explicit Sanitizer(std::vector<Record> records) : m_records(std::move(records)) {}
@@ -204,6 +225,9 @@ private:
     void skip(const Record& record, const std::string& reason) {
         const std::string kind(record.kind.substr(0, kLongestName));
         ++m_result.skipped[m_block][{kind, record.layer(), reason}];
+        if (isOutlineKind(kind)) {
+            m_result.places[m_block].push_back({kind, record.layer(), boxOf(record)});
+        }
     }
 
     void write(const EntityKind& kind, const Record& record) {

@@ -16,6 +16,8 @@ struct SanitizedDrawing {
     std::string text;
     /// Entities left out, by the block that holds them; the drawing itself goes by the empty name.
     std::map<std::string, SkipCounts> skipped;
+    /// Of these what may belong to an outline, by block as well.
+    std::map<std::string, std::vector<SkippedPlace>> places;
     double lowest = 0.0;   ///< least height of a usable entity
     double highest = 0.0;  ///< largest height of a usable entity
 };

@@ -13,13 +13,6 @@ namespace gmdrawing {
 
 namespace {
 
-std::string endingOf(const std::string& name) {
-    std::string ending = std::filesystem::path(name).extension().string();
-    std::transform(ending.begin(), ending.end(), ending.begin(),
-                   [](unsigned char c) { return static_cast<char>(std::tolower(c)); });
-    return ending;
-}
-
 bool isSameFile(const std::string& a, const std::string& b) {
     std::error_code error;
     return std::filesystem::weakly_canonical(a, error) ==
@@ -50,6 +43,13 @@ void writeWholeDxf(const ResultDrawing& drawing, const AtomicFile& file) {
 }
 
 }  // namespace
+
+std::string endingOf(const std::string& name) {
+    std::string ending = std::filesystem::path(name).extension().string();
+    std::transform(ending.begin(), ending.end(), ending.begin(),
+                   [](unsigned char c) { return static_cast<char>(std::tolower(c)); });
+    return ending;
+}
 
 void checkOutputs(const std::vector<std::string>& names, const std::string& inputName,
                   const std::vector<std::string>& endings) {

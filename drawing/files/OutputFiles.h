@@ -16,6 +16,9 @@ struct OutputFormat {
     std::function<void(AtomicFile& file)> write;
 };
 
+/// The ending of a file name with its point, in small letters.
+std::string endingOf(const std::string& name);
+
 /// Checks the names of the files to write before any work is done. Throws InputError for an ending
 /// that is none of those given, for a name given twice, for the name of the drawing that is read,
 /// and where no file can be created.

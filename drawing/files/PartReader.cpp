@@ -54,6 +54,11 @@ Drawing readSanitized(const SanitizedDrawing& sanitized) {
         for (const auto& [kind, count] : skipped)
             counts[kind] += count;
     }
+    for (const auto& [block, places] : sanitized.places) {
+        std::vector<SkippedPlace>& all =
+            (block.empty() ? drawing.model : drawing.blocks[block]).report.places;
+        all.insert(all.end(), places.begin(), places.end());
+    }
     return drawing;
 }
 

@@ -144,7 +144,8 @@ TEST_F(Program, ToolpathWritesProgramAndPicture) {
         run("toolpath feet.dxf --scale 12 --units inch --tool 14 --lead arc --spindle 8000 "
             "-o a.NGC -o a.svg");
     EXPECT_EQ(cut.exitCode, 0);
-    EXPECT_EQ(cut.err, "gmpath: feet.dxf: contour 2: the tool does not fit\n");
+    EXPECT_EQ(cut.err,
+              "gmpath: feet.dxf: contour 2 on layer 0 near (66, 60): the tool does not fit\n");
     EXPECT_EQ(cut.out.find("2 contours, cuts 270.2 in, "), 0U) << cut.out;
     EXPECT_NE(m_scratch.content("a.NGC").find("\nG20\n"), std::string::npos);
     EXPECT_NE(m_scratch.content("a.NGC").find("\nM3 S8000.000\n"), std::string::npos);
@@ -162,7 +163,8 @@ TEST_F(Program, CornersAndMeltSayWhatTheyDid) {
     const Outcome corners = run("corners b.dxf --chamfer 1.2 -o c.svg -o c.dxf");
     EXPECT_EQ(corners.exitCode, 0);
     EXPECT_EQ(corners.out, "2 contours, 4 corners done, 4 not done\n");
-    EXPECT_EQ(corners.err, "gmpath: b.dxf: contour 2: no room at 4 of 4 corners\n");
+    EXPECT_EQ(corners.err,
+              "gmpath: b.dxf: contour 2 on layer 0 near (1, 1): no room at 4 of 4 corners\n");
     const Outcome rounded = run("info c.dxf");
     EXPECT_EQ(contourRows(rounded.out), 2) << "no sources beside";
     const Outcome melt = run("melt a.dxf b.dxf -o m.svg -o m.dxf");
@@ -209,7 +211,10 @@ TEST_F(Program, FaultyOffsetsOfTheKernelAreNamedAndDashed) {
     const Outcome offset =
         run("offset a.dxf --engine kernel --distance 1 --side left -o a.svg -o b.dxf");
     EXPECT_EQ(offset.exitCode, 1);
-    EXPECT_EQ(offset.err.find("gmpath: a.dxf: contour 1: the offset at distance 1 is faulty: "), 0U)
+    EXPECT_EQ(offset.err.find(
+                  "gmpath: a.dxf: contour 1 on layer 0 near (0, 0): the offset at distance 1 is "
+                  "faulty: "),
+              0U)
         << offset.err;
     EXPECT_EQ(m_scratch.files(), 3U);
     const std::string svg = m_scratch.content("a.svg");
@@ -233,13 +238,77 @@ TEST_F(Program, CleanTellsWhatItMended) {
     EXPECT_NE(info.out.find("150.0000"), std::string::npos);
 }
 
+TEST_F(Program, NoProgramWhereContoursAreBroken) {
+    using drawing_text::circle;
+    using drawing_text::drawing;
+    using drawing_text::entity;
+    using drawing_text::line;
+    // An outline that lacks a side, with a hole; beside it a whole part.
+    const std::string torn = line({0, 0}, {40, 0}) + line({40, 0}, {40, 20}) +
+                             line({0, 20}, {0, 0}) + circle({20, 10}, 5);
+    const std::string whole = circle({80, 10}, 12) + circle({80, 10}, 6);
+    m_scratch.store("a.dxf", drawing(torn + line({40, 20}, {30, 20}) + whole));
+    const Outcome refused = run("toolpath a.dxf --tool 2 -o a.ngc -o a.svg");
+    EXPECT_EQ(refused.exitCode, 1);
+    EXPECT_NE(refused.err.find("is open by 30 but runs round others"), std::string::npos);
+    EXPECT_EQ(m_scratch.files(), 1U) << "no output is written";
+
+    // The side is there, but of a kind that cannot be read.
+    const std::string side =
+        entity("MLINE", {{8, "0"}, {10, "40"}, {20, "20"}, {11, "0"}, {21, "20"}});
+    m_scratch.store("a.dxf", drawing(torn + side + whole));
+    const Outcome skipped = run("toolpath a.dxf --tool 2 -o a.ngc");
+    EXPECT_EQ(skipped.exitCode, 1);
+    EXPECT_NE(skipped.err.find("ends where a MLINE on layer 0 was skipped"), std::string::npos);
+    EXPECT_EQ(m_scratch.files(), 1U);
+    const Outcome anyway = run("toolpath a.dxf --tool 2 --anyway -o a.ngc");
+    EXPECT_EQ(anyway.exitCode, 1);
+    EXPECT_NE(anyway.err.find("contours 1 and 2 are not cut"), std::string::npos);
+    const std::string program = m_scratch.content("a.ngc");
+    EXPECT_NE(program.find("(contour 3)"), std::string::npos);
+    EXPECT_NE(program.find("(contour 4)"), std::string::npos);
+    EXPECT_EQ(program.find("(contour 1)"), std::string::npos);
+    EXPECT_EQ(program.find("(contour 2)"), std::string::npos);
+    // Texts may lie where they will, and slits may be open.
+    m_scratch.store(
+        "a.dxf", drawing(whole + line({80, 0}, {80, 2}) + entity("TEXT", {{10, "80"}, {20, "2"}})));
+    EXPECT_EQ(run("toolpath a.dxf --tool 0.5 -o b.ngc").exitCode, 0);
+}
+
+TEST_F(Program, NoProgramWhereCutsEnterOthers) {
+    using drawing_text::circle;
+    using drawing_text::drawing;
+    using drawing_text::line;
+    m_scratch.store("a.dxf", drawing(circle({0, 0}, 10) + line({-20, 0}, {20, 0}, "SLIT")));
+    const Outcome refused = run("toolpath a.dxf --tool 2 -o a.ngc -o a.svg");
+    EXPECT_EQ(refused.exitCode, 1);
+    EXPECT_NE(refused.err.find("no program is written"), std::string::npos);
+    EXPECT_EQ(m_scratch.files(), 2U) << "the picture shows why";
+    EXPECT_EQ(run("toolpath a.dxf --tool 2 --anyway -o a.ngc").exitCode, 1);
+    EXPECT_EQ(m_scratch.files(), 3U);
+}
+
+TEST_F(Program, LikeRemarksAreOneLine) {
+    using drawing_text::circle;
+    using drawing_text::drawing;
+    std::string dots;
+    for (int i = 0; i < 50; ++i)
+        dots += circle({10.0 * i, 0}, 1);
+    m_scratch.store("a.dxf", drawing(dots));
+    const Outcome outcome = run("offset a.dxf --distance -2 -o a.svg");
+    EXPECT_EQ(outcome.err,
+              "gmpath: a.dxf: 50 times: contour 1 on layer 0 near (1, 0): nothing left at distance "
+              "-2; contour 2 on layer 0 near (11, 0): nothing left at distance -2; contour 3 on "
+              "layer 0 near (21, 0): nothing left at distance -2; and 47 more\n");
+}
+
 TEST_F(Program, RefusedContoursAreToldWithTheCause) {
     const std::vector<gmregion::Element> touching = {
         {{0, 0}, {}}, {{10, 0}, {}}, {{10, 10}, {}}, {{0.00005, 0}, {}}};
     m_scratch.store("a.dxf", drawing_text::drawing(drawing_text::lightPolyline(touching, false)));
     const Outcome outcome = run("corners a.dxf --radius 1 -o b.svg --join 1e-6");
     EXPECT_EQ(outcome.exitCode, 1);
-    EXPECT_NE(outcome.err.find("gmpath: a.dxf: contour 1: "), std::string::npos);
+    EXPECT_NE(outcome.err.find("gmpath: a.dxf: contour 1 on layer 0 near "), std::string::npos);
     EXPECT_NE(outcome.err.find("open, but its end comes within 0.0001 of its start"),
               std::string::npos);
     EXPECT_EQ(run("offset a.dxf --distance 1 -o b.svg").exitCode, 0) << "closed by the joining";

@@ -146,10 +146,10 @@ private:
         if (isHidden(node)) return m_collector.leaveOut(kind, inside.layer, "not displayed");
         if (isUnusable(name)) return m_collector.skip(kind, inside.layer, "kind cannot be used");
         if (around.depth >= kMaxDepth) {
-            return m_collector.skip(kind, inside.layer, "nested too deeply");
+            return skip(kind, inside.layer, "nested too deeply");
         }
         const auto placement = placementOf(node.attribute("transform").value());
-        if (!placement) return m_collector.skip(kind, inside.layer, "broken transformation");
+        if (!placement) return skip(kind, inside.layer, "broken transformation");
         enter(node, name,
               {around.placement.after(*placement), inside.layer, inside.inLayer, around.depth + 1});
     }
@@ -158,9 +158,15 @@ private:
         if (isContainer(name)) return children(node, inside);
         if (name == "use") return follow(node, inside);
         const auto shapes = svgShapes(node, name);
-        if (!shapes) return m_collector.skip(std::string(name), inside.layer, "broken");
+        if (!shapes) return skip(std::string(name), inside.layer, "broken");
         for (const Shape& shape : *shapes)
             m_collector.add(shape, inside.placement, inside.layer);
+    }
+
+    /// Counts what may belong to an outline.
+    void skip(const std::string& kind, const std::string& layer, const char* reason) {
+        m_collector.skip(kind, layer, reason);
+        m_collector.addPlace({kind, layer, {}}, {}, layer);
     }
 
     /// Groups that an editor marks are layers wherever they are; outermost groups with a name are,
@@ -184,7 +190,7 @@ private:
     void follow(const pugi::xml_node& use, const Surroundings& around) {
         m_collector.countPlaced();
         const pugi::xml_node target = referenced(use);
-        if (!target) return m_collector.skip("use", around.layer, "refers to nothing");
+        if (!target) return skip("use", around.layer, "refers to nothing");
         const Vec2 at{svgLength(use.attribute("x").value()).value_or(0.0),
                       svgLength(use.attribute("y").value()).value_or(0.0)};
         Surroundings inside = around;
