@@ -73,6 +73,8 @@ check_foreign() { # source file, included header
     case $2 in
         wx/*) places='^kernel/values/(PointerList\.h|TraceText\.cpp)$' ;;
         dxflib/*) places='^drawing/(dxf|files)/' ;;
+        pugixml.hpp) places='^drawing/(svg/reading|files)/' ;;
+        svgpp/*) places='^drawing/svg/reading/' ;;
         CLI/*) places='^apps/' ;;
         *) return 0 ;;
     esac

@@ -12,6 +12,7 @@
 #include "apps/gmpath/ToolpathCommand.h"
 #include "drawing/InputError.h"
 #include "drawing/Text.h"
+#include "drawing/files/Libraries.h"
 
 namespace gmpath {
 
@@ -41,11 +42,22 @@ int finishParsing(const CLI::App& program, const CLI::ParseError& error, const C
     return fail(console, std::string(trimmed(cause)) + " (see gmpath --help)");
 }
 
+/// The version, and what the program was built with.
+std::string versionText() {
+#ifdef __clang__
+    const std::string compiler = __VERSION__;
+#else
+    const std::string compiler = "GCC " __VERSION__;
+#endif
+    return std::string("gmpath ") + GMPATH_VERSION + "\nbuilt with " + compiler + ", " +
+           gmdrawing::drawingLibraries() + ", CLI11 " + CLI11_VERSION;
+}
+
 }  // namespace
 
 int runCommandLine(int argc, const char* const* argv, const Console& console) {
     CLI::App program("Offsets, corners and tool paths from part drawings.", "gmpath");
-    program.set_version_flag("--version", std::string("gmpath ") + GMPATH_VERSION);
+    program.set_version_flag("--version", versionText());
     program.require_subcommand(1);
     program.footer("Example: gmpath offset bracket.dxf --distance 3 -o bracket.svg");
     std::vector<Command> commands = {addInfo(program), addClean(program), addOffset(program),

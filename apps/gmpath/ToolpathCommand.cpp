@@ -2,6 +2,7 @@
 #include "apps/gmpath/ToolpathCommand.h"
 
 #include <algorithm>
+#include <array>
 #include <memory>
 #include <sstream>
 
@@ -27,6 +28,7 @@ using gmdrawing::endingOf;
 using gmdrawing::formatFixed;
 using gmdrawing::formatReal;
 using gmdrawing::InputError;
+using gmdrawing::OutputFormat;
 using gmdrawing::Part;
 using gmdrawing::writeOutputs;
 using gmmachining::ContourCut;
@@ -44,6 +46,10 @@ using gmpart::Path;
 namespace {
 
 constexpr int kSizeDigits = 4;
+
+/// Endings of the outputs.
+constexpr std::array<const char*, 4> kPrograms = {".ngc", ".nc", ".tap", ".gcode"};
+constexpr const char* kPicture = ".svg";
 constexpr int kLengthDecimals = 1;
 
 std::string shortenedText(const LeadTally& leads) {
@@ -168,15 +174,21 @@ bool isSafe(const ToolpathResult& result) {
                        [](const ContourCut& cut) { return cut.keepsAway; });
 }
 
+std::vector<std::string> outputEndings() {
+    std::vector<std::string> endings(kPrograms.begin(), kPrograms.end());
+    endings.emplace_back(kPicture);
+    return endings;
+}
+
 /// The outputs without the programs for machines.
 std::vector<std::string> withoutPrograms(std::vector<std::string> outputs) {
-    const auto isProgram = [](const std::string& name) { return endingOf(name) == ".ngc"; };
+    const auto isProgram = [](const std::string& name) { return endingOf(name) != kPicture; };
     outputs.erase(std::remove_if(outputs.begin(), outputs.end(), isProgram), outputs.end());
     return outputs;
 }
 
 bool runToolpath(const ToolpathOptions& options, const Console& console) {
-    checkOutputs(options.outputs, options.input.drawing, {".ngc", ".svg"});
+    checkOutputs(options.outputs, options.input.drawing, outputEndings());
     // What the drawing holds besides is told only when the rest is in order.
     std::ostringstream remarks;
     const Part part = readInput(options.input, {console.out, remarks});
@@ -190,8 +202,13 @@ bool runToolpath(const ToolpathOptions& options, const Console& console) {
     Progress progress(console.err, console.showProgress);
     const ToolpathResult result = toolpathOf(part.contours, chosen, request, progress);
     const bool safe = isSafe(result);
-    writeOutputs({{".ngc", [&](AtomicFile& file) { file.write(gcodeOf(result.moves, settings)); }},
-                  {".svg", [&](AtomicFile& file) { file.write(svgOf(part.contours, result)); }}},
+    std::vector<OutputFormat> formats = {
+        {kPicture, [&](AtomicFile& file) { file.write(svgOf(part.contours, result)); }}};
+    for (const char* ending : kPrograms) {
+        formats.push_back(
+            {ending, [&](AtomicFile& file) { file.write(gcodeOf(result.moves, settings)); }});
+    }
+    writeOutputs(formats,
                  safe || options.anyway ? options.outputs : withoutPrograms(options.outputs));
     progress.clear();
     reportOffsets(report, result.offsets);

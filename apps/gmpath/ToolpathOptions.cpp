@@ -87,7 +87,8 @@ void addToolpathOptions(CLI::App& command, ToolpathOptions& options) {
                      "write a program where contours are broken (the rest is cut), cuts come too "
                      "near to others or offsets fail");
     addOutputs(command, options.outputs,
-               "output file (.ngc for the machine, .svg for a picture), repeatable");
+               "output file (.ngc, .nc, .tap or .gcode for the machine, .svg for a picture), "
+               "repeatable");
     addInputOptions(command, options.input);
 }
 

@@ -80,7 +80,7 @@ std::vector<std::pair<std::string, std::string>> unusableCommands() {
         {"offset " + kBracket + " --distance 1", "--output"},
         {"toolpath " + kBracket + " -o a.ngc", "--tool"},
         {"toolpath " + kBracket + " --tool nan -o a.ngc", "--tool"},
-        {"toolpath " + kBracket + " --tool 4 -o a.dxf", ".ngc or .svg"},
+        {"toolpath " + kBracket + " --tool 4 -o a.dxf", ".ngc or .nc or .tap or .gcode or .svg"},
         {"toolpath " + kBracket + " --tool 4 --stock -1 -o a.ngc", "--stock"},
         {"toolpath " + kBracket + " --tool 4 --lead 3 -o a.ngc", "--lead"},
         {"toolpath " + kBracket + " --tool 4 --lead spiral -o a.ngc", "--lead"},
@@ -343,4 +343,5 @@ TEST_F(Program, HelpHasAnExamplePerSubcommand) {
     const Outcome version = run("--version");
     EXPECT_EQ(version.exitCode, 0);
     EXPECT_EQ(version.out.find("gmpath "), 0U);
+    EXPECT_NE(version.out.find("pugixml 1."), std::string::npos);
 }
