@@ -15,8 +15,11 @@ using gmregion::Vec2;
 
 namespace {
 
-/// Directions are told by pieces of this part of a curve where it stands still.
+/// Inside a curve that stands still its direction is told by a piece as long as this part of it.
 constexpr double kStep = 1e-3;
+
+/// Of the length of a curve: what its points may differ by rounding.
+constexpr double kRounding = 1e-14;
 
 WeightedPoint between(const WeightedPoint& a, const WeightedPoint& b, double t) {
     const double left = (1.0 - t) * a.weight;
@@ -38,9 +41,27 @@ Vec2 position(Bezier points, double t) {
     return points.front().p;
 }
 
-Vec2 directionByStep(const Bezier& curve, double t) {
-    const bool atEnd = t > 1.0 - kStep;
-    return unit(position(curve, atEnd ? t : t + kStep) - position(curve, atEnd ? t - kStep : t));
+/// Direction from the first control point to the next one in another place.
+Vec2 leavingDirection(const Bezier& curve, double rounding) {
+    for (const WeightedPoint& point : curve) {
+        const Vec2 along = point.p - curve.front().p;
+        if (length(along) > rounding) return unit(along);
+    }
+    return {};
+}
+
+Bezier turnedRound(Bezier curve) {
+    std::reverse(curve.begin(), curve.end());
+    return curve;
+}
+
+/// Where the curve stands still.
+Vec2 limitDirection(const Bezier& curve, double t, double rounding) {
+    if (t == 0.0) return leavingDirection(curve, rounding);
+    if (t == 1.0) return -1.0 * leavingDirection(turnedRound(curve), rounding);
+    const bool nearEnd = t > 1.0 - kStep;
+    return unit(position(curve, nearEnd ? t : t + kStep) -
+                position(curve, nearEnd ? t - kStep : t));
 }
 
 /// The part up to t: the first points of all steps.
@@ -54,11 +75,6 @@ Bezier head(const Bezier& curve, double t) {
     return result;
 }
 
-Bezier turnedRound(Bezier curve) {
-    std::reverse(curve.begin(), curve.end());
-    return curve;
-}
-
 }  // namespace
 
 CurvePoint pointAt(const Bezier& curve, double t) {
@@ -66,9 +82,9 @@ CurvePoint pointAt(const Bezier& curve, double t) {
     while (points.size() > 2)
         contract(points, t);
     const Vec2 along = points[1].p - points[0].p;
-    const Vec2 direction = length(along) > kStep * kStep * controlLength(curve)
-                               ? unit(along)
-                               : directionByStep(curve, t);
+    const double rounding = kRounding * controlLength(curve);
+    const Vec2 direction =
+        length(along) > rounding ? unit(along) : limitDirection(curve, t, rounding);
     if (t == 0.0) return {curve.front().p, direction};
     if (t == 1.0) return {curve.back().p, direction};
     return {between(points[0], points[1], t).p, direction};

@@ -36,6 +36,11 @@ constexpr int kFirstPieces = 4;
 /// Halvings beyond which a curve is taken for a chord.
 constexpr int kDeepest = 24;
 
+/// Halvings of a row, and besides of each of its curves, beyond which there is no fit: at the pace
+/// at which lenses grow thinner, that many are never needed.
+constexpr std::size_t kMostHalvings = 100'000;
+constexpr std::size_t kMostHalvingsOfCurve = 1'000;
+
 /// Directions that turn further than this from the chord are no lens, in cosines: 45 degrees.
 constexpr double kLeastCosine = 0.7071;
 
@@ -44,12 +49,26 @@ double bulgeFrom(Vec2 direction, Vec2 chord) {
     return cross(direction, chord) / (1.0 + dot(direction, chord));
 }
 
+/// How far a point beside a chord lies from an arc over it, measured square to the chord; the arc
+/// turns by less than a quarter. Holds for arcs however flat, whose centres are lost in rounding.
+double distanceOverChord(Vec2 a, Vec2 chord, double length, double bulge, Vec2 p) {
+    const double x = dot(p - a, chord) - 0.5 * length;
+    const double curvature = 4.0 * bulge / (length * (1.0 + bulge * bulge));
+    const double root = std::sqrt(std::max(0.0, 1.0 - curvature * curvature * x * x));
+    const double height = 0.5 * bulge * length - curvature * x * x / (1.0 + root);
+    return std::abs(cross(p - a, chord) - height);
+}
+
 class Sampling {
 public:
-    Sampling(const std::vector<Bezier>& curves, double tolerance) : m_tolerance(tolerance) {
+    Sampling(const std::vector<Bezier>& curves, double tolerance)
+        : m_tolerance(tolerance), m_halvings(kMostHalvings + kMostHalvingsOfCurve * curves.size()) {
         for (const Bezier& curve : curves)
             sample(curve);
     }
+
+    /// Whether every piece was found thin enough, or too small.
+    bool isDone() const { return m_halvings > 0; }
 
     /// The points of the row; of a closed one without the last, which is the first.
     std::vector<TangentPoint> takePoints(bool closed) {
@@ -84,6 +103,8 @@ private:
             add(from.point.at, from.point.direction);
             return add(to.point.at, to.point.direction);
         }
+        if (m_halvings == 0) return;
+        --m_halvings;
         const double t = 0.5 * (from.t + to.t);
         const Place middle{t, pointAt(curve, t)};
         halve(curve, from, middle, depth + 1);
@@ -108,10 +129,9 @@ private:
         const double reaching = bulgeFrom(chord, to.point.direction);
         const double limit = kLensShare * m_tolerance;
         if (!(0.5 * length * std::abs(leaving - reaching) <= limit)) return false;
-        const Element arc{a, b, leaving};
         const auto isNear = [&](double share) {
             const double t = from.t + share * (to.t - from.t);
-            return distance(arc, pointAt(curve, t).at) <= limit;
+            return distanceOverChord(a, chord, length, leaving, pointAt(curve, t).at) <= limit;
         };
         return isNear(0.25) && isNear(0.5) && isNear(0.75);
     }
@@ -136,6 +156,7 @@ private:
     }
 
     double m_tolerance;
+    std::size_t m_halvings;  ///< that may still be made
     std::vector<TangentPoint> m_points;
 };
 
@@ -171,7 +192,9 @@ bool isFlat(const Element& e, double tolerance) {
 std::optional<std::vector<Element>> fitted(const std::vector<Bezier>& curves, bool closed,
                                            double tolerance) {
     if (!isAboveRounding(tolerance, largestNumber(curves))) return std::nullopt;
-    const std::vector<TangentPoint> points = Sampling(curves, tolerance).takePoints(closed);
+    Sampling sampling(curves, tolerance);
+    if (!sampling.isDone()) return std::nullopt;
+    const std::vector<TangentPoint> points = sampling.takePoints(closed);
     if (points.size() < 2) return std::vector<Element>{};
     SimplifyOptions options;
     options.tolerance = tolerance;

@@ -99,6 +99,19 @@ TEST(CurveFit, ArcsOfSmoothCurvesAreTangent) {
     }
 }
 
+TEST(CurveFit, CurvesOfMixedSizesAreFittedSoon) {
+    // Far control points and weights: slow where another is fast.
+    const std::vector<Bezier> hard = {cubic({0, 0}, {1e8, 30}, {20, -30}, {50, 0}),
+                                      cubic({50, 0}, {1e8, 3}, {1e8, 3}, {0, 9}),
+                                      {{{0, 9}}, {{7, 3}, 1e8}, {{1e6, 3}, 1e-8}, {{5, 9}}}};
+    for (const Bezier& curve : hard) {
+        const auto elements = fitted({curve}, false, kTolerance);
+        ASSERT_TRUE(elements);
+        EXPECT_LE(elements->size(), 60U);
+        EXPECT_TRUE(elements->back().ep == curve.back().p);
+    }
+}
+
 TEST(CurveFit, NothingForWhatHasNoFit) {
     EXPECT_FALSE(fitted({cubic({0, 0}, {NAN, 0}, {1, 1}, {2, 0})}, false, kTolerance));
     EXPECT_FALSE(fitted({cubic({1e13, 0}, {1e13, 5}, {0, 5}, {0, 0})}, false, kTolerance));
