@@ -25,7 +25,6 @@ using gmdrawing::counted;
 using gmdrawing::formatReal;
 using gmdrawing::InputError;
 using gmdrawing::Part;
-using gmdrawing::PassName;
 using gmdrawing::ResultDrawing;
 using gmdrawing::saidUnits;
 using gmdrawing::unitText;

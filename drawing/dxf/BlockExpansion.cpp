@@ -9,16 +9,10 @@
 #include "drawing/dxf/BlockExpansion.h"
 
 #include <algorithm>
-#include <cmath>
 
-#include "drawing/InputError.h"
 #include "drawing/dxf/BlockPlacement.h"
 
 namespace gmdrawing {
-
-using gmpart::Path;
-using gmregion::Element;
-using gmregion::Vec2;
 
 namespace {
 

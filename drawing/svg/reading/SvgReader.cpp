@@ -115,7 +115,6 @@ struct Page {
 struct Surroundings {
     Placement placement;
     std::string layer = "0";
-    bool inLayer = false;
     int depth = 0;
 };
 
@@ -150,8 +149,7 @@ private:
         }
         const auto placement = placementOf(node.attribute("transform").value());
         if (!placement) return skip(kind, inside.layer, "broken transformation");
-        enter(node, name,
-              {around.placement.after(*placement), inside.layer, inside.inLayer, around.depth + 1});
+        enter(node, name, {around.placement.after(*placement), inside.layer, around.depth + 1});
     }
 
     void enter(const pugi::xml_node& node, std::string_view name, const Surroundings& inside) {
@@ -181,7 +179,6 @@ private:
             const std::string label = node.attribute(attribute).value();
             if (label.empty()) continue;
             inside.layer = label;
-            inside.inLayer = true;
             return inside;
         }
         return inside;
@@ -254,7 +251,7 @@ PlacedPaths SvgDrawing::read(const DrawingUnits& units, double scale, double cur
     const double factor = units.source == UnitSource::kOption ? 1.0 : ofPage;
     PathCollector collector(curveTolerance * scale, layers);
     Walk(m_document->root, collector)
-        .children(m_document->root, {page.placement(scale * factor), "0", false, 0});
+        .children(m_document->root, {page.placement(scale * factor), "0", 0});
     return collector.take();
 }
 
